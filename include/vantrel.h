@@ -1,0 +1,342 @@
+/**
+ * @file vantrel.h
+ * Vantrel: colour measurement for the graphic arts.
+ *
+ * A host program hands over measured reflectance spectra and gets what press operators,
+ * prepress staff and quality engineers act on. The shortest way to a result:
+ *
+ *     double lab[3];
+ *     if (ReflToCIELAB(spectrum, D50_2DEG, lab))
+ *         printf("L* %.2f  a* %.2f  b* %.2f\n", lab[0], lab[1], lab[2]);
+ *
+ * What holds for every function:
+ *
+ * - A **spectrum** is 31 doubles, the reflectance at 400, 410, … 700 nm in percent (100 is the
+ *   perfect white). Any double is legal; values below 0 and above 100 are used as they are.
+ * - **XYZ** is three doubles with Y = 100 for the perfect white; **L\*a\*b\*** and **L\*C\*h** are
+ *   three doubles each (h in degrees, counter-clockwise from the +a\* axis).
+ * - Inputs are only read; results go to memory of the caller, who owns everything. An output may
+ *   be the input array where both hold the same kind of record.
+ * - A function returns 1 when it succeeded. A null pointer, or an index out of range, makes it
+ *   return 0 with every output left as it was; exceptions to this are named where they occur.
+ * - No function allocates, throws, or keeps a pointer. All of them may be called from any number
+ *   of threads at once.
+ *
+ * Plain names have C linkage. The C++ section of each group carries the functions that take
+ * typed records or references.
+ */
+#ifndef VANTREL_H
+#define VANTREL_H
+
+#include <stddef.h>
+#include <stdint.h>
+
+#if defined(__GNUC__)
+#define VANTREL_API __attribute__((visibility("default")))
+#else
+#define VANTREL_API
+#endif
+
+/** Number of bands in a spectrum: 400 nm to 700 nm in steps of 10 nm. */
+#define VANTREL_BANDS 31
+
+/**
+ * Illuminant and observer: a CIE illuminant with the 1931 2-degree or the 1964 10-degree standard
+ * observer. F12 is a three-narrow-band lamp of 3000 K.
+ */
+#ifdef __cplusplus
+enum ILLUM_OBS : int {
+#else
+typedef enum ILLUM_OBS {
+#endif
+    A_2DEG = 0,
+    A_10DEG = 1,
+    C_2DEG = 2,
+    C_10DEG = 3,
+    D50_2DEG = 4,
+    D50_10DEG = 5,
+    D65_2DEG = 6,
+    D65_10DEG = 7,
+    F2_2DEG = 8,
+    F2_10DEG = 9,
+    F7_2DEG = 10,
+    F7_10DEG = 11,
+    F11_2DEG = 12,
+    F11_10DEG = 13,
+    F12_2DEG = 14,
+    F12_10DEG = 15,
+    D75_2DEG = 16,
+    D75_10DEG = 17,
+    NUM_ILLUM_OBS = 18 /**< how many there are; not a combination itself */
+#ifdef __cplusplus
+};
+#else
+} ILLUM_OBS;
+#endif
+
+/** CIE 1976 L\*a\*b\*; interchangeable with an array of three doubles. */
+typedef struct CIELABCOORD {
+    double L; /**< lightness L\* */
+    double a; /**< a\*, green to red */
+    double b; /**< b\*, blue to yellow */
+} CIELABCOORD;
+
+/** CIE 1976 L\*C\*h; interchangeable with an array of three doubles. */
+typedef struct CIELCHCOORD {
+    double L; /**< lightness L\* */
+    double C; /**< chroma C\*ab */
+    double h; /**< hue angle hab in degrees, 0 ≤ h < 360 */
+} CIELCHCOORD;
+
+#ifdef __cplusplus
+extern "C" {
+#endif
+
+/** @name Tristimulus values
+ *  Weighted sums over the bands with the 10 nm weights of ASTM E308 (F12: its own table).
+ *  @{ */
+
+/** The number of illuminant/observer combinations, 18. */
+VANTREL_API int GetNumIlluminantObservers(void);
+
+/**
+ * CIE XYZ of a spectrum.
+ * @param[in]  refl      spectrum, 31 values in percent
+ * @param[in]  illumObs  illuminant and observer
+ * @param[out] xyz       X, Y, Z; Y is 100 for the perfect white
+ * @return 1; 0 for a null pointer or an unknown combination.
+ */
+VANTREL_API int ReflToXYZ(const double *refl, ILLUM_OBS illumObs, double *xyz);
+
+/**
+ * What each band contributes to X, Y and Z; each array sums to the value of ReflToXYZ().
+ * @param[in]  refl      spectrum, 31 values in percent
+ * @param[in]  illumObs  illuminant and observer
+ * @param[out] x,y,z     31 contributions each
+ * @return 1; 0 for a null pointer or an unknown combination.
+ */
+VANTREL_API int ReflToXYZs(const double *refl, ILLUM_OBS illumObs, double *x, double *y, double *z);
+
+/** @} */
+
+/** @name CIELAB and L\*C\*h
+ *  CIE 15: the CIE 1976 (L\*a\*b\*) space. Every L\*C\*h that is derived from a spectrum or from
+ * XYZ is computed from a\* and b\* rounded to two decimals (halves away from zero), with 0.000001
+ * in place of an a\* of 0, so that a neutral has C\* = 0.000001 and h = 0.
+ *  @{ */
+
+/**
+ * L\*a\*b\* of a spectrum.
+ * @param[in]  refl      spectrum, 31 values in percent
+ * @param[in]  illumObs  illuminant and observer
+ * @param[out] lab       L\*, a\*, b\*
+ * @return 1; 0 for a null pointer or an unknown combination.
+ */
+VANTREL_API int ReflToCIELAB(const double *refl, ILLUM_OBS illumObs, double *lab);
+
+/** L\*a\*b\* of XYZ, relative to the white point of the combination. Fails like ReflToCIELAB(). */
+VANTREL_API int XYZToCIELab(const double *xyz, ILLUM_OBS illumObs, double *lab);
+
+/** L\*C\*h of a spectrum, rounded as described above. Fails like ReflToCIELAB(). */
+VANTREL_API int ReflToCIELCH(const double *refl, ILLUM_OBS illumObs, double *lch);
+
+/** L\*C\*h of XYZ, rounded as described above. Fails like ReflToCIELAB(). */
+VANTREL_API int XYZToCIELCH(const double *xyz, ILLUM_OBS illumObs, double *lch);
+
+/** L\*C\*h of L\*a\*b\* (three doubles each), rounded as described above; 0 for a null pointer. */
+VANTREL_API int CIELabToCIELCH(const double *lab, double *lch);
+
+/** L\*C\*h of L\*a\*b\*; a\* and b\* are rounded to two decimals when `round` is not 0. */
+VANTREL_API int CIELabToCIELChEx(const double *lab, double *lch, int round);
+
+/** L\*a\*b\* of L\*C\*h (three doubles each), without rounding; 0 for a null pointer. */
+VANTREL_API int CIELChToCIELab(const double *lch, double *lab);
+
+/** @} */
+
+/** @name Other colour spaces
+ *  @{ */
+
+/**
+ * CIE 1976 L\*u\*v\* (CIE 15) of a spectrum.
+ * @param[in]  refl      spectrum, 31 values in percent
+ * @param[in]  illumObs  illuminant and observer
+ * @param[out] luv       L\*, u\*, v\*; u\* = v\* = 0 where X + 15 Y + 3 Z is 0 (black)
+ * @return 1; 0 for a null pointer or an unknown combination.
+ */
+VANTREL_API int ReflToCIELUV(const double *refl, ILLUM_OBS illumObs, double *luv);
+
+/** CIE 1976 L\*u\*v\* of XYZ; as ReflToCIELUV(). */
+VANTREL_API int XYZToCIELUV(const double *xyz, ILLUM_OBS illumObs, double *luv);
+
+/**
+ * Luminance and chromaticity (CIE 15) of a spectrum.
+ * @param[in]  refl      spectrum, 31 values in percent
+ * @param[in]  illumObs  illuminant and observer
+ * @param[out] Yxy       Y, x, y in this order
+ * @return 1; 0 for a null pointer or an unknown combination; 0 with Y = x = y = 0 written where
+ *         X + Y + Z is 0 (black has no chromaticity).
+ */
+VANTREL_API int ReflToCIEYxy(const double *refl, ILLUM_OBS illumObs, double *Yxy);
+
+/** Luminance and chromaticity of XYZ; as ReflToCIEYxy(). The combination is checked, not used. */
+VANTREL_API int XYZToCIEYxy(const double *xyz, ILLUM_OBS illumObs, double *Yxy);
+
+/**
+ * Chromaticity coordinates of XYZ.
+ * @return 1; 0 for a null pointer; 0 with x = y = z = 0 written where X + Y + Z is 0.
+ */
+VANTREL_API int XYZToxyz(const double *xyz, double *x, double *y, double *z);
+
+/**
+ * Hunter L, a, b of a spectrum, with the Ka and Kb of the combination (ASTM E308).
+ * @param[in]  refl      spectrum, 31 values in percent
+ * @param[in]  illumObs  illuminant and observer
+ * @param[out] hunter    L, a, b; zeros where only Y is 0
+ * @return 1; 0 for a null pointer, an unknown combination, or a spectrum with X + Y + Z = 0.
+ */
+VANTREL_API int ReflToHunterLAB(const double *refl, ILLUM_OBS illumObs, double *hunter);
+
+/**
+ * XYZ of L\*a\*b\*: the inverse of XYZToCIELab(), with the ratios X/Xn, Y/Yn, Z/Zn rounded to six
+ * decimals; a round trip therefore agrees to about 0.0001, not to the last bit.
+ * @return 1; 0 for a null pointer or an unknown combination.
+ */
+VANTREL_API int LabToXYZ(const double *lab, ILLUM_OBS illumObs, double *xyz);
+
+/** @} */
+
+/** @name Screen preview
+ *  The colour as 8-bit drive levels of one fixed display: red | green << 8 | blue << 16. What lies
+ *  outside the display's gamut is clipped channel by channel.
+ *  @{ */
+
+/** Display value of a spectrum; 0 for a null pointer or an unknown combination. */
+VANTREL_API int ReflToRGB(const double *refl, ILLUM_OBS illumObs, unsigned int *rgb);
+
+/** Display value of XYZ; 0 for a null pointer. A channel that is not a number has level 0. */
+VANTREL_API int XYZtoRGB(const double *xyz, unsigned int *rgb);
+
+/** @} */
+
+/** @name Colour differences
+ *  Each writes one double through its last parameter and returns 1; a null pointer or an unknown
+ *  combination returns 0 with the result as it was. Zero weights are not refused unless stated: the
+ *  division gives what IEEE arithmetic gives.
+ *  @{ */
+
+/** CIE 1976 ΔE\*ab (CIE 15) of two L\*a\*b\* records. */
+VANTREL_API int LabToDElab(const CIELABCOORD *first, const CIELABCOORD *second, double *deltaE);
+
+/**
+ * Signed CIE 1976 hue difference ΔH\*ab (CIE 15): positive when the second hue lies from 0 up to
+ * and including 180 degrees counter-clockwise of the first. Chroma and hue are those of
+ * CIELabToCIELCH().
+ */
+VANTREL_API int LabToDH(const CIELABCOORD *first, const CIELABCOORD *second, double *deltaH);
+
+/**
+ * CIE94 ΔE\*94 (CIE 116), kH = 1. The chroma and hue weights follow the chroma of `reference`
+ * alone, so the two records do not commute.
+ * @param[in]  sample,reference  L\*a\*b\*
+ * @param[in]  kL,kC             parametric factors (1, 1 for the reference conditions)
+ * @param[out] deltaE            ΔE\*94
+ */
+VANTREL_API int LabToDE94(const CIELABCOORD *sample, const CIELABCOORD *reference, double kL,
+                          double kC, double *deltaE);
+
+/** CIE94 of two L\*C\*h records; as LabToDE94() of their L\*a\*b\*. */
+VANTREL_API int CIELChToDE94(const CIELCHCOORD *sample, const CIELCHCOORD *reference, double kL,
+                             double kC, double *deltaE);
+
+/** CIEDE2000 ΔE00 (CIE 142, ISO/CIE 11664-6) with kH = 1; symmetric in the two records. */
+VANTREL_API int LabToDE2000(const CIELABCOORD *first, const CIELABCOORD *second, double kL,
+                            double kC, double *deltaE);
+
+/** CIEDE2000 ΔE00 with all three parametric factors. */
+VANTREL_API int LabToDE2000Ex(const CIELABCOORD *first, const CIELABCOORD *second, double kL,
+                              double kC, double kH, double *deltaE);
+
+/**
+ * CMC(l:c) (ISO 105-J03). Every weight follows `reference` alone; chroma and hue are those of
+ * CIELabToCIELCH().
+ * @param[in]  sample,reference  L\*a\*b\*
+ * @param[in]  l,c               lightness and chroma weight (2, 1 acceptability; 1, 1
+ * perceptibility)
+ * @param[out] deltaE            ΔE CMC
+ * @return 1; 0 for a null pointer; 0 with 999 written when l or c is exactly 0.
+ */
+VANTREL_API int LabToDEcmc(const CIELABCOORD *sample, const CIELABCOORD *reference, double l,
+                           double c, double *deltaE);
+
+/**
+ * DIN 6172 metamerism index of a pair of spectra under a change of illuminant/observer: the length
+ * of the difference between the pair's two L\*a\*b\* difference vectors.
+ * @param[in]  first,second            spectra, 31 values in percent
+ * @param[in]  illumObs1,illumObs2     the two ILLUM_OBS combinations
+ * @param[out] index                   metamerism index in CIELAB units
+ */
+VANTREL_API int ReflToDIN6172(const double *first, const double *second, int illumObs1,
+                              int illumObs2, double *index);
+
+/**
+ * How a sample differs from its standard, in words. A coordinate that differs by no more than 0.5
+ * is "On Target".
+ * @param[in]  standard,sample  spectra, 31 values in percent
+ * @param[in]  illumObs         illuminant and observer
+ * @param[in]  selector         0 words the colour along a\* and b\*; 1 as chroma and hue; any other
+ *                              value words the lightness alone
+ * @param[out] lightness        "On Target", "Too Dark", "Too Light"
+ * @param[out] colour1          selector 0: "Too Green", "Too Red"; selector 1: "Too Dull",
+ *                              "Too Bright"; or "On Target"
+ * @param[out] colour2          selector 0: "Too Blue", "Too Yellow"; selector 1: the hue that the
+ *                              sample leans to; or "On Target"
+ * @return 1; 0 for a null spectrum, an unknown combination, or a null text buffer that the selector
+ *         needs. Every buffer holds at least 11 wide characters.
+ */
+VANTREL_API int VerbalColorDifference(const double *standard, const double *sample,
+                                      ILLUM_OBS illumObs, int selector, wchar_t *lightness,
+                                      wchar_t *colour1, wchar_t *colour2);
+
+/** @} */
+
+#ifdef __cplusplus
+} /* extern "C" */
+
+/** @name Typed records (C++)
+ *  @{ */
+
+/** L\*C\*h of L\*a\*b\*; a\* and b\* are rounded to two decimals when `round`. False for a null
+ * pointer. */
+VANTREL_API bool CIELabToCIELCh(CIELABCOORD *lab, CIELCHCOORD *lch, bool round);
+
+/**
+ * L\*, a\*, b\*, C\*, h of a spectrum in single precision; C\* and h as ReflToCIELCH().
+ * @return 1; 0 for a null pointer or an unknown combination.
+ */
+VANTREL_API int CalcLabch(const double *refl, ILLUM_OBS illumObs, float *labch);
+
+/** The CIEDE2000 formula and its helpers (CIE 142); LabToDE2000Ex() in other words. */
+class VANTREL_API CIEDE2000 {
+public:
+    CIEDE2000();
+    ~CIEDE2000();
+
+    /** ΔE00 of two L\*a\*b\* records with the parametric factors kL, kC, kH. */
+    double Calculate(const CIELABCOORD &first, const CIELABCOORD &second, double kL, double kC,
+                     double kH);
+    /** Whether the magnitude is at most the tolerance; a not-a-number counts as zero. */
+    bool IsZero(double value, double tolerance);
+    /** An angle in radians as degrees, a negative one counted from 360 downward. */
+    double ConvertToDegrees(double radians);
+    /** An angle in degrees as radians. */
+    double ConvertToRadians(double degrees);
+
+private:
+    double pow25To7;
+};
+
+/** @} */
+#endif
+
+#endif

@@ -1,0 +1,42 @@
+#pragma once
+
+#include "vantrel.h"
+
+#include <span>
+
+namespace vantrel {
+
+inline constexpr int kBands = VANTREL_BANDS;
+
+/// Reflectance in percent, band i at 400 + 10 i nm.
+using Spectrum = std::span<const double, kBands>;
+/// A spectrum that is written.
+using SpectrumOut = std::span<double, kBands>;
+
+using Lab = CIELABCOORD;
+using Lch = CIELCHCOORD;
+
+/// Tristimulus values, Y = 100 for the perfect white.
+struct Xyz {
+    double x, y, z;
+};
+
+inline Spectrum spectrum(const double *refl) { return Spectrum(refl, kBands); }
+inline SpectrumOut spectrum_out(double *refl) { return SpectrumOut(refl, kBands); }
+
+inline bool is_illum_obs(int illum_obs) { return illum_obs >= 0 && illum_obs < NUM_ILLUM_OBS; }
+
+/// Three doubles of a caller as a record, and back.
+inline Xyz xyz_of(const double *v) { return {v[0], v[1], v[2]}; }
+inline Lab lab_of(const double *v) { return {v[0], v[1], v[2]}; }
+inline Lch lch_of(const double *v) { return {v[0], v[1], v[2]}; }
+
+template <class Record> void store(const Record &record, double *out)
+{
+    const auto [first, second, third] = record;
+    out[0] = first;
+    out[1] = second;
+    out[2] = third;
+}
+
+} // namespace vantrel

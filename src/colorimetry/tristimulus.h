@@ -1,0 +1,15 @@
+#pragma once
+
+#include "base/spectrum.h"
+
+#include <array>
+
+namespace vantrel {
+
+/// CIE XYZ by weighted summation (ASTM E308): X = Σ R Wx / 100 000 in order of the bands.
+Xyz xyz_from_spectrum(Spectrum refl, ILLUM_OBS illum_obs);
+
+/// The summands of xyz_from_spectrum: R Wx / 100 000 of each band.
+std::array<Xyz, kBands> xyz_by_band(Spectrum refl, ILLUM_OBS illum_obs);
+
+} // namespace vantrel
