@@ -1,30 +1,37 @@
 #include "colorimetry/tristimulus.h"
 
-#include "colorimetry/tristimulus_weights.h"
+#include <cstring>
 
 namespace vantrel {
-namespace {
 
-constexpr double kScale = 100000.0;
+static constexpr double kScale = 100000.0;
 
-// The sums run in order of the bands, one lane each for X, Y and Z: the same bits on any processor.
-[[gnu::always_inline]] inline Xyz integrate(Spectrum refl, TristimulusWeights &weights)
+Xyz integrate(Spectrum refl, TristimulusWeights &weights)
 {
-    Lanes sum{};
-    for (int i = 0; i < kBands; ++i)
-        sum += refl[i] * weights[i];
-    return {sum[0] / kScale, sum[1] / kScale, sum[2] / kScale};
+    Pair xy{}, z{};
+    for (int i = 0; i < kBands; ++i) {
+        xy += refl[i] * weights[i].xy;
+        z += refl[i] * weights[i].z;
+    }
+    return {xy[0] / kScale, xy[1] / kScale, z[0] / kScale};
 }
 
 #ifdef __x86_64__
 [[gnu::target("avx2")]] Xyz integrate_avx2(Spectrum refl, TristimulusWeights &weights)
 {
-    return integrate(refl, weights);
+    using Lanes = double __attribute__((vector_size(32)));
+    Lanes sum{};
+    for (int i = 0; i < kBands; ++i) {
+        Lanes band;
+        std::memcpy(&band, &weights[i], sizeof band);
+        sum += refl[i] * band;
+    }
+    return {sum[0] / kScale, sum[1] / kScale, sum[2] / kScale};
 }
-const bool has_avx2 = __builtin_cpu_supports("avx2");
-#endif
 
-} // namespace
+// False until the library is initialised: a call before that takes the plain way.
+static const bool has_avx2 = __builtin_cpu_supports("avx2");
+#endif
 
 Xyz xyz_from_spectrum(Spectrum refl, ILLUM_OBS illum_obs)
 {
@@ -41,8 +48,8 @@ std::array<Xyz, kBands> xyz_by_band(Spectrum refl, ILLUM_OBS illum_obs)
     TristimulusWeights &weights = tristimulus_weights(illum_obs);
     std::array<Xyz, kBands> bands;
     for (int i = 0; i < kBands; ++i) {
-        const Lanes band = refl[i] * weights[i] / kScale;
-        bands[i] = {band[0], band[1], band[2]};
+        const Pair xy = refl[i] * weights[i].xy / kScale;
+        bands[i] = {xy[0], xy[1], refl[i] * weights[i].z[0] / kScale};
     }
     return bands;
 }

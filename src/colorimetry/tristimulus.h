@@ -1,6 +1,7 @@
 #pragma once
 
 #include "base/spectrum.h"
+#include "colorimetry/tristimulus_weights.h"
 
 #include <array>
 
@@ -11,5 +12,10 @@ Xyz xyz_from_spectrum(Spectrum refl, ILLUM_OBS illum_obs);
 
 /// The summands of xyz_from_spectrum: R Wx / 100 000 of each band.
 std::array<Xyz, kBands> xyz_by_band(Spectrum refl, ILLUM_OBS illum_obs);
+
+/// The two ways to sum, in the same order and to the same bits: for any processor, and for one with
+/// AVX2.
+Xyz integrate(Spectrum refl, TristimulusWeights &weights);
+Xyz integrate_avx2(Spectrum refl, TristimulusWeights &weights);
 
 } // namespace vantrel

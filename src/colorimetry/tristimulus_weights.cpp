@@ -101,17 +101,22 @@ constexpr bool rows_in_order()
 static_assert(rows_in_order());
 
 struct Table {
-    Lanes weights[NUM_ILLUM_OBS][kBands];
+    BandWeights weights[NUM_ILLUM_OBS][kBands];
 };
+
+constexpr Pair weight_pair(int first, int second)
+{
+    return Pair{static_cast<double>(first), static_cast<double>(second)};
+}
 
 constexpr Table interleaved()
 {
     Table table{};
     for (int k = 0; k < NUM_ILLUM_OBS; ++k)
         for (int i = 0; i < kBands; ++i)
-            table.weights[k][i] = Lanes{static_cast<double>(kRows[3 * k + X].weights[i]),
-                                        static_cast<double>(kRows[3 * k + Y].weights[i]),
-                                        static_cast<double>(kRows[3 * k + Z].weights[i]), 0.0};
+            table.weights[k][i] = {
+                weight_pair(kRows[3 * k + X].weights[i], kRows[3 * k + Y].weights[i]),
+                weight_pair(kRows[3 * k + Z].weights[i], 0)};
     return table;
 }
 constexpr Table kTable = interleaved();

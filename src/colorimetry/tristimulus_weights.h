@@ -4,10 +4,14 @@
 
 namespace vantrel {
 
-/// X, Y, Z and an idle lane: the weights of a band stand side by side, so that one instruction
-/// multiplies the three.
-using Lanes = double __attribute__((vector_size(32)));
-using TristimulusWeights = const Lanes[kBands];
+/// A pair of doubles that one instruction of any processor multiplies.
+using Pair = double __attribute__((vector_size(16)));
+
+/// The weights of a band side by side: X and Y, Z and an idle lane.
+struct alignas(32) BandWeights {
+    Pair xy, z;
+};
+using TristimulusWeights = const BandWeights[kBands];
 
 /// The weights of a combination, in 1/100 000.
 TristimulusWeights &tristimulus_weights(ILLUM_OBS illum_obs);

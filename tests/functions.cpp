@@ -1,0 +1,107 @@
+#include "functions.h"
+
+#include <sstream>
+
+namespace {
+
+// Tokens in declared order: `N` input array, `>N` output array, `k` illuminant/observer, `s`
+// status, `r` response, `d` double, `i` int; suffix `?`: null is allowed, `!`: the caller's duty.
+std::vector<Argument> parse(const char *signature)
+{
+    std::vector<Argument> arguments;
+    std::istringstream tokens(signature);
+    for (std::string token; tokens >> token;) {
+        Argument argument;
+        argument.output = token.front() == '>';
+        argument.nullable = token.back() == '?';
+        argument.unchecked = token.back() == '!';
+        const std::string core = token.substr(argument.output ? 1 : 0);
+        if (std::isalpha(static_cast<unsigned char>(core.front())))
+            argument.kind = core.front();
+        else
+            argument.count = std::stoul(core);
+        arguments.push_back(argument);
+    }
+    return arguments;
+}
+
+struct Row {
+    const char *name;
+    std::function<double(std::vector<Slot> &)> call;
+    const char *signature;
+};
+
+const Row kRows[] = {
+    {"GetNumIlluminantObservers", call(GetNumIlluminantObservers), ""},
+    {"ReflToXYZ", call(ReflToXYZ), "31 k >3"},
+    {"ReflToXYZs", call(ReflToXYZs), "31 k >31 >31 >31"},
+    {"ReflToCIELAB", call(ReflToCIELAB), "31 k >3"},
+    {"XYZToCIELab", call(XYZToCIELab), "3 k >3"},
+    {"ReflToCIELCH", call(ReflToCIELCH), "31 k >3"},
+    {"XYZToCIELCH", call(XYZToCIELCH), "3 k >3"},
+    {"CIELabToCIELCH", call(CIELabToCIELCH), "3 >3"},
+    {"CIELabToCIELChEx", call(CIELabToCIELChEx), "3 >3 i"},
+    {"CIELabToCIELCh", call(CIELabToCIELCh), "3 >3 i"},
+    {"CIELChToCIELab", call(CIELChToCIELab), "3 >3"},
+    {"ReflToCIELUV", call(ReflToCIELUV), "31 k >3"},
+    {"XYZToCIELUV", call(XYZToCIELUV), "3 k >3"},
+    {"ReflToCIEYxy", call(ReflToCIEYxy), "31 k >3"},
+    {"XYZToCIEYxy", call(XYZToCIEYxy), "3 k >3"},
+    {"XYZToxyz", call(XYZToxyz), "3 >1 >1 >1"},
+    {"ReflToHunterLAB", call(ReflToHunterLAB), "31 k >3"},
+    {"LabToXYZ", call(LabToXYZ), "3 k >3"},
+    {"ReflToRGB", call(ReflToRGB), "31 k >1"},
+    {"XYZtoRGB", call(XYZtoRGB), "3 >1"},
+    {"CalcLabch", call(CalcLabch), "31 k >5"},
+    {"VerbalColorDifference", call(VerbalColorDifference), "31 31 k i >11 >11 >11"},
+    {"LabToDElab", call(LabToDElab), "3 3 >1"},
+    {"LabToDH", call(LabToDH), "3 3 >1"},
+    {"LabToDE94", call(LabToDE94), "3 3 d d >1"},
+    {"CIELChToDE94", call(CIELChToDE94), "3 3 d d >1"},
+    {"LabToDE2000", call(LabToDE2000), "3 3 d d >1"},
+    {"LabToDE2000Ex", call(LabToDE2000Ex), "3 3 d d d >1"},
+    {"CIEDE2000::Calculate",
+     call(+[](const CIELABCOORD *first, const CIELABCOORD *second, double kL, double kC,
+              double kH) { return CIEDE2000().Calculate(*first, *second, kL, kC, kH); }),
+     "3! 3! d d d"},
+    {"CIEDE2000::IsZero",
+     call(+[](double value, double tolerance) { return CIEDE2000().IsZero(value, tolerance); }),
+     "d d"},
+    {"CIEDE2000::ConvertToDegrees",
+     call(+[](double radians) { return CIEDE2000().ConvertToDegrees(radians); }), "d"},
+    {"CIEDE2000::ConvertToRadians",
+     call(+[](double degrees) { return CIEDE2000().ConvertToRadians(degrees); }), "d"},
+    {"LabToDEcmc", call(LabToDEcmc), "3 3 d d >1"},
+    {"ReflToDIN6172", call(ReflToDIN6172), "31 31 k k >1"},
+};
+
+} // namespace
+
+std::vector<Slot> Function::slots() const
+{
+    std::vector<Slot> slots(arguments.size());
+    for (std::size_t i = 0; i < slots.size(); ++i) {
+        slots[i].output = arguments[i].output;
+        slots[i].values.assign(arguments[i].count, 0.0);
+    }
+    return slots;
+}
+
+const std::vector<Function> &functions()
+{
+    static const std::vector<Function> all = [] {
+        std::vector<Function> result;
+        for (const Row &row : kRows)
+            result.push_back({row.name, row.call, parse(row.signature)});
+        return result;
+    }();
+    return all;
+}
+
+const Function *find_function(const std::string &name)
+{
+    for (const Function &function : functions())
+        if (function.name == name)
+            return &function;
+    return nullptr;
+}

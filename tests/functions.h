@@ -1,0 +1,124 @@
+// Every exported function in a form that a table can drive: arguments as lists of numbers.
+#pragma once
+
+#include "vantrel.h"
+
+#include <algorithm>
+#include <cstddef>
+#include <cstring>
+#include <functional>
+#include <limits>
+#include <string>
+#include <type_traits>
+#include <utility>
+#include <vector>
+
+/// One argument of a call. Arrays stand between guards; an output is filled with a pattern, so that
+/// what a function wrote, left alone, or wrote beyond the end can be told.
+struct Slot {
+    std::vector<double> values; ///< an input, or what an output received
+    std::string text;           ///< what an output of wide characters received
+    bool output = false;
+    bool null = false;
+    bool written = false;
+    bool overrun = false;
+    std::vector<std::byte> memory;
+};
+
+/// How an argument is declared.
+struct Argument {
+    char kind = 'a'; ///< a array, k illuminant/observer, s status, r response, d double, i int
+    std::size_t count = 1;
+    bool output = false;
+    bool nullable = false;
+    bool unchecked = false;
+};
+
+struct Function {
+    std::string name;
+    std::function<double(std::vector<Slot> &)> call;
+    std::vector<Argument> arguments;
+
+    /// Slots of the right sizes, inputs all zero.
+    std::vector<Slot> slots() const;
+};
+
+const std::vector<Function> &functions();
+const Function *find_function(const std::string &name);
+
+/// A number as an array element; integers saturate.
+template <class Element> Element element_of(double value)
+{
+    using Limits = std::numeric_limits<Element>;
+    if constexpr (std::is_integral_v<Element>) {
+        if (!(value > static_cast<double>(Limits::min())))
+            return Limits::min();
+        if (value >= static_cast<double>(Limits::max()))
+            return Limits::max();
+    }
+    return static_cast<Element>(value);
+}
+
+/// Hands slots to parameters of type P and takes the outputs back.
+template <class P> struct Parameter {
+    using Pointee = std::remove_cv_t<std::remove_pointer_t<std::remove_reference_t<P>>>;
+    using Element = std::conditional_t<std::is_class_v<Pointee>, double, Pointee>;
+    static constexpr bool is_value = !std::is_pointer_v<P> && !std::is_reference_v<P>;
+    static constexpr std::size_t kGuard = 64;
+    static constexpr std::byte kPattern{0xA5};
+
+    static P pass(Slot &slot)
+    {
+        if constexpr (std::is_floating_point_v<P>) {
+            return slot.values.at(0);
+        } else if constexpr (is_value) {
+            return static_cast<P>(static_cast<long long>(slot.values.at(0)));
+        } else {
+            slot.memory.assign(slot.values.size() * sizeof(Element) + 2 * kGuard, kPattern);
+            auto *array = reinterpret_cast<Element *>(&slot.memory[kGuard]);
+            if (!slot.output)
+                std::transform(slot.values.begin(), slot.values.end(), array, element_of<Element>);
+            auto *pointer = reinterpret_cast<Pointee *>(array);
+            if constexpr (std::is_reference_v<P>)
+                return *pointer;
+            else
+                return slot.null ? nullptr : pointer;
+        }
+    }
+
+    static void take_back(Slot &slot)
+    {
+        if constexpr (!is_value) {
+            if (!slot.output)
+                return;
+            const auto touched = [](std::byte b) { return b != kPattern; };
+            const auto begin = slot.memory.begin() + kGuard, end = slot.memory.end() - kGuard;
+            slot.overrun = std::any_of(slot.memory.begin(), begin, touched) ||
+                           std::any_of(end, slot.memory.end(), touched);
+            slot.written = std::any_of(begin, end, touched);
+            const auto *array = reinterpret_cast<const Element *>(&slot.memory[kGuard]);
+            if constexpr (std::is_same_v<Element, wchar_t>)
+                for (std::size_t i = 0; slot.written && i < slot.values.size() && array[i]; ++i)
+                    slot.text += static_cast<char>(array[i]);
+            else
+                std::copy(array, array + slot.values.size(), slot.values.begin());
+        }
+    }
+};
+
+template <class R, class... P> std::function<double(std::vector<Slot> &)> call(R (*function)(P...))
+{
+    return [function](std::vector<Slot> &slots) {
+        return [&]<std::size_t... I>(std::index_sequence<I...>)
+        {
+            double result = 1;
+            if constexpr (std::is_void_v<R>)
+                function(Parameter<P>::pass(slots.at(I))...);
+            else
+                result = static_cast<double>(function(Parameter<P>::pass(slots.at(I))...));
+            (Parameter<P>::take_back(slots.at(I)), ...);
+            return result;
+        }
+        (std::index_sequence_for<P...>());
+    };
+}

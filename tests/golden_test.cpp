@@ -1,0 +1,169 @@
+// Runs the golden tables, and uses their calls to attack the boundary.
+#include "golden.h"
+
+#include <gtest/gtest.h>
+
+#include <climits>
+#include <cmath>
+#include <cxxabi.h>
+#include <fstream>
+#include <limits>
+#include <map>
+#include <set>
+
+namespace {
+
+constexpr double kInf = std::numeric_limits<double>::infinity();
+constexpr double kNan = std::numeric_limits<double>::quiet_NaN();
+
+bool agrees(double got, double wanted, std::optional<double> tolerance)
+{
+    if (std::isnan(wanted))
+        return std::isnan(got);
+    const double allowed = tolerance.value_or(1e-12 * std::fmax(1, std::fabs(wanted)));
+    return got == wanted || std::fabs(got - wanted) <= allowed;
+}
+
+void check_output(const Slot &slot, const Expected &expected, std::optional<double> tolerance)
+{
+    EXPECT_FALSE(slot.overrun) << "wrote beyond the end";
+    switch (expected.kind) {
+    case Expected::unwritten:
+        EXPECT_FALSE(slot.written) << "wrote an output that was to stay as it was";
+        break;
+    case Expected::text:
+        EXPECT_EQ(slot.text, expected.words);
+        break;
+    case Expected::numbers:
+        EXPECT_TRUE(slot.written) << "left an output unwritten";
+        for (std::size_t i = 0; i < expected.values.size(); ++i)
+            EXPECT_PRED3(agrees, slot.values[i], expected.values[i], tolerance) << "element " << i;
+        break;
+    default:
+        break;
+    }
+}
+
+bool no_output_touched(const std::vector<Slot> &slots)
+{
+    return std::none_of(slots.begin(), slots.end(),
+                        [](const Slot &slot) { return slot.written || slot.overrun; });
+}
+
+// A successful call of each function in the tables, to be spoilt one argument at a time.
+std::vector<GoldenCase> one_good_call_each()
+{
+    std::vector<GoldenCase> calls;
+    std::set<std::string> seen;
+    for (GoldenCase &golden : read_all_golden())
+        if (golden.returns != 0 && seen.insert(golden.function->name).second)
+            calls.push_back(std::move(golden));
+    return calls;
+}
+
+} // namespace
+
+void PrintTo(const std::optional<double> &tolerance, std::ostream *out)
+{
+    *out << (tolerance ? std::to_string(*tolerance) : "1e-12 relative");
+}
+
+TEST(Golden, EveryLine)
+{
+    for (GoldenCase &golden : read_all_golden()) {
+        SCOPED_TRACE(golden.where + " " + golden.function->name);
+        const double result = golden.function->call(golden.slots);
+        EXPECT_PRED3(agrees, result, golden.returns, golden.tolerance) << "returned";
+        std::size_t next = 0;
+        for (const Slot &slot : golden.slots)
+            if (slot.output)
+                check_output(slot, golden.outputs[next++], golden.tolerance);
+    }
+}
+
+TEST(Golden, CoversEveryExportedFunction)
+{
+    std::set<std::string> in_tables;
+    for (const GoldenCase &golden : read_all_golden())
+        in_tables.insert(golden.function->name);
+    std::ifstream exports(VANTREL_EXPORTS);
+    int count = 0;
+    for (std::string symbol; std::getline(exports, symbol); ++count) {
+        int status = 0;
+        char *demangled = abi::__cxa_demangle(symbol.c_str(), nullptr, nullptr, &status);
+        const std::string full = demangled ? demangled : symbol;
+        std::free(demangled);
+        const std::string name = full.substr(0, full.find('('));
+        const bool life_cycle = name == "CIEDE2000::CIEDE2000" || name == "CIEDE2000::~CIEDE2000";
+        EXPECT_TRUE(life_cycle || name == "den_weight" || in_tables.contains(name)) << name;
+    }
+    EXPECT_GT(count, 0);
+}
+
+TEST(Boundary, RefusesNullsAndBadIndicesAndWritesNothing)
+{
+    const std::map<char, std::vector<double>> bad_indices = {
+        {'k', {-1, 18, INT_MIN, INT_MAX}},
+        {'s', {-1, 10, INT_MIN, INT_MAX}},
+        {'r', {-1, 9, INT_MIN, INT_MAX}},
+    };
+    for (const GoldenCase &good : one_good_call_each()) {
+        const auto &arguments = good.function->arguments;
+        for (std::size_t i = 0; i < arguments.size(); ++i) {
+            SCOPED_TRACE(good.function->name + " argument " + std::to_string(i));
+            if (arguments[i].unchecked)
+                continue;
+            if (arguments[i].kind == 'a' && !arguments[i].nullable) {
+                auto slots = good.slots;
+                slots[i].null = true;
+                EXPECT_EQ(good.function->call(slots), 0);
+                EXPECT_TRUE(no_output_touched(slots));
+            }
+            if (const auto bad = bad_indices.find(arguments[i].kind); bad != bad_indices.end())
+                for (double index : bad->second) {
+                    auto slots = good.slots;
+                    slots[i].values[0] = index;
+                    EXPECT_EQ(good.function->call(slots), 0) << index;
+                    EXPECT_TRUE(no_output_touched(slots)) << index;
+                }
+        }
+    }
+}
+
+// Any double is legal everywhere, and any int where no index is meant: nothing is written beyond
+// the end of an output (and, under the sanitizers, nothing is undefined).
+TEST(Boundary, SurvivesEveryNumber)
+{
+    const double doubles[] = {0,      -0.0,   kInf,   -kInf,  kNan, 1e300, -1e300,
+                              1e-300, 5e-324, 100.01, -0.001, 1e9,  -3e9,  1e19};
+    const double ints[] = {INT_MIN, -1, 0, 1, 2, 3, 29, 30, 31, 100, 101, INT_MAX};
+    for (const GoldenCase &good : one_good_call_each()) {
+        if (good.function->name.starts_with("Set"))
+            continue; // would change what the others measure
+        SCOPED_TRACE(good.function->name);
+        const auto &arguments = good.function->arguments;
+        for (std::size_t i = 0; i < arguments.size(); ++i) {
+            const bool number = arguments[i].kind == 'd' || arguments[i].kind == 'a';
+            if (arguments[i].output || arguments[i].kind == 'k' ||
+                (!number && arguments[i].unchecked))
+                continue;
+            const auto try_value = [&](double value, std::size_t first, std::size_t last) {
+                auto slots = good.slots;
+                std::fill(slots[i].values.begin() + first, slots[i].values.begin() + last, value);
+                good.function->call(slots);
+                for (const Slot &slot : slots)
+                    EXPECT_FALSE(slot.overrun) << value << " in argument " << i;
+            };
+            if (!number) {
+                for (double value : ints)
+                    try_value(value, 0, 1);
+                continue;
+            }
+            for (double value : doubles) {
+                try_value(value, 0, arguments[i].count);
+                for (std::size_t element = 0; element < arguments[i].count; ++element)
+                    try_value(value, element, element + 1);
+            }
+        }
+    }
+}
