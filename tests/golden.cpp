@@ -1,8 +1,10 @@
 #include "golden.h"
 
+#include <climits>
 #include <fstream>
 #include <iomanip>
 #include <map>
+#include <set>
 #include <sstream>
 #include <stdexcept>
 
@@ -179,4 +181,37 @@ std::vector<GoldenCase> read_all_golden()
         for (auto &golden : read_golden(file))
             all.push_back(std::move(golden));
     return all;
+}
+
+std::vector<GoldenCase> one_good_call_each()
+{
+    std::vector<GoldenCase> calls;
+    std::set<std::string> seen;
+    for (GoldenCase &golden : read_all_golden())
+        if (golden.returns != 0 && seen.insert(golden.function->name).second)
+            calls.push_back(std::move(golden));
+    return calls;
+}
+
+std::vector<std::vector<Slot>> spoilt_calls(const GoldenCase &good, std::size_t argument)
+{
+    static const std::map<char, std::vector<double>> bad_indices = {
+        {'k', {-1, NUM_ILLUM_OBS, INT_MIN, INT_MAX}},
+        {'s', {-1, 10, INT_MIN, INT_MAX}},
+        {'r', {-1, 9, INT_MIN, INT_MAX}},
+    };
+    const Argument &declared = good.function->arguments[argument];
+    std::vector<std::vector<Slot>> calls;
+    if (declared.unchecked)
+        return calls;
+    if (declared.kind == 'a' && !declared.nullable) {
+        calls.push_back(good.slots);
+        calls.back()[argument].null = true;
+    }
+    if (const auto bad = bad_indices.find(declared.kind); bad != bad_indices.end())
+        for (double index : bad->second) {
+            calls.push_back(good.slots);
+            calls.back()[argument].values[0] = index;
+        }
+    return calls;
 }

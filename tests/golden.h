@@ -28,5 +28,11 @@ std::vector<GoldenCase> read_golden(const std::filesystem::path &file);
 /// The cases of every file.
 std::vector<GoldenCase> read_all_golden();
 
+/// A successful call of each function in the tables, to be spoilt one argument at a time.
+std::vector<GoldenCase> one_good_call_each();
+
+/// The ways to spoil an argument that a function checks: null, or each index just out of range.
+std::vector<std::vector<Slot>> spoilt_calls(const GoldenCase &good, std::size_t argument);
+
 /// An array literal of the tables: `50,10,-10`, `31*100`, a name of inputs.txt, an enumerator.
 std::vector<double> golden_values(const std::string &literal);
