@@ -4,10 +4,10 @@
 
 namespace vantrel {
 
-// CIE 1976 (L*a*b*), CIE 15, with the constants in the decimals of ASTM E308.
+// CIE 1976 (L*a*b*), CIE 15, with the constants as decimals.
 inline constexpr double kLinearLimit = 0.008856; ///< up to this ratio the cube root is a line
-inline constexpr double kLightnessSlope = 903.292;
 inline constexpr double kRootSlope = 7.787;
+inline constexpr double kLightnessSlope = 903.292; ///< 116 · 7.787
 
 /// exp(0.3333333333 ln t) for t > 0.
 double cube_root(double t);
