@@ -1,5 +1,6 @@
-# How the library is compiled, linked and installed.
+# How the library is compiled and linked.
 
+include(GNUInstallDirs)
 target_include_directories(Vantrel
   PUBLIC $<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}/include>
          $<INSTALL_INTERFACE:${CMAKE_INSTALL_INCLUDEDIR}>
@@ -14,11 +15,11 @@ if(VANTREL_CHECKED)
   target_compile_definitions(Vantrel PRIVATE VANTREL_CHECKED)
 endif()
 
-# SOVERSION rises whenever an exported name goes away or the type or layout behind one changes;
-# new names leave it as it is.
+# The major version, and SOVERSION with it, rises whenever an exported name goes away or the type or
+# layout behind one changes; new names leave it as it is.
 set_target_properties(Vantrel PROPERTIES
-  VERSION ${PROJECT_VERSION} SOVERSION 0
-  CXX_VISIBILITY_PRESET hidden VISIBILITY_INLINES_HIDDEN ON)
+  VERSION ${PROJECT_VERSION} SOVERSION ${PROJECT_VERSION_MAJOR}
+  CXX_VISIBILITY_PRESET hidden VISIBILITY_INLINES_HIDDEN ON POSITION_INDEPENDENT_CODE ON)
 
 # src/exports.txt lists the names that the library exports; no other symbol leaves it.
 set(exports ${PROJECT_SOURCE_DIR}/src/exports.txt)
@@ -30,4 +31,9 @@ get_target_property(type Vantrel TYPE)
 if(type STREQUAL SHARED_LIBRARY)
   target_link_options(Vantrel PRIVATE "-Wl,--version-script=${CMAKE_CURRENT_BINARY_DIR}/exports.map")
   set_target_properties(Vantrel PROPERTIES LINK_DEPENDS ${CMAKE_CURRENT_BINARY_DIR}/exports.map)
+else()
+  # Who links the static library, from C perhaps, needs the C++ runtime too.
+  set(runtime ${CMAKE_CXX_IMPLICIT_LINK_LIBRARIES})
+  list(FILTER runtime INCLUDE REGEX "^(stdc\\+\\+|c\\+\\+|m)$")
+  target_link_libraries(Vantrel INTERFACE ${runtime})
 endif()

@@ -1,0 +1,25 @@
+# What `cmake --install` lays down: the library, its header, and what find_package and pkg-config
+# need. Nothing of it holds an absolute path, so that an installed tree can be moved.
+
+include(CMakePackageConfigHelpers)
+
+set(package_dir ${CMAKE_INSTALL_LIBDIR}/cmake/Vantrel)
+install(TARGETS Vantrel EXPORT Vantrel)
+install(FILES include/vantrel.h TYPE INCLUDE)
+install(EXPORT Vantrel NAMESPACE Vantrel:: FILE VantrelConfig.cmake DESTINATION ${package_dir})
+write_basic_package_version_file(VantrelConfigVersion.cmake COMPATIBILITY SameMajorVersion)
+install(FILES ${CMAKE_CURRENT_BINARY_DIR}/VantrelConfigVersion.cmake DESTINATION ${package_dir})
+
+get_target_property(libraries Vantrel INTERFACE_LINK_LIBRARIES)
+if(libraries)
+  list(TRANSFORM libraries PREPEND " -l")
+  list(JOIN libraries "" libraries)
+else()
+  set(libraries "")
+endif()
+set(pc_dir ${CMAKE_INSTALL_FULL_LIBDIR}/pkgconfig)
+file(RELATIVE_PATH prefix ${pc_dir} ${CMAKE_INSTALL_PREFIX})
+file(RELATIVE_PATH includedir ${pc_dir} ${CMAKE_INSTALL_FULL_INCLUDEDIR})
+configure_file(cmake/vantrel.pc.in vantrel.pc @ONLY)
+install(FILES ${CMAKE_CURRENT_BINARY_DIR}/vantrel.pc
+        DESTINATION ${CMAKE_INSTALL_LIBDIR}/pkgconfig)

@@ -1,0 +1,39 @@
+# Sourced by the commands in this folder: the packages they need, and the build trees they use.
+
+cd "$(dirname "${BASH_SOURCE[0]}")/.."
+
+build_packages=(cmake ninja-build g++ libcli11-dev libfmt-dev nlohmann-json3-dev liblcms2-dev)
+test_packages=(libgtest-dev clang clang-tidy clang-format pkg-config binutils)
+
+# Installs those of the packages that the system does not have. Stops where it may not.
+install_packages() {
+    if ! command -v apt-get >/dev/null; then
+        echo "Needed here, by their Debian names: $*. There is no apt-get to install them with." >&2
+        return
+    fi
+    local package missing=() root=()
+    for package in "$@"; do
+        [[ $(dpkg-query -W -f='${db:Status-Status}' "$package" 2>&1) == installed ]] ||
+            missing+=("$package")
+    done
+    ((${#missing[@]})) || return 0
+    if ((EUID)); then
+        command -v sudo >/dev/null ||
+            { echo "Please install, as root: apt-get install ${missing[*]}" >&2; exit 1; }
+        root=(sudo)
+    fi
+    echo "Installing ${missing[*]}" >&2
+    {
+        "${root[@]}" apt-get -qq update
+        "${root[@]}" env DEBIAN_FRONTEND=noninteractive \
+            apt-get -qq -y --no-install-recommends -o Dpkg::Use-Pty=0 install "${missing[@]}"
+    } </dev/null >&2
+}
+
+# Configures and builds build-PRESET, or one target of it; what is up to date is not built again.
+build() {
+    local preset=$1
+    shift
+    cmake --preset "$preset"
+    cmake --build --preset "$preset" "$@"
+}
