@@ -56,11 +56,11 @@ inline constexpr std::array<unsigned char, kDisplaySteps> kDisplayLevels = displ
 
 constexpr bool starts_rise()
 {
-    const LevelStart *before = nullptr;
-    for (const LevelStart &start : kLevelStarts) {
-        if (before && (start.index <= before->index || start.level <= before->level))
+    for (std::size_t i = 1; i < std::size(kLevelStarts); ++i) {
+        const LevelStart &before = kLevelStarts[i - 1];
+        const LevelStart &start = kLevelStarts[i];
+        if (start.index <= before.index || start.level <= before.level)
             return false;
-        before = &start;
     }
     return true;
 }
