@@ -2,8 +2,9 @@
 
 cd "$(dirname "${BASH_SOURCE[0]}")/.."
 
-build_packages=(cmake ninja-build g++ libcli11-dev libfmt-dev nlohmann-json3-dev liblcms2-dev)
-test_packages=(libgtest-dev clang clang-tidy clang-format pkg-config binutils)
+build_packages=(cmake ninja-build g++ pkg-config
+    libcli11-dev libfmt-dev nlohmann-json3-dev liblcms2-dev)
+test_packages=(libgtest-dev clang clang-tidy clang-format binutils)
 
 # Installs those of the packages that the system does not have. Stops where it may not.
 install_packages() {
