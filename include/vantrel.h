@@ -31,6 +31,7 @@
 #include <stddef.h>
 #include <stdint.h>
 
+/** Marks what the library exports. */
 #if defined(__GNUC__)
 #define VANTREL_API __attribute__((visibility("default")))
 #else

@@ -9,8 +9,6 @@ int main(void)
     for (int band = 0; band < VANTREL_BANDS; ++band)
         grey[band] = 50.0;
 
-    if (ReflToXYZ(NULL, D50_2DEG, xyz))
-        return 1;
     return !(GetNumIlluminantObservers() == NUM_ILLUM_OBS && ReflToXYZ(grey, D50_2DEG, xyz) &&
              XYZToCIELab(xyz, D50_2DEG, result) && XYZToCIELUV(xyz, D50_2DEG, result) &&
              XYZtoRGB(xyz, &rgb) && LabToDE2000(&first, &second, 1.0, 1.0, &delta));
