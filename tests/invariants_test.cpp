@@ -9,9 +9,13 @@
 
 namespace {
 
+struct Report {
+    std::string function, expression;
+};
+
 struct Invariants {
-    std::string reporter, file;
-    std::vector<std::string> expressions;
+    std::string file;
+    std::vector<Report> reports;
 };
 
 std::map<std::string, Invariants> read_invariants()
@@ -24,13 +28,13 @@ std::map<std::string, Invariants> read_invariants()
         if (!(words >> name) || name.front() == '#')
             continue;
         Invariants row;
-        row.reporter = name.substr(name.rfind(':') + 1);
+        std::string reporter = name.substr(name.rfind(':') + 1);
         words >> row.file >> std::ws;
         for (std::string expression; std::getline(words, expression, '|');) {
             if (expression.starts_with("as "))
-                row.reporter = expression.substr(3);
+                reporter = expression.substr(3);
             else
-                row.expressions.push_back(expression);
+                row.reports.push_back({reporter, expression});
         }
         all[name] = row;
     }
@@ -50,9 +54,9 @@ TEST(CheckingBuild, ReportsEveryRefusedArgumentInOneLine)
                 continue;
             const auto row = invariants.find(good.function->name);
             ASSERT_NE(row, invariants.end()) << good.function->name;
-            const auto &[reporter, file, expressions] = row->second;
-            const std::string &expression =
-                expressions.size() == 1 ? expressions[0] : expressions.at(checked);
+            const auto &[file, reports] = row->second;
+            const auto &[reporter, expression] =
+                reports.size() == 1 ? reports[0] : reports.at(checked);
             ++checked;
             for (auto &slots : calls) {
                 testing::internal::CaptureStderr();
