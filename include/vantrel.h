@@ -301,6 +301,48 @@ VANTREL_API int VerbalColorDifference(const double *standard, const double *samp
 
 /** @} */
 
+/** @name Paper
+ *  How white a substrate is, and how it holds its colour from light to light.
+ *  @{ */
+
+/**
+ * Blue-weighted brightness: 13 weights from 400 to 520 nm with their maximum at 460 nm, in the
+ * manner of the R457 of ISO 2470. A flat spectrum of v has 0.99999 v.
+ * @param[in]  refl        spectrum, 31 values in percent
+ * @param[out] brightness  percent
+ * @return 1; 0 for a null pointer.
+ */
+VANTREL_API int ReflToBrightness(const double *refl, double *brightness);
+
+/**
+ * The ΔE\*ab of a sample from its standard under one illuminant/observer plus that under another:
+ * a pair that differs alike under both reports twice the difference. ReflToDIN6172() tells how far
+ * the difference moves.
+ * @param[in]  standard,sample      spectra, 31 values in percent
+ * @param[in]  illumObs1,illumObs2  the two combinations, which may be equal
+ * @param[out] metamerism           sum of the two ΔE\*ab
+ * @return 1; 0 for a null pointer or an unknown combination.
+ */
+VANTREL_API int Metamerism(const double *standard, const double *sample, ILLUM_OBS illumObs1,
+                           ILLUM_OBS illumObs2, double *metamerism);
+
+/**
+ * Whiteness index of ASTM E313-98, for illuminants C, D50 and D65:
+ * W = Y + 800 (xn − x) + 1700 (yn − y), which describes a white while 40 < W < 5 Y − 280.
+ * @param[in]  refl       spectrum, 31 values in percent
+ * @param[in]  illumObs   C_2DEG … D65_10DEG
+ * @param[out] whiteness  W, or −999
+ * @return 1; 0 with −999 written where W is outside its limits or the combination, though known,
+ *         has no whiteness; 0 for a null pointer, an unknown combination, or a spectrum with
+ *         X + Y + Z = 0.
+ */
+VANTREL_API int ReflToWhiteE313_98(const double *refl, ILLUM_OBS illumObs, double *whiteness);
+
+/** Whiteness of Y, x, y as ReflToCIEYxy() writes them; as ReflToWhiteE313_98(). */
+VANTREL_API int CIEYxyToWhiteE313_98(const double *Yxy, ILLUM_OBS illumObs, double *whiteness);
+
+/** @} */
+
 #ifdef __cplusplus
 } /* extern "C" */
 

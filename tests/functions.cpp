@@ -73,6 +73,10 @@ const Row kRows[] = {
      call(+[](double degrees) { return CIEDE2000().ConvertToRadians(degrees); }), "d"},
     {"LabToDEcmc", call(LabToDEcmc), "3 3 d d >1"},
     {"ReflToDIN6172", call(ReflToDIN6172), "31 31 k k >1"},
+    {"ReflToBrightness", call(ReflToBrightness), "31 >1"},
+    {"Metamerism", call(Metamerism), "31 31 k k >1"},
+    {"ReflToWhiteE313_98", call(ReflToWhiteE313_98), "31 k >1"},
+    {"CIEYxyToWhiteE313_98", call(CIEYxyToWhiteE313_98), "3 k >1"},
 };
 
 } // namespace
