@@ -343,6 +343,112 @@ VANTREL_API int CIEYxyToWhiteE313_98(const double *Yxy, ILLUM_OBS illumObs, doub
 
 /** @} */
 
+/** @name Inks
+ *  What inks will measure over one another and as tints, before they are printed. Percentages run
+ *  from 0 (bare paper) to 100 (the ink as measured); an overprint lists the inks in the order of
+ *  printing.
+ *  @{ */
+
+/**
+ * Spectrum of two inks over one another: in each band the density of the denser ink and, where the
+ * other one is above 0.6, a share of its density that is 0.5 in the band where it is largest. The
+ * inks commute. A band in which either reading is below 0 or not a number is not a number.
+ * @param[in]  first,second  spectra of the solids, 31 values in percent
+ * @param[out] refl          spectrum of the overprint
+ * @return 1; 0 for a null pointer.
+ */
+VANTREL_API int CombineInkColors(const double *first, const double *second, double *refl);
+
+/** Spectrum of three inks: the first two as CombineInkColors(), then the third over the result. */
+VANTREL_API int Combine3InkColors(const double *first, const double *second, const double *third,
+                                  double *refl);
+
+/** Mean of two L\*a\*b\* (three doubles each), in place of an overprint. 0 for a null pointer. */
+VANTREL_API int CombineInkColorsEx(const double *first, const double *second, double *lab);
+
+/** Sum of three L\*a\*b\* times 0.3333333 each. 0 for a null pointer. */
+VANTREL_API int Combine3InkColorsEx(const double *first, const double *second, const double *third,
+                                    double *lab);
+
+/**
+ * Spectrum of up to three inks, each a solid or a halftone tint as EstimateReflsForTintColor(),
+ * over one another as CombineInkColors().
+ * @param[in]  n        number of inks, 1 to 3
+ * @param[in]  inks     spectra of the solids on the paper, one after the other: 31 n values
+ * @param[in]  percent  tint of each ink, n values from 0 to 100
+ * @param[in]  paper    spectrum of the paper
+ * @param[out] refl     predicted spectrum
+ * @return 1; 0 for a null pointer, or a number or percentage out of range.
+ */
+VANTREL_API int EstimateRefls(int n, const double *inks, const int *percent, const double *paper,
+                              double *refl);
+
+/** As EstimateRefls(), with tints as thinner films: EstimateReflsForThickness(). */
+VANTREL_API int EstimateReflsForBestVisualColor(int n, const double *inks, const int *percent,
+                                                const double *paper, double *refl);
+
+/**
+ * EstimateRefls() of inks in arrays of their own. Of the three only the first n are read; a null
+ * `second` or `third` that n asks for reflects nothing, a null `first` returns 0.
+ */
+VANTREL_API int EstimateReflsEx(int n, const double *first, const double *second,
+                                const double *third, const int *percent, const double *paper,
+                                double *refl);
+
+/** EstimateReflsForBestVisualColor() of inks in arrays of their own; as EstimateReflsEx(). */
+VANTREL_API int EstimateReflsExForBestVisualColor(int n, const double *first, const double *second,
+                                                  const double *third, const int *percent,
+                                                  const double *paper, double *refl);
+
+/**
+ * Spectrum of a halftone tint: ink and paper mixed by area (Murray-Davies), for any percentage.
+ * Pointers are not checked.
+ * @param[in]  ink,paper  spectra, 31 values in percent
+ * @param[in]  percent    area of the ink
+ * @param[out] refl       spectrum of the tint
+ */
+VANTREL_API void EstimateReflsForTintColor(const double *ink, int percent, const double *paper,
+                                           double *refl);
+
+/**
+ * L\*a\*b\* of up to three inks from their L\*a\*b\* alone: tints as EstimateTintColor(),
+ * overprints as CombineInkColorsEx(). Three inks without a solid among them are predicted as a
+ * neutral, a\* = b\* = 0.
+ * @param[in]  n        number of inks, 1 to 3
+ * @param[in]  inks     L\*a\*b\* of the solids, one after the other: 3 n values
+ * @param[in]  percent  tint of each ink, n values from 0 to 100
+ * @param[in]  paper    L\*a\*b\* of the paper
+ * @param[out] lab      predicted L\*a\*b\*
+ * @return 1; 0 for a null pointer, or a number or percentage out of range.
+ */
+VANTREL_API int EstimateColor(int n, const double *inks, const int *percent, const double *paper,
+                              double *lab);
+
+/** L\*a\*b\* of a tint: ink and paper mixed. 0 for a null pointer or a percentage out of range. */
+VANTREL_API int EstimateTintColor(const double *ink, int percent, const double *paper, double *lab);
+
+/**
+ * Display value (see XYZtoRGB()) of a tint: the lightnesses of ink and paper mixed, a\* and b\* of
+ * the ink. Any percentage is taken as it is.
+ * @return 1; 0 for a null pointer or an unknown combination.
+ */
+VANTREL_API int CalculateTintColor(const double *ink, const double *paper, int percent,
+                                   int illumObs, unsigned int *rgb);
+
+/**
+ * Where along the spectrum the a\* and the b\* difference of two spectra comes from: per band the
+ * signed cube root of its difference in X/Xn − Y/Yn (in Y/Yn − Z/Zn), scaled so that the largest
+ * magnitude is 100. Positive where the second spectrum is redder (yellower).
+ * @param[in]  first,second  spectra, 31 values in percent
+ * @param[in]  illumObs      illuminant and observer
+ * @param[out] a,b           31 weights each, all 0 without a difference; either may be null
+ * @return 1; 0 for a null spectrum, two null outputs, or an unknown combination.
+ */
+VANTREL_API int ReflToABErrorWeights(const double *first, const double *second, int illumObs,
+                                     double *a, double *b);
+
+/** @} */
+
 #ifdef __cplusplus
 } /* extern "C" */
 
@@ -378,6 +484,40 @@ public:
 private:
     double pow25To7;
 };
+
+/** @} */
+
+/** @name Ink films (C++)
+ *  Pointers are not checked.
+ *  @{ */
+
+/**
+ * Saunderson's correction (J. Opt. Soc. Am. 32, 1942, 727): the internal reflectance of a layer.
+ * @param refl  measured reflectance in percent
+ * @param k1    fraction that the surface reflects outside
+ * @param k2    fraction that the surface reflects inside
+ * @return (r − k1) / (1 − k1 − k2 + k2 r) with r of 1, in percent.
+ */
+VANTREL_API double Saunderson(double refl, double k1, double k2);
+
+/** The inverse of Saunderson(); a reflectance below 0.0001 is returned as it is. */
+VANTREL_API double UnSaunderson(double refl, double k1, double k2);
+
+/**
+ * Spectrum of an ink printed as a thinner or thicker film: Beer-Lambert between Saunderson
+ * corrections with k1 = 0 and k2 = 0.6. Where the ink is lighter than the paper the result is the
+ * paper; a band in which the ink is below 0.0001 keeps the value of the ink.
+ * @param[in]  ink        spectrum of the solid on the paper, 31 values in percent
+ * @param[in]  thickness  relative to the solid: 0 is the paper, 1 the solid
+ * @param[in]  paper      spectrum of the paper
+ * @param[out] refl       spectrum of the film
+ */
+VANTREL_API void EstimateReflsForThickness(const double *ink, double thickness, const double *paper,
+                                           double *refl);
+
+/** A tint as a film: EstimateReflsForThickness() with a thickness of percent / 100. */
+VANTREL_API void EstimateReflsForTintColorForBestVisualColor(const double *ink, int percent,
+                                                             const double *paper, double *refl);
 
 /** @} */
 #endif

@@ -2,6 +2,8 @@
 
 #include "vantrel.h"
 
+#include <algorithm>
+#include <array>
 #include <span>
 
 namespace vantrel {
@@ -10,6 +12,8 @@ inline constexpr int kBands = VANTREL_BANDS;
 
 /// Reflectance in percent, band i at 400 + 10 i nm.
 using Spectrum = std::span<const double, kBands>;
+/// A spectrum, or one value for each band, by value.
+using Bands = std::array<double, kBands>;
 /// A spectrum that is written.
 using SpectrumOut = std::span<double, kBands>;
 
@@ -23,6 +27,14 @@ struct Xyz {
 
 inline Spectrum spectrum(const double *refl) { return Spectrum(refl, kBands); }
 inline SpectrumOut spectrum_out(double *refl) { return SpectrumOut(refl, kBands); }
+
+inline Bands bands(Spectrum refl)
+{
+    Bands copy;
+    std::ranges::copy(refl, copy.begin());
+    return copy;
+}
+inline void store(const Bands &values, double *out) { std::ranges::copy(values, out); }
 
 inline bool is_illum_obs(int illum_obs) { return illum_obs >= 0 && illum_obs < NUM_ILLUM_OBS; }
 

@@ -11,5 +11,6 @@ int main(void)
 
     return !(GetNumIlluminantObservers() == NUM_ILLUM_OBS && ReflToXYZ(grey, D50_2DEG, xyz) &&
              XYZToCIELab(xyz, D50_2DEG, result) && XYZToCIELUV(xyz, D50_2DEG, result) &&
-             XYZtoRGB(xyz, &rgb) && LabToDE2000(&first, &second, 1.0, 1.0, &delta));
+             XYZtoRGB(xyz, &rgb) && LabToDE2000(&first, &second, 1.0, 1.0, &delta) &&
+             ReflToBrightness(grey, &delta) && CombineInkColors(grey, grey, grey));
 }

@@ -12,5 +12,6 @@ int main()
     const ILLUM_OBS none = static_cast<ILLUM_OBS>(-1);
     return !(CalcLabch(grey, D50_2DEG, labch) == 1 && CalcLabch(grey, none, labch) == 0 &&
              CIELabToCIELCh(&lab, &lch, true) &&
-             CIEDE2000().Calculate(lab, lab, 1.0, 1.0, 1.0) == 0.0);
+             CIEDE2000().Calculate(lab, lab, 1.0, 1.0, 1.0) == 0.0 &&
+             Saunderson(100.0, 0.0, 0.6) == 100.0);
 }

@@ -1,0 +1,38 @@
+#include "inks/tint.h"
+
+#include "inks/saunderson.h"
+
+namespace vantrel {
+
+Bands halftone_tint(Spectrum ink, int percent, Spectrum paper)
+{
+    const double bare = 100.0 - percent;
+    Bands refl;
+    for (int i = 0; i < kBands; ++i)
+        refl[i] = ink[i] + (paper[i] - ink[i]) * bare / 100;
+    return refl;
+}
+
+Bands film_tint(Spectrum ink, int percent, Spectrum paper)
+{
+    return film(ink, percent / 100.0, paper);
+}
+
+static double mixed(double ink, double percent, double paper)
+{
+    return ink * percent / 100 + paper * (100 - percent) / 100;
+}
+
+Lab colour_tint(const Lab &ink, int percent, const Lab &paper)
+{
+    return {mixed(ink.L, percent, paper.L), mixed(ink.a, percent, paper.a),
+            mixed(ink.b, percent, paper.b)};
+}
+
+Lab preview_tint(const Lab &ink, int percent, const Lab &paper)
+{
+    const double t = percent / 100.0;
+    return {ink.L * t + paper.L * (1 - t), ink.a, ink.b};
+}
+
+} // namespace vantrel
