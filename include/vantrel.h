@@ -20,7 +20,8 @@
  * - A function returns 1 when it succeeded. A null pointer, or an index out of range, makes it
  *   return 0 with every output left as it was; exceptions to this are named where they occur.
  * - No function allocates, throws, or keeps a pointer. All of them may be called from any number
- *   of threads at once.
+ *   of threads at once, as long as no thread calls a `Set…Constants` function (or writes
+ *   #den_weight) meanwhile.
  *
  * Plain names have C linkage. The C++ section of each group carries the functions that take
  * typed records or references.
@@ -88,6 +89,46 @@ typedef struct CIELCHCOORD {
     double C; /**< chroma C\*ab */
     double h; /**< hue angle hab in degrees, 0 ≤ h < 360 */
 } CIELCHCOORD;
+
+/** Density status: a family of filters. ISO 5-3 Statuses A, E, I and T, and six more. */
+enum {
+    A_STATUS = 0,
+    E_STATUS = 1,
+    I_STATUS = 2,
+    T_STATUS = 3,
+    SPECTRAL_STATUS = 4,   /**< one wavelength; the response is that wavelength in nm */
+    SPECTRALX_STATUS = 5,  /**< a five-band window where the ink absorbs; the response is a band */
+    HIFI_STATUS = 6,       /**< Status E and three settable bands */
+    HEXACHROME_STATUS = 7, /**< Status E and two settable bands */
+    CCR1_STATUS = 8,       /**< densities corrected for the overlap of the filters */
+    CCR2_STATUS = 9,       /**< the same with a second set of coefficients */
+    NUM_STATUSES = 10      /**< how many there are; not a status itself */
+};
+
+/** Density response: one filter of a status, and the index of its density in a set. */
+enum {
+    VISUAL_RESPONSE = 0,
+    RED_RESPONSE = 1,   /**< reads cyan ink */
+    GREEN_RESPONSE = 2, /**< reads magenta ink */
+    BLUE_RESPONSE = 3,  /**< reads yellow ink */
+    HIFI1_RESPONSE = 4, /**< settable, see SetHiFiConstants() */
+    HIFI2_RESPONSE = 5,
+    HIFI3_RESPONSE = 6,
+    HEXACHROME1_RESPONSE = 7, /**< settable, see SetHexachromeConstants() */
+    HEXACHROME2_RESPONSE = 8,
+    NUM_RESPONSES = 9 /**< how many there are; as an answer: none could be found */
+};
+
+/** A density set: one density for each response, 0 where the status does not have it. */
+typedef struct DENSITYSTRUCT {
+    double density[NUM_RESPONSES];
+} DENSITYSTRUCT;
+
+/** An absorption peak of a spectrum. */
+typedef struct DENSITYPOINT {
+    double density; /**< density of the five-band window at the band */
+    int band;       /**< band index, 400 + 10 band nm */
+} DENSITYPOINT;
 
 #ifdef __cplusplus
 extern "C" {
@@ -301,6 +342,209 @@ VANTREL_API int VerbalColorDifference(const double *standard, const double *samp
 
 /** @} */
 
+/** @name Density statuses and weights
+ *  @{ */
+
+/**
+ * The filters: the weight of each band for every status and response. A row of a filter sums to
+ * 100 000 within rounding; a row that a status does not have is zero. Densities read it at the
+ * moment of the call; SetHiFiConstants() and SetHexachromeConstants() rewrite rows of it.
+ */
+extern VANTREL_API int64_t den_weight[NUM_STATUSES][NUM_RESPONSES][VANTREL_BANDS];
+
+/** The number of density statuses, 10. */
+VANTREL_API int GetNumStatuses(void);
+
+/** The number of density responses, 9. */
+VANTREL_API int GetNumResponses(void);
+
+/** How many responses a status measures: 4, or 7 for HiFi, 6 for Hexachrome, 0 for the two spectral
+ * statuses and for an unknown status. */
+VANTREL_API int GetNumStatusResponses(int status);
+
+/**
+ * A filter scaled to a peak of 100.
+ * @param[in]  status,response  which filter
+ * @param[out] weights          31 weights
+ * @param[out] first,peak,last  wavelengths in nm of the first non-zero weight, of the largest (the
+ *                              shortest wavelength wins a tie) and of the last; each may be null
+ * @return 1; 0 for a null `weights`, an unknown status or response; 0 with `first` and `last`
+ *         written (0 where every weight is 0) and the rest untouched for a filter without a
+ *         positive weight.
+ */
+VANTREL_API int GetNormalizedDensityWeights(int status, int response, double *weights,
+                                            double *first, double *peak, double *last);
+
+/** @} */
+
+/** @name Densities
+ *  ISO 5-3 and ISO 5-4: D = -log10 of the filter-weighted reflectance factor, floored at 0.00001
+ *  (D = 5). A paper spectrum may be null; where it is given, its own density is subtracted.
+ *  @{ */
+
+/**
+ * The density of a spectrum.
+ * @param[in]  refl      spectrum, 31 values in percent
+ * @param[in]  paper     spectrum of the paper, or null
+ * @param[in]  status    density status
+ * @param[in]  response  0 to 8; for #SPECTRAL_STATUS a wavelength of 391 to 709 nm (its band, cut
+ *                       to ten, is read; the paper plays no part); for #SPECTRALX_STATUS a request
+ *                       of 0 to 30 as in CalculateSpectralXDensity(); #CCR2_STATUS takes 9 to 30 as
+ *                       well and answers 0
+ * @param[out] density   density; 0 to 5 for the two spectral statuses
+ * @return 1; 0 for a null `refl` or `density`, an unknown status, a response out of range.
+ */
+VANTREL_API int ReflToDensity(const double *refl, const double *paper, int status, int response,
+                              double *density);
+
+/**
+ * Filter-weighted reflectance in percent, not below 0.001.
+ * @return 1; 0 for a null pointer, an unknown status or a response outside 0 to 8.
+ */
+VANTREL_API int ReflToReflDensity(const double *refl, int status, int response,
+                                  double *weightedRefl);
+
+/**
+ * The density set of a spectrum: every response that the status measures, 0 for the others. The two
+ * spectral statuses give nine times the same density, #SPECTRAL_STATUS at the wavelength that
+ * DetermineDensityResponse() chooses, #SPECTRALX_STATUS the visual density of Status T.
+ * @return 1; 0 for a null `refl` or `densities` or an unknown status.
+ */
+VANTREL_API int ReflToDensities(const double *refl, const double *paper, int status,
+                                DENSITYSTRUCT *densities);
+
+/** ReflToDensities() without a paper. */
+VANTREL_API int ReflToDensitiesNoPaper(const double *refl, int status, DENSITYSTRUCT *densities);
+
+/**
+ * Which response reads this ink: the visual one for a neutral, else the one of the largest density,
+ * with the HiFi and Hexachrome inks told from the process inks by hue. With a paper the spectrum is
+ * first sharpened by AdjustForPaperRefls(). Note the order of the parameters.
+ * @param[in] refl    spectrum, 31 values in percent
+ * @param[in] status  density status
+ * @param[in] paper   spectrum of the paper, or null
+ * @return a response; for #SPECTRAL_STATUS a wavelength (420, 440, … 700 nm); for #SPECTRALX_STATUS
+ *         a band (2 to 28), or 0 for a neutral; 9 where the density set cannot be computed; 0 for a
+ *         null `refl` or an unknown status.
+ */
+VANTREL_API int DetermineDensityResponse(const double *refl, int status, const double *paper);
+
+/** @} */
+
+/** @name Corrected densities and settable bands
+ *  @{ */
+
+/**
+ * The CCR density set: red, green and blue corrected by the ratios of their reflectances, the more
+ * the darker the sample, and a visual density formed from green and red.
+ * @param[in]  refl       spectrum, 31 values in percent
+ * @param[in]  paper      spectrum of the paper, or null
+ * @param[in]  status     #CCR1_STATUS or #CCR2_STATUS
+ * @param[out] densities  nine doubles: visual, red, green, blue, and five zeros
+ * @return 1; 0 for a null `refl` or `densities` or another status.
+ */
+VANTREL_API int CalculateCCRDensities(const double *refl, const double *paper, int status,
+                                      double *densities);
+
+/**
+ * Places the three HiFi bands and rebuilds their rows of #den_weight, so that each sums to exactly
+ * 100 000. Lasts until the library is unloaded.
+ * @param[in] wavelengths           three centres in nm, cut to their band; one outside 430 to
+ *                                  below 680, or not a number, leaves its band as it was
+ * @param[in] shape1,shape2,shape3  seven relative weights around each centre, in steps of 10 nm;
+ *                                  null moves the centre alone. A shape that sums to 0 makes an
+ *                                  empty row.
+ */
+VANTREL_API void SetHiFiConstants(const double *wavelengths, const double *shape1,
+                                  const double *shape2, const double *shape3);
+
+/** The three HiFi centres in nm and the rows around them, scaled to 1 in the centre (an empty row
+ * gives what the division gives). Each may be null. */
+VANTREL_API void GetHiFiConstants(double *wavelengths, double *shape1, double *shape2,
+                                  double *shape3);
+
+/** Places the two Hexachrome bands; as SetHiFiConstants(). */
+VANTREL_API void SetHexachromeConstants(const double *wavelengths, const double *shape1,
+                                        const double *shape2);
+
+/** The two Hexachrome centres and shapes; as GetHiFiConstants(). */
+VANTREL_API void GetHexachromeConstants(double *wavelengths, double *shape1, double *shape2);
+
+/** @} */
+
+/** @name SpectralX
+ *  The density of a symmetric five-band window (0.1, 0.5, 1, 0.5, 0.1 unless set otherwise) at the
+ *  band where the ink absorbs.
+ *  @{ */
+
+/**
+ * The windowed density at a band.
+ * @param[in]  refl     spectrum, 31 values in percent
+ * @param[in]  paper    spectrum of the paper, or null; its density at the same band is subtracted
+ * @param[in]  request  2 to 28: that band; 0: the visual density of Status T; any other: the
+ *                      absorption peak that borders the brightest stretch of the spectrum
+ * @param[out] density  density, or null (not for request 0)
+ * @param[out] band     the band read, or null; not written for request 0
+ * @return 1; 0 for a null `refl`, or a null `density` with request 0.
+ */
+VANTREL_API int CalculateSpectralXDensity(const double *refl, const double *paper, int request,
+                                          double *density, int *band);
+
+/**
+ * The absorption peaks of a spectrum in order of wavelength.
+ * @param[in]  refl    spectrum, 31 values in percent
+ * @param[out] points  room for 31 peaks
+ * @param[out] count   how many were found, at least 1
+ * @return 1; 0 for a null pointer.
+ */
+VANTREL_API int FindMaxDensityPoints(const double *refl, DENSITYPOINT *points, int *count);
+
+/** Index of the peak that borders the brightest stretch of the spectrum, on the side nearer to the
+ * crest of that stretch; 0 for a null pointer, no peaks, or a band outside 0 to 30. */
+VANTREL_API int ChooseBPWavelen(const double *refl, const DENSITYPOINT *points, int count);
+
+/**
+ * Sets the SpectralX constants, all five or, for a null pointer or a centre weight other than 1,
+ * none.
+ * @param[in] tolerance  how far above the lowest windowed sum (percent, not normalised) a band
+ * still counts as a peak; 2
+ * @param[in] reserved   kept and returned; 84
+ * @param[in] centre     weight of the centre, 1
+ * @param[in] inner      weight of the two bands next to it; 0.5
+ * @param[in] outer      weight of the two outer bands; 0.1
+ */
+VANTREL_API void SetSpectralXConstants(const double *tolerance, const double *reserved,
+                                       const double *centre, const double *inner,
+                                       const double *outer);
+
+/** The SpectralX constants. Each may be null. */
+VANTREL_API void GetSpectralXConstants(double *tolerance, double *reserved, double *centre,
+                                       double *inner, double *outer);
+
+/** @} */
+
+/** @name Achromatic test
+ *  A colour is chromatic when its C\* lies above a straight line over L\*, from (L\*, C\*) = (84,
+ * 3) to (14, 11) unless set otherwise.
+ *  @{ */
+
+/** 1 where the spectrum is chromatic under the ILLUM_OBS, else 0; 0 for a null pointer or an
+ * unknown combination. */
+VANTREL_API int IsChromatic(const double *refl, uint8_t illumObs);
+
+/** 1 where the L\*C\*h (three doubles) is chromatic, else 0; 0 for a null pointer. */
+VANTREL_API int IsChromaticLCH(const double *lch);
+
+/** Sets the two points of the line; a null pointer, two equal L\*, or a value that is not finite
+ * changes nothing. */
+VANTREL_API void SetAChromaticConstants(const double *L1, const double *L2, const double *C1,
+                                        const double *C2);
+
+/** The two points of the line; nothing for a null pointer. */
+VANTREL_API void GetAChromaticConstants(double *L1, double *L2, double *C1, double *C2);
+
+/** @} */
+
 /** @name Paper
  *  How white a substrate is, and how it holds its colour from light to light.
  *  @{ */
@@ -484,6 +728,46 @@ public:
 private:
     double pow25To7;
 };
+
+/** @} */
+
+/** @name Densities (C++)
+ *  Pointers are not checked, except by CalculateSpecialDensity().
+ *  @{ */
+
+/** -log10 of a reflectance in percent, floored at 0.00001 % (D = 7). */
+VANTREL_API double CalculateSpectralDensity(double refl);
+
+/**
+ * A spectrum with its contrast against the paper exaggerated: in every band the density above the
+ * paper is tripled, or doubled where it is more than 0.5. An exact 0 counts as density 100.
+ * @param[in]  refl,paper  spectra, 31 values in percent
+ * @param[out] adjusted    31 values in percent
+ */
+VANTREL_API void AdjustForPaperRefls(const double *refl, const double *paper, double *adjusted);
+
+/** The largest density above 0 of a set and its response, the lowest response on a tie; 0 and
+ * `response` as it was where there is none. The visual density counts when `includeVisual` is not
+ * 0. */
+VANTREL_API void FindDensityMax(DENSITYSTRUCT *densities, double &density, int &response,
+                                int includeVisual);
+
+/** The smallest density below 100 of a set that is not exactly 0; 100 and `response` as it was
+ * where there is none. Otherwise as FindDensityMax(). */
+VANTREL_API void FindDensityMin(DENSITYSTRUCT *densities, double &density, int &response,
+                                int includeVisual);
+
+/**
+ * The density of any window.
+ * @param[in] refl     spectrum, 31 values in percent
+ * @param[in] centre   band under weights[width / 2]
+ * @param[in] weights  `width` weights
+ * @param[in] width    number of bands
+ * @return the density; 5 where the windowed sum is 0 or less; 0 for a null pointer or a window that
+ *         reaches outside the spectrum.
+ */
+VANTREL_API double CalculateSpecialDensity(const double *refl, int centre, double *weights,
+                                           int width);
 
 /** @} */
 

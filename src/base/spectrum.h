@@ -4,6 +4,7 @@
 
 #include <algorithm>
 #include <array>
+#include <optional>
 #include <span>
 
 namespace vantrel {
@@ -16,6 +17,9 @@ using Spectrum = std::span<const double, kBands>;
 using Bands = std::array<double, kBands>;
 /// A spectrum that is written.
 using SpectrumOut = std::span<double, kBands>;
+
+/// The paper that a reading is relative to, if any.
+using Paper = std::optional<Spectrum>;
 
 using Lab = CIELABCOORD;
 using Lch = CIELCHCOORD;
@@ -35,6 +39,8 @@ inline Bands bands(Spectrum refl)
     return copy;
 }
 inline void store(const Bands &values, double *out) { std::ranges::copy(values, out); }
+
+inline Paper paper(const double *refl) { return refl ? Paper(spectrum(refl)) : std::nullopt; }
 
 inline bool is_illum_obs(int illum_obs) { return illum_obs >= 0 && illum_obs < NUM_ILLUM_OBS; }
 
