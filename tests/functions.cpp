@@ -73,6 +73,53 @@ const Row kRows[] = {
      call(+[](double degrees) { return CIEDE2000().ConvertToRadians(degrees); }), "d"},
     {"LabToDEcmc", call(LabToDEcmc), "3 3 d d >1"},
     {"ReflToDIN6172", call(ReflToDIN6172), "31 31 k k >1"},
+    {"GetNumStatuses", call(GetNumStatuses), ""},
+    {"GetNumResponses", call(GetNumResponses), ""},
+    {"GetNumStatusResponses", call(GetNumStatusResponses), "s"},
+    {"GetNormalizedDensityWeights", call(GetNormalizedDensityWeights), "s r >31 >1? >1? >1?"},
+    {"ReflToDensity", call(ReflToDensity), "31 31? s i >1"},
+    {"ReflToReflDensity", call(ReflToReflDensity), "31 s r >1"},
+    {"CalculateSpectralDensity", call(CalculateSpectralDensity), "d"},
+    {"AdjustForPaperRefls", call(AdjustForPaperRefls), "31! 31! >31!"},
+    {"ReflToDensities", call(ReflToDensities), "31 31? s >9"},
+    {"ReflToDensitiesNoPaper", call(ReflToDensitiesNoPaper), "31 s >9"},
+    {"DetermineDensityResponse", call(DetermineDensityResponse), "31 s 31?"},
+    {"FindDensityMax", call(FindDensityMax), "9! >1! >1! i"},
+    {"FindDensityMin", call(FindDensityMin), "9! >1! >1! i"},
+    {"CalculateCCRDensities", call(CalculateCCRDensities), "31 31? s >9"},
+    {"SetHiFiConstants", call(SetHiFiConstants), "3! 7? 7? 7?"},
+    {"GetHiFiConstants", call(GetHiFiConstants), ">3? >7? >7? >7?"},
+    {"SetHexachromeConstants", call(SetHexachromeConstants), "2! 7? 7?"},
+    {"GetHexachromeConstants", call(GetHexachromeConstants), ">2? >7? >7?"},
+    {"CalculateSpectralXDensity", call(CalculateSpectralXDensity), "31 31? i >1? >1?"},
+    // densities and bands of the first three peaks
+    {"FindMaxDensityPoints",
+     call(+[](const double *refl, double *densities, int *bands, int *count) {
+         DENSITYPOINT points[VANTREL_BANDS] = {};
+         const int result =
+             FindMaxDensityPoints(refl, densities && bands ? points : nullptr, count);
+         for (int i = 0; result && i < 3; ++i) {
+             densities[i] = points[i].density;
+             bands[i] = points[i].band;
+         }
+         return result;
+     }),
+     "31 >3 >3 >1"},
+    // the bands of up to three peaks
+    {"ChooseBPWavelen", call(+[](const double *refl, const int *bands, int count) {
+         DENSITYPOINT points[3] = {};
+         for (int i = 0; bands && i < 3; ++i)
+             points[i].band = bands[i];
+         return ChooseBPWavelen(refl, bands ? points : nullptr, std::min(count, 3));
+     }),
+     "31 3 i"},
+    {"CalculateSpecialDensity", call(CalculateSpecialDensity), "31 i 5 i"},
+    {"SetSpectralXConstants", call(SetSpectralXConstants), "1! 1! 1! 1! 1!"},
+    {"GetSpectralXConstants", call(GetSpectralXConstants), ">1? >1? >1? >1? >1?"},
+    {"IsChromatic", call(IsChromatic), "31 i"},
+    {"IsChromaticLCH", call(IsChromaticLCH), "3"},
+    {"SetAChromaticConstants", call(SetAChromaticConstants), "1! 1! 1! 1!"},
+    {"GetAChromaticConstants", call(GetAChromaticConstants), ">1! >1! >1! >1!"},
     {"ReflToBrightness", call(ReflToBrightness), "31 >1"},
     {"Metamerism", call(Metamerism), "31 31 k k >1"},
     {"ReflToWhiteE313_98", call(ReflToWhiteE313_98), "31 k >1"},

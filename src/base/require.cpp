@@ -5,10 +5,9 @@
 
 namespace vantrel {
 
-int violated(const char *function, const char *file, const char *expression)
+void violated(const char *function, const char *file, const char *expression)
 {
     std::fprintf(stderr, "vantrel: %s (%s): violated: %s\n", function, file, expression);
-    return 0;
 }
 
 } // namespace vantrel

@@ -1,20 +1,25 @@
 #pragma once
 
-/// The argument check of the exported functions: a violated invariant makes the function return 0.
-/// Configured with VANTREL_CHECKED it is also reported on standard error, in one line with the
-/// function, its source file and the expression that names the invariant.
-#define VANTREL_REQUIRE(condition, expression)                                                     \
+/// The argument check of the exported functions: a violated invariant makes the function return 0,
+/// or the result that the second form names. Configured with VANTREL_CHECKED it is also reported on
+/// standard error, in one line with the function, its source file and the expression that names the
+/// invariant.
+#define VANTREL_REQUIRE(condition, expression) VANTREL_REQUIRE_ELSE(condition, expression, 0)
+
+#define VANTREL_REQUIRE_ELSE(condition, expression, result)                                        \
     do {                                                                                           \
-        if (!(condition))                                                                          \
-            return ::vantrel::violated(__func__, __FILE__, expression);                            \
+        if (!(condition)) {                                                                        \
+            ::vantrel::violated(__func__, __FILE__, expression);                                   \
+            return result;                                                                         \
+        }                                                                                          \
     } while (false)
 
 namespace vantrel {
 
 #ifdef VANTREL_CHECKED
-int violated(const char *function, const char *file, const char *expression);
+void violated(const char *function, const char *file, const char *expression);
 #else
-constexpr int violated(const char *, const char *, const char *) { return 0; }
+constexpr void violated(const char *, const char *, const char *) {}
 #endif
 
 } // namespace vantrel

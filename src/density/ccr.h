@@ -1,0 +1,10 @@
+#pragma once
+
+#include "density/densities.h"
+
+namespace vantrel {
+
+/// The corrected densities of CCR1_STATUS or CCR2_STATUS, less those of the paper.
+Densities ccr_densities(Spectrum refl, Paper paper, int status);
+
+} // namespace vantrel

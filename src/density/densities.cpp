@@ -1,0 +1,95 @@
+#include "density/densities.h"
+
+#include "colorimetry/lab.h"
+#include "density/achromatic.h"
+#include "density/ccr.h"
+#include "density/contrast.h"
+#include "density/den_weight.h"
+#include "density/density.h"
+#include "density/spectralx.h"
+
+#include <algorithm>
+
+namespace vantrel {
+namespace {
+
+/// Every second band from 420 nm.
+int darkest_wavelength(Spectrum refl)
+{
+    int darkest = 2;
+    double largest = 0;
+    for (int band = 2; band < kBands; band += 2) {
+        const double density = spectral_density(refl[band]);
+        if (density > largest) {
+            darkest = band;
+            largest = density;
+        }
+    }
+    return 400 + 10 * darkest;
+}
+
+int response_of(Spectrum refl, int status)
+{
+    if (status == SPECTRAL_STATUS)
+        return darkest_wavelength(refl);
+    const Lab lab = rounded(lab_from_spectrum(refl, D65_10DEG));
+    if (!is_chromatic(lab.L, chroma(lab)))
+        return VISUAL_RESPONSE;
+    if (status == SPECTRALX_STATUS)
+        return absorption_band(refl);
+    const auto set = densities(refl, std::nullopt, status);
+    if (!set)
+        return NUM_RESPONSES;
+    return largest(*set, true, VISUAL_RESPONSE).response;
+}
+
+} // namespace
+
+std::optional<Densities> densities(Spectrum refl, Paper paper, int status)
+{
+    if (!is_status(status))
+        return std::nullopt;
+    Densities set{};
+    switch (status) {
+    case CCR1_STATUS:
+    case CCR2_STATUS:
+        return ccr_densities(refl, paper, status);
+    case SPECTRAL_STATUS:
+    case SPECTRALX_STATUS: {
+        const int response =
+            status == SPECTRAL_STATUS ? density_response(refl, status, paper) : VISUAL_RESPONSE;
+        std::ranges::fill(set.density, *density(refl, paper, status, response));
+        return set;
+    }
+    default:
+        for (const int response : responses_of(status))
+            set.density[response] = weighted_density(refl, paper, status, response);
+        return set;
+    }
+}
+
+Extreme largest(const Densities &set, bool include_visual, int preset_response)
+{
+    Extreme result = {0, preset_response};
+    for (int r = include_visual ? VISUAL_RESPONSE : RED_RESPONSE; r < NUM_RESPONSES; ++r)
+        if (set.density[r] > result.density)
+            result = {set.density[r], r};
+    return result;
+}
+
+Extreme smallest(const Densities &set, bool include_visual, int preset_response)
+{
+    Extreme result = {100, preset_response};
+    for (int r = include_visual ? VISUAL_RESPONSE : RED_RESPONSE; r < NUM_RESPONSES; ++r)
+        if (set.density[r] != 0 && set.density[r] < result.density)
+            result = {set.density[r], r};
+    return result;
+}
+
+int density_response(Spectrum refl, int status, Paper paper)
+{
+    return paper ? response_of(adjusted_for_paper(refl, *paper), status)
+                 : response_of(refl, status);
+}
+
+} // namespace vantrel

@@ -1,0 +1,82 @@
+#include "density/density.h"
+
+#include "density/ccr.h"
+#include "density/den_weight.h"
+#include "density/spectralx.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace vantrel {
+namespace {
+
+// A weight row sums to 100 000 and a spectrum is in percent.
+constexpr double kToFactor = 1e-7;
+constexpr double kToPercent = 1e-5f;
+constexpr double kLeastFactor = 1e-5;
+constexpr double kLeastPercent = 0.0009999999310821295;
+static_assert(kToPercent == 9.999999747378752e-6);
+
+double density_of_sum(double sum) { return -std::log10(std::max(sum * kToFactor, kLeastFactor)); }
+
+double clamped(double density) { return std::clamp(density, 0.0, 5.0); }
+
+} // namespace
+
+double weighted_sum(Spectrum refl, int status, int response)
+{
+    const Weights weights = weights_of(status, response);
+    double sum = 0;
+    for (int i = 0; i < kBands; ++i)
+        sum += refl[i] * static_cast<double>(weights[i]);
+    return sum;
+}
+
+double weighted_reflectance(Spectrum refl, int status, int response)
+{
+    return std::max(weighted_sum(refl, status, response) * kToPercent, kLeastPercent);
+}
+
+double weighted_density(Spectrum refl, Paper paper, int status, int response)
+{
+    if (!paper)
+        return density_of_sum(weighted_sum(refl, status, response));
+    // Both sums in one pass: the additions of the one run in the shadow of the other.
+    const Weights weights = weights_of(status, response);
+    double sum = 0, paper_sum = 0;
+    for (int i = 0; i < kBands; ++i) {
+        const double weight = static_cast<double>(weights[i]);
+        sum += refl[i] * weight;
+        paper_sum += (*paper)[i] * weight;
+    }
+    return density_of_sum(sum) - density_of_sum(paper_sum);
+}
+
+double spectral_density(double refl) { return -std::log10(std::max(refl, 1e-5) / 100); }
+
+std::optional<double> density(Spectrum refl, Paper paper, int status, int response)
+{
+    switch (status) {
+    case SPECTRAL_STATUS:
+        // The wavelength is cut to its band toward 400 nm, from either side.
+        if (response < 391 || response > 709)
+            return std::nullopt;
+        return clamped(spectral_density(refl[(response - 400) / 10]));
+    case SPECTRALX_STATUS:
+        if (response < 0 || response >= kBands)
+            return std::nullopt;
+        if (response == VISUAL_RESPONSE)
+            return clamped(weighted_density(refl, paper, T_STATUS, VISUAL_RESPONSE));
+        return clamped(band_density(refl, paper, band_to_read(refl, response)));
+    case CCR2_STATUS:
+        if (response < 0 || response >= kBands)
+            return std::nullopt;
+        return is_response(response) ? ccr_densities(refl, paper, status).density[response] : 0;
+    default:
+        if (!is_status(status) || !is_response(response))
+            return std::nullopt;
+        return weighted_density(refl, paper, status, response);
+    }
+}
+
+} // namespace vantrel
