@@ -10,4 +10,7 @@ namespace vantrel {
 /// the paper is tripled, or doubled where it is more than 0.5.
 std::array<double, kBands> adjusted_for_paper(Spectrum refl, Spectrum paper);
 
+/// The same but for the last digits (1e-14 of a reflectance), in a fraction of the time.
+std::array<double, kBands> roughly_adjusted_for_paper(Spectrum refl, Spectrum paper);
+
 } // namespace vantrel

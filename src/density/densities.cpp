@@ -43,6 +43,27 @@ int response_of(Spectrum refl, int status)
     return largest(*set, true, VISUAL_RESPONSE).response;
 }
 
+/// The response of an ISO status, where a change in the last digits of the spectrum could not give
+/// another: the chroma keeps its distance from the achromatic line, and the largest density from
+/// the others.
+std::optional<int> firm_response(Spectrum refl, int status)
+{
+    constexpr double kChromaMargin = 0.02; // more than a rounding step of both a* and b*
+    constexpr double kDensityMargin = 1e-6;
+    const Lab lab = rounded(lab_from_spectrum(refl, D65_10DEG));
+    const double C = chroma(lab);
+    if (is_chromatic(lab.L, C - kChromaMargin) != is_chromatic(lab.L, C + kChromaMargin))
+        return std::nullopt;
+    if (!is_chromatic(lab.L, C))
+        return VISUAL_RESPONSE;
+    const Densities set = *densities(refl, std::nullopt, status);
+    const Extreme first = largest(set, true, VISUAL_RESPONSE);
+    for (int r = VISUAL_RESPONSE; r < NUM_RESPONSES; ++r)
+        if (r != first.response && set.density[r] > first.density - kDensityMargin)
+            return std::nullopt;
+    return first.response;
+}
+
 } // namespace
 
 std::optional<Densities> densities(Spectrum refl, Paper paper, int status)
@@ -88,8 +109,14 @@ Extreme smallest(const Densities &set, bool include_visual, int preset_response)
 
 int density_response(Spectrum refl, int status, Paper paper)
 {
-    return paper ? response_of(adjusted_for_paper(refl, *paper), status)
-                 : response_of(refl, status);
+    if (!paper)
+        return response_of(refl, status);
+    // Whatever the speed, the answer is that of the exact adjustment, even where the densities of
+    // two responses tie.
+    if (status <= T_STATUS)
+        if (const auto response = firm_response(roughly_adjusted_for_paper(refl, *paper), status))
+            return *response;
+    return response_of(adjusted_for_paper(refl, *paper), status);
 }
 
 } // namespace vantrel
