@@ -1,6 +1,5 @@
 #include "density/ccr.h"
 
-#include "base/numeric.h"
 #include "density/density.h"
 
 #include <algorithm>
@@ -37,7 +36,7 @@ double fade(double least)
     constexpr double kThreshold = 0.794328234;
     if (!(least < kThreshold))
         return 1;
-    return square(square(square(1 - (kThreshold - least) / kThreshold)));
+    return std::pow(1 - (kThreshold - least) / kThreshold, 8);
 }
 
 Rgb correction(const Rgb &refl, int status)
