@@ -545,6 +545,123 @@ VANTREL_API void GetAChromaticConstants(double *L1, double *L2, double *C1, doub
 
 /** @} */
 
+/** @name Print attributes
+ *  How a print shows its inks; what is computed from densities follows ANSI CGATS.4. The Refl…
+ *  functions measure every patch in one status and response with ReflToDensity(), over the paper
+ *  where there is one (null: absolute densities). Doubles are used as they are: a density, n-factor
+ *  or area without physical sense gives what IEEE arithmetic gives. A failure leaves every output
+ *  as it was.
+ *  @{ */
+
+/**
+ * Effective dot area of a halftone tint (Yule and Nielsen 1951; with n = 1 Murray and Davies 1936).
+ * @param[in]  solidDensity,tintDensity  densities of the solid and of the tint of the same ink
+ * @param[in]  nFactor                   n, any number but 0
+ * @param[out] dotArea                   percent, not clamped; 100 for a solid of density 0
+ * @return 1; 0 for a null pointer or an n-factor of 0.
+ */
+VANTREL_API int DensityToDotArea(double solidDensity, double tintDensity, double nFactor,
+                                 double *dotArea);
+
+/** The tint density of a dot area in percent, the inverse of DensityToDotArea() to seven digits. A
+ * dot area beyond what any density can have gives an infinite or not-a-number density and 1. */
+VANTREL_API int DensityFromDotArea(double solidDensity, double dotArea, double nFactor,
+                                   double *tintDensity);
+
+/**
+ * Dot area of a measured tint, as DensityToDotArea().
+ * @param[in]  solid,tint,paper  spectra, 31 values in percent; the paper may be null
+ * @param[in]  status,response   as ReflToDensity() takes them
+ * @param[in]  nFactor           n, any number but 0
+ * @param[out] dotArea           percent
+ * @return 1; 0 for another null pointer, an unknown status or response, or an n-factor of 0.
+ */
+VANTREL_API int ReflToDotArea(const double *solid, const double *tint, const double *paper,
+                              int status, int response, double nFactor, double *dotArea);
+
+/** Dot gain: how many percent the dot area of ReflToDotArea() has over the nominal one, at least 0.
+ * Fails like ReflToDotArea(). */
+VANTREL_API int ReflToDotGain(const double *solid, const double *tint, const double *paper,
+                              int status, int response, double nFactor, int nominalDotArea,
+                              double *dotGain);
+
+/** Print contrast 100 (Ds - Dt) / Ds in percent of a solid and a shadow tint; 0 for a null pointer
+ * or a solid density of 0. */
+VANTREL_API int DensityToPrintContrast(double solidDensity, double tintDensity, double *contrast);
+
+/** Print contrast of measured patches; 0 also for another null pointer, an unknown status or
+ * response. */
+VANTREL_API int ReflToPrintContrast(const double *solid, const double *tint, const double *paper,
+                                    int status, int response, double *contrast);
+
+/** Apparent trap 100 (Dop - D1) / D2 in percent (Preucil 1958): how much of the second-down ink an
+ * overprint has taken up; 0 for a null pointer or a second-down density of 0. */
+VANTREL_API int DensityToTrap(double overprintDensity, double secondDensity, double firstDensity,
+                              double *trap);
+
+/** Trap of measured patches: the second-down ink, the first-down ink, the overprint, in this order;
+ * 0 also for another null pointer, an unknown status or response. */
+VANTREL_API int ReflToTrap(const double *second, const double *first, const double *overprint,
+                           const double *paper, int status, int response, double *trap);
+
+/**
+ * Grayness 100 L / H and hue error 100 (M - L) / (H - L) of the GATF colour diagram, from the
+ * lowest, middle and highest of three densities. A density of exactly 0 is not taken as the lowest;
+ * H = 0 has grayness 100, and H = L has hue error 100.
+ * @param[in]  redDensity,greenDensity,blueDensity  densities
+ * @param[out] grayness,hueError                    percent, not clamped
+ * @return 1; 0 for a null pointer.
+ */
+VANTREL_API int DensityToHueGray(double redDensity, double greenDensity, double blueDensity,
+                                 double *grayness, double *hueError);
+
+/**
+ * Grayness and hue error of a measured ink. #HIFI_STATUS and #HEXACHROME_STATUS are measured as
+ * #E_STATUS.
+ * @param[in]  refl,paper         spectra, 31 values in percent; the paper may be null
+ * @param[in]  status             any but #SPECTRALX_STATUS
+ * @param[out] grayness,hueError  percent
+ * @return 1; 0 for another null pointer or status; 9 where ReflToDensities() fails.
+ */
+VANTREL_API int ReflToHueGray(const double *refl, const double *paper, int status, double *grayness,
+                              double *hueError);
+
+/**
+ * The reflectance in percent times bands, integrated under the response curve normalised to a peak
+ * of 1 (GetNormalizedDensityWeights() divided by 100), that has a density: 10^7 / (peak weight
+ * 10^D). Infinite for a response that the status does not have.
+ * @param[in]  density          above 0
+ * @param[in]  status,response  any status but #SPECTRALX_STATUS, any response but #VISUAL_RESPONSE
+ * @param[out] refl             integrated reflectance
+ * @return 1; 0 for a null pointer or an argument outside these ranges.
+ */
+VANTREL_API int DensitytoIntegratedRefl(double density, int status, int response, double *refl);
+
+/**
+ * How far a spectrum measured without a polarisation filter lies above three densities read through
+ * one, in hundredths of a percent of Status E reflectance: in the response that
+ * DetermineDensityResponse() gives, the mean of the three where that is #VISUAL_RESPONSE.
+ * @param[in]  refl                                 spectrum, 31 values in percent
+ * @param[in]  redDensity,greenDensity,blueDensity  densities
+ * @param[out] intercept                            hundredths of a percent
+ * @return 1; 0 for a null pointer.
+ */
+VANTREL_API int ReflToPolIntercept(const double *refl, double redDensity, double greenDensity,
+                                   double blueDensity, double *intercept);
+
+/**
+ * The spectrum of a sample printed at the density of a reference: K/S divided by DensityRatio() in
+ * every band (Kubelka and Munk 1931, opaque layer), as it is for a ratio of 0 or less.
+ * @param[in]  reference,sample  spectra, 31 values in percent
+ * @param[in]  status            density status
+ * @param[out] refl              31 values in percent
+ * @return 1. No pointer is checked: none may be null.
+ */
+VANTREL_API int ColorAtEquivalentDensity(const double *reference, const double *sample, int status,
+                                         double *refl);
+
+/** @} */
+
 /** @name Paper
  *  How white a substrate is, and how it holds its colour from light to light.
  *  @{ */
@@ -768,6 +885,21 @@ VANTREL_API void FindDensityMin(DENSITYSTRUCT *densities, double &density, int &
  */
 VANTREL_API double CalculateSpecialDensity(const double *refl, int centre, double *weights,
                                            int width);
+
+/** @} */
+
+/** @name Print attributes (C++)
+ *  @{ */
+
+/**
+ * The density of a sample in percent of that of a reference, both absolute and in the response that
+ * DetermineDensityResponse() gives for the reference.
+ * @param[in] reference,sample  spectra, 31 values in percent; not checked, neither may be null
+ * @param[in] status            density status
+ * @return the ratio, at most 1000. A density that cannot be measured counts as 0; over a reference
+ *         of density 0 the ratio is 1000 for a sample above 0 and otherwise 0.
+ */
+VANTREL_API double DensityRatio(const double *reference, const double *sample, int status);
 
 /** @} */
 

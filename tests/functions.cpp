@@ -143,6 +143,20 @@ const Row kRows[] = {
     {"EstimateTintColor", call(EstimateTintColor), "3 i 3 >3"},
     {"CalculateTintColor", call(CalculateTintColor), "31 31 i k >1"},
     {"ReflToABErrorWeights", call(ReflToABErrorWeights), "31 31 k >31? >31?"},
+    {"DensityToDotArea", call(DensityToDotArea), "d d d >1"},
+    {"DensityFromDotArea", call(DensityFromDotArea), "d d d >1"},
+    {"ReflToDotArea", call(ReflToDotArea), "31 31 31? s r d >1"},
+    {"ReflToDotGain", call(ReflToDotGain), "31 31 31? s r d i >1"},
+    {"DensityToPrintContrast", call(DensityToPrintContrast), "d d >1"},
+    {"ReflToPrintContrast", call(ReflToPrintContrast), "31 31 31? s r >1"},
+    {"DensityToTrap", call(DensityToTrap), "d d d >1"},
+    {"ReflToTrap", call(ReflToTrap), "31 31 31 31? s r >1"},
+    {"DensityToHueGray", call(DensityToHueGray), "d d d >1 >1"},
+    {"ReflToHueGray", call(ReflToHueGray), "31 31? s >1 >1"},
+    {"DensitytoIntegratedRefl", call(DensitytoIntegratedRefl), "d s r >1"},
+    {"ReflToPolIntercept", call(ReflToPolIntercept), "31 d d d >1"},
+    {"DensityRatio", call(DensityRatio), "31! 31! s"},
+    {"ColorAtEquivalentDensity", call(ColorAtEquivalentDensity), "31! 31! i >31!"},
 };
 
 } // namespace

@@ -57,4 +57,13 @@ template <class Record> void store(const Record &record, double *out)
     out[2] = third;
 }
 
+/// A result that there may not be; 1 where there is one.
+inline int store(const std::optional<double> &result, double *out)
+{
+    if (!result)
+        return 0;
+    *out = *result;
+    return 1;
+}
+
 } // namespace vantrel

@@ -1,0 +1,33 @@
+#include "print/density_ratio.h"
+
+#include "base/numeric.h"
+#include "density/densities.h"
+#include "density/density.h"
+
+#include <cmath>
+
+namespace vantrel {
+
+static constexpr double kLargestRatio = 1000;
+
+double density_ratio(Spectrum reference, Spectrum sample, int status)
+{
+    const int response = density_response(reference, status, std::nullopt);
+    const double Dref = density(reference, std::nullopt, status, response).value_or(0);
+    const double Dsmp = density(sample, std::nullopt, status, response).value_or(0);
+    if (Dref == 0)
+        return Dsmp > 0 ? kLargestRatio : 0;
+    const double ratio = 100 * (Dsmp / Dref);
+    return ratio > kLargestRatio ? kLargestRatio : ratio;
+}
+
+double at_equivalent_density(double refl, double ratio)
+{
+    if (ratio <= 0)
+        return refl;
+    const double R = refl / 100;
+    const double ks = R == 0 ? 1000 : square(1 - R) / (2 * R) * 100 / ratio;
+    return 100 * (1 + ks - std::sqrt(square(ks) + 2 * ks));
+}
+
+} // namespace vantrel
