@@ -28,6 +28,33 @@ int darkest_wavelength(Spectrum refl)
     return 400 + 10 * darkest;
 }
 
+double hue_error(Spectrum refl, int status)
+{
+    double grayness = 0, error = 0;
+    ReflToHueGray(refl.data(), nullptr, status, &grayness, &error);
+    return error;
+}
+
+/// The third HiFi ink and cyan are both darkest in the red; the hue error tells them apart.
+int hifi_response(Spectrum refl, int response)
+{
+    if (response == HIFI3_RESPONSE || response == RED_RESPONSE)
+        return hue_error(refl, HIFI_STATUS) > 39.5 ? HIFI3_RESPONSE : RED_RESPONSE;
+    return response;
+}
+
+/// The hue error tells the Hexachrome inks from yellow, and their hue one from the other.
+int hexachrome_response(Spectrum refl, const Lab &lab, int response)
+{
+    if (response == HEXACHROME1_RESPONSE || response == BLUE_RESPONSE)
+        response = hue_error(refl, HEXACHROME_STATUS) > 30 ? HEXACHROME1_RESPONSE : BLUE_RESPONSE;
+    if (response == HEXACHROME1_RESPONSE || response == HEXACHROME2_RESPONSE) {
+        const double hue = lch_from_lab(lab).h;
+        response = 90 < hue && hue < 270 ? HEXACHROME2_RESPONSE : HEXACHROME1_RESPONSE;
+    }
+    return response;
+}
+
 int response_of(Spectrum refl, int status)
 {
     if (status == SPECTRAL_STATUS)
@@ -40,7 +67,15 @@ int response_of(Spectrum refl, int status)
     const auto set = densities(refl, std::nullopt, status);
     if (!set)
         return NUM_RESPONSES;
-    return largest(*set, true, VISUAL_RESPONSE).response;
+    const int response = largest(*set, true, VISUAL_RESPONSE).response;
+    switch (status) {
+    case HIFI_STATUS:
+        return hifi_response(refl, response);
+    case HEXACHROME_STATUS:
+        return hexachrome_response(refl, lab, response);
+    default:
+        return response;
+    }
 }
 
 /// The response of an ISO status, where a change in the last digits of the spectrum could not give
