@@ -124,6 +124,14 @@ typedef struct DENSITYSTRUCT {
     double density[NUM_RESPONSES];
 } DENSITYSTRUCT;
 
+/** The channels of a polarisation adjustment: four weighting curves of 31 values, one per band. */
+typedef struct POLWEIGHTSTRUCT {
+    const double *RedWeights;   /**< #RED_RESPONSE */
+    const double *GreenWeights; /**< #GREEN_RESPONSE */
+    const double *BlueWeights;  /**< #BLUE_RESPONSE, first curve */
+    const double *BlueWeights2; /**< #BLUE_RESPONSE, second curve */
+} POLWEIGHTSTRUCT;
+
 /** An absorption peak of a spectrum. */
 typedef struct DENSITYPOINT {
     double density; /**< density of the five-band window at the band */
@@ -659,6 +667,100 @@ VANTREL_API int ReflToPolIntercept(const double *refl, double redDensity, double
  */
 VANTREL_API int ColorAtEquivalentDensity(const double *reference, const double *sample, int status,
                                          double *refl);
+
+/** @} */
+
+/** @name Readings through a polarisation filter
+ *  A polarisation filter takes away the light that the surface of an ink film reflects. The reading
+ *  is emulated: a spectrum is scaled by one factor, a target reading of a channel over the reading
+ *  that the spectrum has. Every spectrum comes with four targets, in the order of the members of
+ *  POLWEIGHTSTRUCT and in the units of Σ weight · reflectance; #VISUAL_RESPONSE takes the mean of
+ *  all four factors, #BLUE_RESPONSE that of its two, a HiFi or Hexachrome response 1. A reading of
+ *  0 counts as a factor of 1, and so does a mean of 0. A mean above 1 is a failure: a filter adds
+ *  no light.
+ *
+ *  Spectra, targets and weights (with all four curves) are the caller's duty: null is only checked
+ *  where stated, and allowed only for a paper spectrum, whose targets are then not read.
+ *  @{ */
+
+/**
+ * The spectrum as the channel of a response adjusts it.
+ * @param[in]  refl      spectrum, 31 values in percent
+ * @param[in]  response  any value
+ * @param[in]  targets   4 values
+ * @param[out] adjusted  31 values in percent; may be `refl`
+ * @param[in]  weights   the channels
+ * @return 1; 0 with nothing written for a mean factor above 1.
+ */
+VANTREL_API int PolReflAdjust(const double *refl, int response, const double *targets,
+                              double *adjusted, const POLWEIGHTSTRUCT *weights);
+
+/** PolReflAdjust() in the response that DetermineDensityResponse() gives under #E_STATUS. */
+VANTREL_API int PolReflAutoAdjust(const double *refl, const double *targets, double *adjusted,
+                                  const POLWEIGHTSTRUCT *weights);
+
+/** DetermineDensityResponse() of the spectrum over the paper, each after PolReflAutoAdjust(); 0,
+ * which is also #VISUAL_RESPONSE, where one of them fails and for an unknown status. */
+VANTREL_API int PolDetermineDensityResponse(const double *refl, const double *targets, int status,
+                                            const double *paper, const double *paperTargets,
+                                            const POLWEIGHTSTRUCT *weights);
+
+/** ReflToDensity() of the spectrum over the paper, each after PolReflAutoAdjust(); fails with them,
+ * the density as it was. */
+VANTREL_API int PolReflToDensity(const double *refl, const double *targets, const double *paper,
+                                 const double *paperTargets, const POLWEIGHTSTRUCT *weights,
+                                 int status, int response, double *density);
+
+/**
+ * ReflToDensities() with the spectrum adjusted for each response on its own: the visual, red, green
+ * and blue ones in themselves, HIFI1 in green, HIFI2, HIFI3 and HEXACHROME2 in red, HEXACHROME1 in
+ * blue. #SPECTRAL_STATUS and #SPECTRALX_STATUS use PolReflAutoAdjust(), as the paper does.
+ * #CCR1_STATUS has the uncorrected densities of ReflToDensity().
+ * @return 1; 0 for a null spectrum or set or an unknown status; 0 with nine densities of 0 where an
+ *         adjustment fails.
+ */
+VANTREL_API int PolReflToDensities(const double *refl, const double *targets, const double *paper,
+                                   const double *paperTargets, const POLWEIGHTSTRUCT *weights,
+                                   int status, DENSITYSTRUCT *densities);
+
+/**
+ * Grayness and hue error (ReflToHueGray()) of PolReflToDensities() over a paper that is adjusted
+ * before it is handed there. The factor of the paper's second adjustment may exceed 1 by 1e-12.
+ * @return 1; 0 for a null spectrum or output, an unknown status, #SPECTRALX_STATUS, or where the
+ *         paper cannot be adjusted; 9 where the density set cannot be computed.
+ */
+VANTREL_API int PolReflToHueGray(const double *refl, const double *targets, const double *paper,
+                                 const double *paperTargets, const POLWEIGHTSTRUCT *weights,
+                                 int status, double *grayness, double *hueError);
+
+/** ReflToDotArea() of the spectra, each after PolReflAutoAdjust(); fails with them, nothing is
+ * written. */
+VANTREL_API int PolReflToDotArea(const double *solid, const double *solidTargets,
+                                 const double *tint, const double *tintTargets, const double *paper,
+                                 const double *paperTargets, const POLWEIGHTSTRUCT *weights,
+                                 int status, int response, double nFactor, double *dotArea);
+
+/** ReflToDotGain() in the same way. */
+VANTREL_API int PolReflToDotGain(const double *solid, const double *solidTargets,
+                                 const double *tint, const double *tintTargets, const double *paper,
+                                 const double *paperTargets, const POLWEIGHTSTRUCT *weights,
+                                 int status, int response, double nFactor, int nominalDotArea,
+                                 double *dotGain);
+
+/** ReflToPrintContrast() in the same way. */
+VANTREL_API int PolReflToPrintContrast(const double *solid, const double *solidTargets,
+                                       const double *tint, const double *tintTargets,
+                                       const double *paper, const double *paperTargets,
+                                       const POLWEIGHTSTRUCT *weights, int status, int response,
+                                       double *contrast);
+
+/** ReflToTrap() in the same way: the second-down ink, the first-down ink, the overprint. */
+VANTREL_API int PolReflToTrap(const double *second, const double *secondTargets,
+                              const double *first, const double *firstTargets,
+                              const double *overprint, const double *overprintTargets,
+                              const double *paper, const double *paperTargets,
+                              const POLWEIGHTSTRUCT *weights, int status, int response,
+                              double *trap);
 
 /** @} */
 

@@ -157,6 +157,16 @@ const Row kRows[] = {
     {"ReflToPolIntercept", call(ReflToPolIntercept), "31 d d d >1"},
     {"DensityRatio", call(DensityRatio), "31! 31! s"},
     {"ColorAtEquivalentDensity", call(ColorAtEquivalentDensity), "31! 31! i >31!"},
+    {"PolReflAdjust", call(PolReflAdjust), "31! i 4! >31! 124!"},
+    {"PolReflAutoAdjust", call(PolReflAutoAdjust), "31! 4! >31! 124!"},
+    {"PolDetermineDensityResponse", call(PolDetermineDensityResponse), "31! 4! s 31? 4! 124!"},
+    {"PolReflToDensity", call(PolReflToDensity), "31! 4! 31? 4! 124! s r >1"},
+    {"PolReflToDensities", call(PolReflToDensities), "31 4! 31? 4! 124! s >9"},
+    {"PolReflToHueGray", call(PolReflToHueGray), "31 4! 31? 4! 124! s >1 >1"},
+    {"PolReflToDotArea", call(PolReflToDotArea), "31! 4! 31! 4! 31? 4! 124! s r d >1"},
+    {"PolReflToDotGain", call(PolReflToDotGain), "31! 4! 31! 4! 31? 4! 124! s r d i >1"},
+    {"PolReflToPrintContrast", call(PolReflToPrintContrast), "31! 4! 31! 4! 31? 4! 124! s r >1"},
+    {"PolReflToTrap", call(PolReflToTrap), "31! 4! 31! 4! 31! 4! 31? 4! 124! s r >1"},
 };
 
 } // namespace

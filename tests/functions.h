@@ -106,6 +106,17 @@ template <class P> struct Parameter {
     }
 };
 
+/// The four curves of 31 weights, one after the other.
+template <> struct Parameter<const POLWEIGHTSTRUCT *> {
+    static const POLWEIGHTSTRUCT *pass(Slot &slot)
+    {
+        const double *curve = slot.values.data();
+        slot.memory.resize(sizeof(POLWEIGHTSTRUCT));
+        return new (slot.memory.data()) POLWEIGHTSTRUCT{curve, curve + 31, curve + 62, curve + 93};
+    }
+    static void take_back(Slot &) {}
+};
+
 template <class R, class... P> std::function<double(std::vector<Slot> &)> call(R (*function)(P...))
 {
     return [function](std::vector<Slot> &slots) {
