@@ -1,0 +1,41 @@
+#include "file.h"
+
+#include <cerrno>
+#include <cstdio>
+#include <cstring>
+#include <memory>
+
+#include "measurement.h"
+
+namespace {
+
+constexpr std::size_t largest_file = 64u << 20;
+
+struct Close {
+    void operator()(std::FILE *file) const { static_cast<void>(std::fclose(file)); }
+};
+
+} // namespace
+
+std::string read_file(const std::string &path)
+{
+    const std::unique_ptr<std::FILE, Close> file(std::fopen(path.c_str(), "rb"));
+    if (!file)
+        throw InputError{0, std::strerror(errno)};
+    std::string text;
+    char block[1 << 16];
+    while (const std::size_t got = std::fread(block, 1, sizeof block, file.get())) {
+        text.append(block, got);
+        if (text.size() > largest_file)
+            throw InputError{0, "larger than 64 MiB"};
+    }
+    if (std::ferror(file.get()))
+        throw InputError{0, std::strerror(errno)};
+    return text;
+}
+
+std::string write_output(std::string_view text)
+{
+    const bool written = std::fwrite(text.data(), 1, text.size(), stdout) == text.size();
+    return written && std::fflush(stdout) == 0 ? "" : std::strerror(errno);
+}

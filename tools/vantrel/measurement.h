@@ -1,0 +1,42 @@
+// What a measurement file holds, whatever its format.
+#ifndef VANTREL_TOOL_MEASUREMENT_H
+#define VANTREL_TOOL_MEASUREMENT_H
+
+#include <array>
+#include <cstddef>
+#include <string>
+#include <utility>
+#include <vector>
+
+#include <vantrel.h>
+
+using Spectrum = std::array<double, VANTREL_BANDS>; // 400, 410, … 700 nm in percent
+
+struct Patch {
+    std::string id;
+    std::string name;
+    Spectrum refl{};
+    std::vector<std::pair<std::string, double>> device; // CMYK_M, … in percent, by field name
+};
+
+// What the spectra looked like in the file.
+struct Source {
+    double first_nm = 0;
+    double last_nm = 0;
+    std::size_t bands = 0;
+    bool scaled = false; // not in percent there
+};
+
+struct Measurement {
+    std::vector<Patch> patches; // at least one
+    Source source;
+    std::vector<std::string> warnings; // one line each, without the file name
+};
+
+// A file that cannot be read: the reason, and the line where one can be named (otherwise 0).
+struct InputError {
+    std::size_t line;
+    std::string reason;
+};
+
+#endif

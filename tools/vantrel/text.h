@@ -1,0 +1,27 @@
+// Small helpers on text.
+#ifndef VANTREL_TOOL_TEXT_H
+#define VANTREL_TOOL_TEXT_H
+
+#include <cstddef>
+#include <optional>
+#include <string>
+#include <string_view>
+
+std::string upper(std::string_view text); // ASCII letters only
+bool equal_ignoring_case(std::string_view first, std::string_view second);
+std::string_view trimmed(std::string_view text); // without spaces and tabs at both ends
+
+// A finite decimal number that fills the text; a comma is a decimal point where there is none.
+std::optional<double> number_in(std::string_view text);
+
+// Text of any origin as UTF-8 that is safe to print: bytes that are not UTF-8 are taken as Latin-1,
+// a tab becomes a space, other control characters and those of text direction become U+FFFD.
+std::string printable(std::string_view text);
+
+// UTF-8 text cut to a number of characters, with an ellipsis after the cut.
+std::string cut(const std::string &text, std::size_t most);
+
+// printable(), in quotes and cut to a length that fits a message.
+std::string in_quotes(std::string_view text);
+
+#endif
