@@ -32,17 +32,17 @@ double roughly_adjusted(double refl, double paper)
 
 } // namespace
 
-std::array<double, kBands> adjusted_for_paper(Spectrum refl, Spectrum paper)
+Bands adjusted_for_paper(Spectrum refl, Spectrum paper)
 {
-    std::array<double, kBands> result;
+    Bands result;
     for (int i = 0; i < kBands; ++i)
         result[i] = adjusted(refl[i], paper[i]);
     return result;
 }
 
-std::array<double, kBands> roughly_adjusted_for_paper(Spectrum refl, Spectrum paper)
+Bands roughly_adjusted_for_paper(Spectrum refl, Spectrum paper)
 {
-    std::array<double, kBands> result;
+    Bands result;
     for (int i = 0; i < kBands; ++i)
         result[i] = roughly_adjusted(refl[i], paper[i]);
     return result;

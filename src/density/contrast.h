@@ -2,15 +2,13 @@
 
 #include "base/spectrum.h"
 
-#include <array>
-
 namespace vantrel {
 
 /// The spectrum with its contrast against the paper exaggerated: in every band the density above
 /// the paper is tripled, or doubled where it is more than 0.5.
-std::array<double, kBands> adjusted_for_paper(Spectrum refl, Spectrum paper);
+Bands adjusted_for_paper(Spectrum refl, Spectrum paper);
 
 /// The same but for the last digits (1e-14 of a reflectance), in a fraction of the time.
-std::array<double, kBands> roughly_adjusted_for_paper(Spectrum refl, Spectrum paper);
+Bands roughly_adjusted_for_paper(Spectrum refl, Spectrum paper);
 
 } // namespace vantrel

@@ -98,9 +98,9 @@ static_assert(std::ranges::all_of(kStatusResponses, well_formed));
 
 const StatusResponses &responses_of(int status) { return kStatusResponses[status]; }
 
-std::array<double, kBands> normalized(Weights weights, std::int64_t peak_weight)
+Bands normalized(Weights weights, std::int64_t peak_weight)
 {
-    std::array<double, kBands> result;
+    Bands result;
     for (int i = 0; i < kBands; ++i)
         result[i] = static_cast<double>(weights[i]) / static_cast<double>(peak_weight) * 100;
     return result;

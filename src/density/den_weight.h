@@ -2,7 +2,6 @@
 
 #include "base/spectrum.h"
 
-#include <array>
 #include <cstdint>
 
 namespace vantrel {
@@ -50,6 +49,6 @@ constexpr Profile profile(Weights weights)
 }
 
 /// The row scaled to 100 at its largest weight.
-std::array<double, kBands> normalized(Weights weights, std::int64_t peak_weight);
+Bands normalized(Weights weights, std::int64_t peak_weight);
 
 } // namespace vantrel

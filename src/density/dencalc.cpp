@@ -37,7 +37,7 @@ int GetNormalizedDensityWeights(int status, int response, double *weights, doubl
         return 0;
     if (peak)
         *peak = found.peak;
-    std::ranges::copy(normalized(row, found.peak_weight), weights);
+    store(normalized(row, found.peak_weight), weights);
     return 1;
 }
 
@@ -63,7 +63,7 @@ double CalculateSpectralDensity(double refl) { return spectral_density(refl); }
 
 void AdjustForPaperRefls(const double *refl, const double *paper, double *adjusted)
 {
-    std::ranges::copy(adjusted_for_paper(spectrum(refl), spectrum(paper)), adjusted);
+    store(adjusted_for_paper(spectrum(refl), spectrum(paper)), adjusted);
 }
 
 int ReflToDensities(const double *refl, const double *paper, int status, DENSITYSTRUCT *densities)
