@@ -113,9 +113,11 @@ using namespace vantrel;
 // State: its default values are the rows above. The setters of the HiFi and Hexachrome bands, or
 // the host, change it.
 // clang-format off
-#define WEIGHTS(r) {r[0], r[1], r[2], r[3], r[4], r[5], r[6], r[7], r[8], r[9], r[10], \
-    r[11], r[12], r[13], r[14], r[15], r[16], r[17], r[18], r[19], r[20], \
-    r[21], r[22], r[23], r[24], r[25], r[26], r[27], r[28], r[29], r[30]}
+#define WEIGHTS(r) { \
+    (r)[0], (r)[1], (r)[2], (r)[3], (r)[4], (r)[5], (r)[6], (r)[7], \
+    (r)[8], (r)[9], (r)[10], (r)[11], (r)[12], (r)[13], (r)[14], (r)[15], \
+    (r)[16], (r)[17], (r)[18], (r)[19], (r)[20], (r)[21], (r)[22], (r)[23], \
+    (r)[24], (r)[25], (r)[26], (r)[27], (r)[28], (r)[29], (r)[30]}
 
 constinit std::int64_t den_weight[NUM_STATUSES][NUM_RESPONSES][kBands] = {
     /* A */          {WEIGHTS(kVisual), WEIGHTS(kARed), WEIGHTS(kAGreen), WEIGHTS(kABlue)},
