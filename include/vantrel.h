@@ -92,10 +92,10 @@ typedef struct CIELCHCOORD {
 
 /** Density status: a family of filters. ISO 5-3 Statuses A, E, I and T, and six more. */
 enum {
-    A_STATUS = 0,
-    E_STATUS = 1,
-    I_STATUS = 2,
-    T_STATUS = 3,
+    A_STATUS = 0,          /**< medium bands at 620, 530 and 440 nm */
+    E_STATUS = 1,          /**< wide bands at 600, 530 and 440 nm */
+    I_STATUS = 2,          /**< narrow bands at 625, 535 and 430 nm */
+    T_STATUS = 3,          /**< Status E with a wider blue at 460 nm */
     SPECTRAL_STATUS = 4,   /**< one wavelength; the response is that wavelength in nm */
     SPECTRALX_STATUS = 5,  /**< a five-band window where the ink absorbs; the response is a band */
     HIFI_STATUS = 6,       /**< Status E and three settable bands */
@@ -107,21 +107,21 @@ enum {
 
 /** Density response: one filter of a status, and the index of its density in a set. */
 enum {
-    VISUAL_RESPONSE = 0,
-    RED_RESPONSE = 1,   /**< reads cyan ink */
-    GREEN_RESPONSE = 2, /**< reads magenta ink */
-    BLUE_RESPONSE = 3,  /**< reads yellow ink */
-    HIFI1_RESPONSE = 4, /**< settable, see SetHiFiConstants() */
-    HIFI2_RESPONSE = 5,
-    HIFI3_RESPONSE = 6,
+    VISUAL_RESPONSE = 0,      /**< reads black and neutrals */
+    RED_RESPONSE = 1,         /**< reads cyan ink */
+    GREEN_RESPONSE = 2,       /**< reads magenta ink */
+    BLUE_RESPONSE = 3,        /**< reads yellow ink */
+    HIFI1_RESPONSE = 4,       /**< settable, see SetHiFiConstants() */
+    HIFI2_RESPONSE = 5,       /**< settable */
+    HIFI3_RESPONSE = 6,       /**< settable */
     HEXACHROME1_RESPONSE = 7, /**< settable, see SetHexachromeConstants() */
-    HEXACHROME2_RESPONSE = 8,
-    NUM_RESPONSES = 9 /**< how many there are; as an answer: none could be found */
+    HEXACHROME2_RESPONSE = 8, /**< settable */
+    NUM_RESPONSES = 9         /**< how many there are; as an answer: none could be found */
 };
 
 /** A density set: one density for each response, 0 where the status does not have it. */
 typedef struct DENSITYSTRUCT {
-    double density[NUM_RESPONSES];
+    double density[NUM_RESPONSES]; /**< in the order of the responses */
 } DENSITYSTRUCT;
 
 /** The channels of a polarisation adjustment: four weighting curves of 31 values, one per band. */
