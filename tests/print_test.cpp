@@ -54,6 +54,11 @@ double density(const Refl &refl, const Refl *paper, int status, int response)
     return result;
 }
 
+struct HueGray {
+    double grayness, hue_error;
+    bool operator==(const HueGray &) const = default;
+};
+
 /// What a function of one result returned and wrote.
 struct Outcome {
     int returned;
@@ -141,10 +146,10 @@ TEST(PolIntercept, IsZeroForTheSpectrumsOwnDensities)
 namespace {
 
 // Box-shaped curves, so that readings are plain sums.
-const double *curve(int channel)
+const double *curve(std::size_t channel)
 {
     static const std::vector<double> curves = golden_values("pol_weights");
-    return &curves[31 * channel];
+    return &curves[VANTREL_BANDS * channel];
 }
 
 const POLWEIGHTSTRUCT *weights()
@@ -267,9 +272,9 @@ TEST(PolReflToHueGray, TakesRoundingNoiseForOne)
     std::uniform_real_distribution<double> factor(0.5, 0.99), band(-1, 1);
     const Patch solid(print().magenta, {0.9, 0.8, 0.7, 0.6});
     const auto hue_gray = [&](const Refl &paper, const Targets &targets) {
-        std::array<double, 2> result = {};
+        HueGray result = {};
         EXPECT_EQ(PolReflToHueGray(solid.r(), solid.t(), paper.data(), targets.data(), weights(),
-                                   E_STATUS, &result[0], &result[1]),
+                                   E_STATUS, &result.grayness, &result.hue_error),
                   1);
         return result;
     };

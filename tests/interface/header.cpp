@@ -13,5 +13,5 @@ int main()
     return !(CalcLabch(grey, D50_2DEG, labch) == 1 && CalcLabch(grey, none, labch) == 0 &&
              CIELabToCIELCh(&lab, &lch, true) &&
              CIEDE2000().Calculate(lab, lab, 1.0, 1.0, 1.0) == 0.0 &&
-             Saunderson(100.0, 0.0, 0.6) == 100.0);
+             DensityRatio(grey, grey, E_STATUS) == 100.0 && Saunderson(100.0, 0.0, 0.6) == 100.0);
 }
