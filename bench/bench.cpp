@@ -6,11 +6,11 @@
 
 namespace {
 
-struct Row {
-    std::string name, rival;
+struct Ratio {
+    std::string ours, theirs;
     double goal;
 };
-std::vector<Row> rows;
+std::vector<Ratio> ratios;
 
 /// Prints as the console does and keeps the median of each benchmark for the ratios.
 class Reporter : public benchmark::ConsoleReporter {
@@ -25,11 +25,18 @@ public:
     std::map<std::string, double> median;
 };
 
+/// The rival of a row, or a row itself.
+std::string label(const std::string &name)
+{
+    const std::size_t colon = name.find(": ");
+    return colon == std::string::npos ? name : name.substr(colon + 2);
+}
+
 } // namespace
 
-void add_row(const std::string &row, const std::string &rival, double goal)
+void add_ratio(const std::string &ours, const std::string &theirs, double goal)
 {
-    rows.push_back({row, rival, goal});
+    ratios.push_back({ours, theirs, goal});
 }
 
 int main(int argc, char **argv)
@@ -46,17 +53,20 @@ int main(int argc, char **argv)
         return 2;
 
     colour_rows();
+    density_rows();
     Reporter reporter;
     benchmark::RunSpecifiedBenchmarks(&reporter);
 
-    std::printf("\n%-26s %-22s %9s %9s %7s %6s\n", "row", "rival", "vantrel", "rival", "ratio",
-                "goal");
-    for (const Row &row : rows) {
-        const double ours = reporter.median[row.name + "/vantrel"];
-        const double theirs = reporter.median[row.name + "/" + row.rival];
-        if (ours > 0 && theirs > 0)
-            std::printf("%-26s %-22s %6.1f ns %6.1f ns %7.2f %6.2f%s\n", row.name.c_str(),
-                        row.rival.c_str(), ours, theirs, ours / theirs, row.goal,
-                        ours / theirs > row.goal ? "  missed" : "");
+    std::printf("\n%-26s %9s   %-28s %9s %7s %6s\n", "vantrel", "", "beside", "", "ratio", "goal");
+    for (const auto &[ours, theirs, goal] : ratios) {
+        const double mine = reporter.median[ours], beside = reporter.median[theirs];
+        if (mine <= 0 || beside <= 0)
+            continue; // left out by a filter
+        const double ratio = mine / beside;
+        std::printf("%-26s %6.1f ns   %-28s %6.1f ns %7.2f", ours.c_str(), mine,
+                    label(theirs).c_str(), beside, ratio);
+        if (goal > 0)
+            std::printf(" %6.2f%s", goal, ratio > goal ? "  missed" : "");
+        std::printf("\n");
     }
 }

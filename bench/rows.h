@@ -15,16 +15,19 @@ template <class Work> void measure(const std::string &name, Work work)
     });
 }
 
-void add_row(const std::string &row, const std::string &rival, double goal);
+/// The run ends with the ratio of the first benchmark to the second, beside the goal where there is
+/// one.
+void add_ratio(const std::string &ours, const std::string &theirs, double goal = 0);
 
-/// A row with a rival; the run ends with the ratio of the two beside the goal.
+/// A row with a rival.
 template <class Ours, class Theirs>
 void compare(const std::string &row, double goal, Ours ours, const std::string &rival,
              Theirs theirs)
 {
-    add_row(row, rival, goal);
-    measure(row + "/vantrel", ours);
-    measure(row + "/" + rival, theirs);
+    measure(row, ours);
+    measure(row + ": " + rival, theirs);
+    add_ratio(row, row + ": " + rival, goal);
 }
 
 void colour_rows();
+void density_rows();
