@@ -44,12 +44,13 @@
 
 /**
  * Illuminant and observer: a CIE illuminant with the 1931 2-degree or the 1964 10-degree standard
- * observer. F12 is a three-narrow-band lamp of 3000 K.
+ * observer. F12 is a three-narrow-band lamp of 3000 K. Passed as a signed int in C and C++.
  */
 #ifdef __cplusplus
 enum ILLUM_OBS : int {
 #else
-typedef enum ILLUM_OBS {
+typedef int ILLUM_OBS;
+enum ILLUM_OBS {
 #endif
     A_2DEG = 0,
     A_10DEG = 1,
@@ -70,11 +71,7 @@ typedef enum ILLUM_OBS {
     D75_2DEG = 16,
     D75_10DEG = 17,
     NUM_ILLUM_OBS = 18 /**< how many there are; not a combination itself */
-#ifdef __cplusplus
 };
-#else
-} ILLUM_OBS;
-#endif
 
 /** CIE 1976 L\*a\*b\*; interchangeable with an array of three doubles. */
 typedef struct CIELABCOORD {
@@ -196,7 +193,9 @@ VANTREL_API int XYZToCIELCH(const double *xyz, ILLUM_OBS illumObs, double *lch);
 /** L\*C\*h of L\*a\*b\* (three doubles each), rounded as described above; 0 for a null pointer. */
 VANTREL_API int CIELabToCIELCH(const double *lab, double *lch);
 
-/** L\*C\*h of L\*a\*b\*; a\* and b\* are rounded to two decimals when `round` is not 0. */
+/** L\*C\*h of L\*a\*b\*; a\* and b\* are rounded to two decimals when `round` is not 0, and an a\*
+ * of 0 counts as 0.000001 either way. Without rounding, a hue a hair below 0 comes out as 360. 0
+ * for a null pointer. */
 VANTREL_API int CIELabToCIELChEx(const double *lab, double *lch, int round);
 
 /** L\*a\*b\* of L\*C\*h (three doubles each), without rounding; 0 for a null pointer. */
@@ -239,7 +238,7 @@ VANTREL_API int XYZToCIEYxy(const double *xyz, ILLUM_OBS illumObs, double *Yxy);
 VANTREL_API int XYZToxyz(const double *xyz, double *x, double *y, double *z);
 
 /**
- * Hunter L, a, b of a spectrum, with the Ka and Kb of the combination (ASTM E308).
+ * Hunter L, a, b of a spectrum, with the Ka and Kb of the combination.
  * @param[in]  refl      spectrum, 31 values in percent
  * @param[in]  illumObs  illuminant and observer
  * @param[out] hunter    L, a, b; zeros where only Y is 0
@@ -249,7 +248,7 @@ VANTREL_API int ReflToHunterLAB(const double *refl, ILLUM_OBS illumObs, double *
 
 /**
  * XYZ of L\*a\*b\*: the inverse of XYZToCIELab(), with the ratios X/Xn, Y/Yn, Z/Zn rounded to six
- * decimals; a round trip therefore agrees to about 0.0001, not to the last bit.
+ * decimals; a round trip therefore agrees to about 0.001, in dark colours to 0.004.
  * @return 1; 0 for a null pointer or an unknown combination.
  */
 VANTREL_API int LabToXYZ(const double *lab, ILLUM_OBS illumObs, double *xyz);
@@ -270,7 +269,7 @@ VANTREL_API int XYZtoRGB(const double *xyz, unsigned int *rgb);
 /** @} */
 
 /** @name Colour differences
- *  Each writes one double through its last parameter and returns 1; a null pointer or an unknown
+ *  Each writes its result through its last parameters and returns 1; a null pointer or an unknown
  *  combination returns 0 with the result as it was. Zero weights are not refused unless stated: the
  *  division gives what IEEE arithmetic gives.
  *  @{ */
@@ -815,14 +814,16 @@ VANTREL_API int CIEYxyToWhiteE313_98(const double *Yxy, ILLUM_OBS illumObs, doub
 /**
  * Spectrum of two inks over one another: in each band the density of the denser ink and, where the
  * other one is above 0.6, a share of its density that is 0.5 in the band where it is largest. The
- * inks commute. A band in which either reading is below 0 or not a number is not a number.
+ * inks commute. A reading of exactly 0 has density 999 (where both inks have one, that band scales
+ * the shares of all others); a band in which a reading is below 0 or not a number is not a number.
  * @param[in]  first,second  spectra of the solids, 31 values in percent
  * @param[out] refl          spectrum of the overprint
  * @return 1; 0 for a null pointer.
  */
 VANTREL_API int CombineInkColors(const double *first, const double *second, double *refl);
 
-/** Spectrum of three inks: the first two as CombineInkColors(), then the third over the result. */
+/** Spectrum of three inks: the first two as CombineInkColors(), then the third over the result. 0
+ * for a null pointer. */
 VANTREL_API int Combine3InkColors(const double *first, const double *second, const double *third,
                                   double *refl);
 
@@ -1018,13 +1019,16 @@ VANTREL_API double DensityRatio(const double *reference, const double *sample, i
  */
 VANTREL_API double Saunderson(double refl, double k1, double k2);
 
-/** The inverse of Saunderson(); a reflectance below 0.0001 is returned as it is. */
+/** The inverse of Saunderson(): the measured reflectance of an internal one; one below 0.0001 is
+ * returned as it is. Like its inverse it divides as IEEE arithmetic does where k1 and k2 make a
+ * denominator 0. */
 VANTREL_API double UnSaunderson(double refl, double k1, double k2);
 
 /**
  * Spectrum of an ink printed as a thinner or thicker film: Beer-Lambert between Saunderson
  * corrections with k1 = 0 and k2 = 0.6. Where the ink is lighter than the paper the result is the
- * paper; a band in which the ink is below 0.0001 keeps the value of the ink.
+ * paper; a band in which the ink is below 0.0001 keeps the value of the ink, and over a paper of 0
+ * a band is 0 (not a number at thickness 0).
  * @param[in]  ink        spectrum of the solid on the paper, 31 values in percent
  * @param[in]  thickness  relative to the solid: 0 is the paper, 1 the solid
  * @param[in]  paper      spectrum of the paper

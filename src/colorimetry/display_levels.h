@@ -65,6 +65,16 @@ constexpr bool starts_rise()
     return true;
 }
 static_assert(starts_rise());
+
+// A digit that slips changes one of these sums.
+constexpr int sum_of_levels(bool by_index)
+{
+    int sum = 0;
+    for (int i = 0; i < kDisplaySteps; ++i)
+        sum += kDisplayLevels[i] * (by_index ? i : 1);
+    return sum;
+}
+static_assert(sum_of_levels(false) == 187808 && sum_of_levels(true) == 107936674);
 static_assert(std::size(kLevelStarts) == 207);
 static_assert(kDisplayLevels[3] == 0 && kDisplayLevels[4] == 5 && kDisplayLevels[11] == 40);
 static_assert(kDisplayLevels[33] == 79 && kDisplayLevels[34] == 79 && kDisplayLevels[35] == 80);

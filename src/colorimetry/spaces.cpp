@@ -26,6 +26,12 @@ std::optional<Xyz> chromaticity(const Xyz &xyz)
     return Xyz{xyz.x / sum, xyz.y / sum, xyz.z / sum};
 }
 
+std::optional<Yxy> yxy_from_xyz(const Xyz &xyz)
+{
+    const auto result = chromaticity(xyz);
+    return result ? std::optional(Yxy{xyz.y, result->x, result->y}) : std::nullopt;
+}
+
 std::optional<HunterLab> hunter_from_xyz(const Xyz &xyz, const Illuminant &illuminant)
 {
     if (!chromaticity(xyz))

@@ -22,6 +22,9 @@ Luv luv_from_xyz(const Xyz &xyz, const Xyz &white);
 /// x, y, z of CIE 15; nothing where X + Y + Z is 0.
 std::optional<Xyz> chromaticity(const Xyz &xyz);
 
+/// Y, x, y; nothing where X + Y + Z is 0.
+std::optional<Yxy> yxy_from_xyz(const Xyz &xyz);
+
 /// Hunter Lab; nothing where X + Y + Z is 0.
 std::optional<HunterLab> hunter_from_xyz(const Xyz &xyz, const Illuminant &illuminant);
 

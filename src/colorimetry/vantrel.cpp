@@ -110,13 +110,9 @@ int XYZToCIELUV(const double *xyz, ILLUM_OBS illumObs, double *luv)
 // Black has no chromaticity: zeros, and 0.
 static int store_yxy(const Xyz &xyz, double *Yxy)
 {
-    const auto xyz_chromaticity = chromaticity(xyz);
-    if (!xyz_chromaticity) {
-        store(Xyz{0, 0, 0}, Yxy);
-        return 0;
-    }
-    store(Xyz{xyz.y, xyz_chromaticity->x, xyz_chromaticity->y}, Yxy);
-    return 1;
+    const auto result = yxy_from_xyz(xyz);
+    store(result.value_or(vantrel::Yxy{0, 0, 0}), Yxy);
+    return result ? 1 : 0;
 }
 
 int ReflToCIEYxy(const double *refl, ILLUM_OBS illumObs, double *Yxy)

@@ -1,8 +1,6 @@
 #include "colorimetry/verbal.h"
 
-#include "colorimetry/illuminants.h"
 #include "colorimetry/lab.h"
-#include "colorimetry/tristimulus.h"
 
 #include <cmath>
 

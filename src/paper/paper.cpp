@@ -39,11 +39,8 @@ int ReflToWhiteE313_98(const double *refl, ILLUM_OBS illumObs, double *result)
 {
     VANTREL_REQUIRE(refl && result, "0");
     VANTREL_REQUIRE(is_illum_obs(illumObs), "0");
-    const Xyz xyz = xyz_from_spectrum(spectrum(refl), illumObs);
-    const auto xyz_chromaticity = chromaticity(xyz);
-    if (!xyz_chromaticity)
-        return 0;
-    return store_whiteness({xyz.y, xyz_chromaticity->x, xyz_chromaticity->y}, illumObs, result);
+    const auto colour = yxy_from_xyz(xyz_from_spectrum(spectrum(refl), illumObs));
+    return colour ? store_whiteness(*colour, illumObs, result) : 0;
 }
 
 int CIEYxyToWhiteE313_98(const double *Yxy, ILLUM_OBS illumObs, double *result)
