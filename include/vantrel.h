@@ -394,10 +394,10 @@ VANTREL_API int GetNormalizedDensityWeights(int status, int response, double *we
  * @param[in]  refl      spectrum, 31 values in percent
  * @param[in]  paper     spectrum of the paper, or null
  * @param[in]  status    density status
- * @param[in]  response  0 to 8; for #SPECTRAL_STATUS a wavelength of 391 to 709 nm (its band, cut
- *                       to ten, is read; the paper plays no part); for #SPECTRALX_STATUS a request
- *                       of 0 to 30 as in CalculateSpectralXDensity(); #CCR2_STATUS takes 9 to 30 as
- *                       well and answers 0
+ * @param[in]  response  0 to 8; for #SPECTRAL_STATUS a wavelength of 391 to 709 nm (cut toward
+ *                       400 nm to its band; the paper plays no part); for #SPECTRALX_STATUS a
+ * request of 0 to 30 as in CalculateSpectralXDensity(); #CCR2_STATUS takes 9 to 30 as well and
+ * answers 0
  * @param[out] density   density; 0 to 5 for the two spectral statuses
  * @return 1; 0 for a null `refl` or `density`, an unknown status, a response out of range.
  */
@@ -424,15 +424,17 @@ VANTREL_API int ReflToDensities(const double *refl, const double *paper, int sta
 VANTREL_API int ReflToDensitiesNoPaper(const double *refl, int status, DENSITYSTRUCT *densities);
 
 /**
- * Which response reads this ink: the visual one for a neutral, else the one of the largest density,
- * with the HiFi and Hexachrome inks told from the process inks by hue. With a paper the spectrum is
- * first sharpened by AdjustForPaperRefls(). Note the order of the parameters.
+ * Which response reads this ink: the visual one for what IsChromatic() under #D65_10DEG calls
+ * neutral, else the one of the largest density. The third HiFi ink is told from cyan by a hue error
+ * above 39.5 %, the Hexachrome inks from yellow by one above 30 %, and from one another by their
+ * hue (the second between 90 and 270 degrees). With a paper the spectrum is first sharpened by
+ * AdjustForPaperRefls(). Note the order of the parameters.
  * @param[in] refl    spectrum, 31 values in percent
  * @param[in] status  density status
  * @param[in] paper   spectrum of the paper, or null
- * @return a response; for #SPECTRAL_STATUS a wavelength (420, 440, … 700 nm); for #SPECTRALX_STATUS
- *         a band (2 to 28), or 0 for a neutral; 9 where the density set cannot be computed; 0 for a
- *         null `refl` or an unknown status.
+ * @return a response; for #SPECTRAL_STATUS, neutral or not, a wavelength (420, 440, … 700 nm); for
+ * #SPECTRALX_STATUS a band (2 to 28), or 0 for a neutral; 9 where the density set cannot be
+ * computed; 0 for a null `refl` or an unknown status.
  */
 VANTREL_API int DetermineDensityResponse(const double *refl, int status, const double *paper);
 
@@ -460,7 +462,8 @@ VANTREL_API int CalculateCCRDensities(const double *refl, const double *paper, i
  *                                  below 680, or not a number, leaves its band as it was
  * @param[in] shape1,shape2,shape3  seven relative weights around each centre, in steps of 10 nm;
  *                                  null moves the centre alone. A shape that sums to 0 makes an
- *                                  empty row.
+ *                                  empty row; one that is not finite, or too small or too large
+ *                                  to be scaled, leaves the row as it was.
  */
 VANTREL_API void SetHiFiConstants(const double *wavelengths, const double *shape1,
                                   const double *shape2, const double *shape3);
@@ -485,7 +488,7 @@ VANTREL_API void GetHexachromeConstants(double *wavelengths, double *shape1, dou
  *  @{ */
 
 /**
- * The windowed density at a band.
+ * The windowed density at a band, not clamped; 5 for a window of 0 or less.
  * @param[in]  refl     spectrum, 31 values in percent
  * @param[in]  paper    spectrum of the paper, or null; its density at the same band is subtracted
  * @param[in]  request  2 to 28: that band; 0: the visual density of Status T; any other: the
@@ -498,7 +501,8 @@ VANTREL_API int CalculateSpectralXDensity(const double *refl, const double *pape
                                           double *density, int *band);
 
 /**
- * The absorption peaks of a spectrum in order of wavelength.
+ * The absorption peaks of a spectrum in order of wavelength, from 420 nm (or the first crest of a
+ * rising blue end, up to 490 nm) to 680 nm.
  * @param[in]  refl    spectrum, 31 values in percent
  * @param[out] points  room for 31 peaks
  * @param[out] count   how many were found, at least 1
@@ -542,8 +546,8 @@ VANTREL_API int IsChromatic(const double *refl, uint8_t illumObs);
 /** 1 where the L\*C\*h (three doubles) is chromatic, else 0; 0 for a null pointer. */
 VANTREL_API int IsChromaticLCH(const double *lch);
 
-/** Sets the two points of the line; a null pointer, two equal L\*, or a value that is not finite
- * changes nothing. */
+/** Sets the two points of the line; a null pointer, or points through which no finite line
+ * goes (two equal L\*, a value that is not finite), change nothing. */
 VANTREL_API void SetAChromaticConstants(const double *L1, const double *L2, const double *C1,
                                         const double *C2);
 
@@ -571,7 +575,8 @@ VANTREL_API int DensityToDotArea(double solidDensity, double tintDensity, double
                                  double *dotArea);
 
 /** The tint density of a dot area in percent, the inverse of DensityToDotArea() to seven digits. A
- * dot area beyond what any density can have gives an infinite or not-a-number density and 1. */
+ * dot area beyond what any density can have gives an infinite or not-a-number density and 1; 0 for
+ * a null pointer or an n-factor of 0. */
 VANTREL_API int DensityFromDotArea(double solidDensity, double dotArea, double nFactor,
                                    double *tintDensity);
 
@@ -614,7 +619,8 @@ VANTREL_API int ReflToTrap(const double *second, const double *first, const doub
 /**
  * Grayness 100 L / H and hue error 100 (M - L) / (H - L) of the GATF colour diagram, from the
  * lowest, middle and highest of three densities. A density of exactly 0 is not taken as the lowest;
- * H = 0 has grayness 100, and H = L has hue error 100.
+ * H = 0 has grayness 100, and H = L has hue error 100. H is at least 0, and a missing L is 100:
+ * three densities of 0 have hue error 200.
  * @param[in]  redDensity,greenDensity,blueDensity  densities
  * @param[out] grayness,hueError                    percent, not clamped
  * @return 1; 0 for a null pointer.
@@ -624,7 +630,7 @@ VANTREL_API int DensityToHueGray(double redDensity, double greenDensity, double 
 
 /**
  * Grayness and hue error of a measured ink. #HIFI_STATUS and #HEXACHROME_STATUS are measured as
- * #E_STATUS.
+ * #E_STATUS; the one density of #SPECTRAL_STATUS, where above 0, has 100 and 100.
  * @param[in]  refl,paper         spectra, 31 values in percent; the paper may be null
  * @param[in]  status             any but #SPECTRALX_STATUS
  * @param[out] grayness,hueError  percent
@@ -705,7 +711,7 @@ VANTREL_API int PolDetermineDensityResponse(const double *refl, const double *ta
                                             const POLWEIGHTSTRUCT *weights);
 
 /** ReflToDensity() of the spectrum over the paper, each after PolReflAutoAdjust(); fails with them,
- * the density as it was. */
+ * and for a null output, the density as it was. */
 VANTREL_API int PolReflToDensity(const double *refl, const double *targets, const double *paper,
                                  const double *paperTargets, const POLWEIGHTSTRUCT *weights,
                                  int status, int response, double *density);
@@ -732,8 +738,8 @@ VANTREL_API int PolReflToHueGray(const double *refl, const double *targets, cons
                                  const double *paperTargets, const POLWEIGHTSTRUCT *weights,
                                  int status, double *grayness, double *hueError);
 
-/** ReflToDotArea() of the spectra, each after PolReflAutoAdjust(); fails with them, nothing is
- * written. */
+/** ReflToDotArea() of the spectra, each after PolReflAutoAdjust(); fails with them, and for a null
+ * output; nothing is written then. */
 VANTREL_API int PolReflToDotArea(const double *solid, const double *solidTargets,
                                  const double *tint, const double *tintTargets, const double *paper,
                                  const double *paperTargets, const POLWEIGHTSTRUCT *weights,

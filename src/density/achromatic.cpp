@@ -1,5 +1,7 @@
 #include "density/achromatic.h"
 
+#include <cmath>
+
 namespace vantrel {
 namespace {
 
@@ -15,11 +17,16 @@ constinit Line line = {-0.11428571428571, 12.6};
 
 const AchromaticPoints &achromatic_points() { return points; }
 
-void set_achromatic_points(const AchromaticPoints &new_points)
+bool set_achromatic_points(const AchromaticPoints &through)
 {
-    points = new_points;
-    line.slope = (points.C2 - points.C1) / (points.L2 - points.L1);
-    line.intercept = points.C2 - points.L2 * line.slope;
+    const double slope = (through.C2 - through.C1) / (through.L2 - through.L1);
+    const double intercept = through.C2 - through.L2 * slope;
+    // An infinite L* makes a level line, which is finite.
+    if (!std::isfinite(through.L1) || !std::isfinite(slope) || !std::isfinite(intercept))
+        return false;
+    points = through;
+    line = {slope, intercept};
+    return true;
 }
 
 bool is_chromatic(double L, double C) { return C > line.slope * L + line.intercept; }

@@ -11,8 +11,8 @@ struct AchromaticPoints {
 
 const AchromaticPoints &achromatic_points();
 
-/// The two L* must differ.
-void set_achromatic_points(const AchromaticPoints &points);
+/// False, with the line as it was, for two points that no finite line goes through.
+bool set_achromatic_points(const AchromaticPoints &through);
 
 /// Whether C* lies above the line.
 bool is_chromatic(double L, double C);

@@ -20,26 +20,27 @@ std::span<std::int64_t, kBands> row_of(int response)
     return den_weight[status][response];
 }
 
-/// Halves away from zero. Shapes that cancel out can ask for anything: the limit keeps a sum of
-/// seven weights in 64 bits.
+/// Halves away from zero. Weights that all but cancel out are scaled to anything: the limit keeps a
+/// sum of seven in 64 bits.
 std::int64_t whole_weight(double weight)
 {
     constexpr double kLimit = 0x1p60;
-    if (std::isnan(weight))
-        return 0;
     return static_cast<std::int64_t>(std::clamp(std::round(weight), -kLimit, kLimit));
 }
 
-/// Integer weights that sum to 100 000; the centre takes what rounding leaves over.
+/// Integer weights that sum to 100 000; the centre takes what rounding leaves over. A shape that
+/// cannot be scaled to that leaves the row as it was.
 void build_row(std::span<std::int64_t, kBands> row, int centre, Shape shape)
 {
     double sum = 0;
     for (const double weight : shape)
         sum += weight;
+    const double scale = sum == 0 ? 0 : 100000 / sum;
+    if (!std::isfinite(sum) || !std::isfinite(scale))
+        return;
     std::ranges::fill(row, 0);
     if (sum == 0)
         return;
-    const double scale = 100000 / sum;
     std::int64_t left = 100000;
     for (int i = 0; i < kShape; ++i) {
         const std::int64_t weight = whole_weight(shape[i] * scale);

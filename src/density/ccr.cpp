@@ -56,8 +56,8 @@ Densities ccr_densities(Spectrum refl, int status)
     const Rgb c = correction(rgb, status);
     const double visual = status == CCR1_STATUS ? 0.75 * rgb.g + 0.25 * rgb.r
                                                 : 0.763 * c.g * rgb.g + 0.237 * c.r * rgb.r;
-    return {{-std::log10(visual), -std::log10(c.r * rgb.r), -std::log10(c.g * rgb.g),
-             -std::log10(c.b * rgb.b)}};
+    return {{0 - std::log10(visual), 0 - std::log10(c.r * rgb.r), 0 - std::log10(c.g * rgb.g),
+             0 - std::log10(c.b * rgb.b)}};
 }
 
 } // namespace

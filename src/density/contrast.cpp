@@ -16,8 +16,11 @@ double adjusted(double refl, double paper)
     return 100 / std::pow(10, sample_density + gain * above_paper);
 }
 
-/// A reflectance in percent whose density loses little to rounding.
-bool is_ordinary(double refl) { return refl > 1e-3 && refl < 1e3; }
+/// A sample on a paper, as they are measured: the adjusted reflectance stays of ordinary size.
+bool is_ordinary(double refl, double paper)
+{
+    return refl > 1e-3 && refl < 200 && paper > 1 && paper < 200;
+}
 
 // With Ds = log10(100 / R) and Ds - Dp = log10(P / R) that is R (R / P)^k. What is not ordinary, or
 // too near to the step at a density of 0.5, stays with the logarithms.
@@ -25,7 +28,7 @@ double roughly_adjusted(double refl, double paper)
 {
     constexpr double kStep = 0.31622776601683794; // 10^-0.5
     const double ratio = refl / paper;
-    if (!is_ordinary(refl) || !is_ordinary(paper) || std::fabs(ratio - kStep) < 1e-12)
+    if (!is_ordinary(refl, paper) || std::fabs(ratio - kStep) < 1e-12)
         return adjusted(refl, paper);
     return ratio < kStep ? refl * ratio : refl * ratio * ratio;
 }

@@ -79,17 +79,21 @@ int response_of(Spectrum refl, int status)
 }
 
 /// The response of an ISO status, where a change in the last digits of the spectrum could not give
-/// another: the chroma keeps its distance from the achromatic line, and the largest density from
+/// another: the colour keeps its distance from the achromatic line, and the largest density from
 /// the others.
 std::optional<int> firm_response(Spectrum refl, int status)
 {
+    constexpr double kLightnessMargin = 1e-9;
     constexpr double kChromaMargin = 0.02; // more than a rounding step of both a* and b*
     constexpr double kDensityMargin = 1e-6;
     const Lab lab = rounded(lab_from_spectrum(refl, D65_10DEG));
     const double C = chroma(lab);
-    if (is_chromatic(lab.L, C - kChromaMargin) != is_chromatic(lab.L, C + kChromaMargin))
-        return std::nullopt;
-    if (!is_chromatic(lab.L, C))
+    const bool chromatic = is_chromatic(lab.L, C);
+    for (const double L : {lab.L - kLightnessMargin, lab.L + kLightnessMargin})
+        if (is_chromatic(L, C - kChromaMargin) != chromatic ||
+            is_chromatic(L, C + kChromaMargin) != chromatic)
+            return std::nullopt;
+    if (!chromatic)
         return VISUAL_RESPONSE;
     const Densities set = *densities(refl, std::nullopt, status);
     const Extreme first = largest(set, true, VISUAL_RESPONSE);
@@ -147,7 +151,7 @@ int density_response(Spectrum refl, int status, Paper paper)
     if (!paper)
         return response_of(refl, status);
     // Whatever the speed, the answer is that of the exact adjustment, even where the densities of
-    // two responses tie.
+    // two responses tie (in filters whose weights do not all but cancel out).
     if (status <= T_STATUS)
         if (const auto response = firm_response(roughly_adjusted_for_paper(refl, *paper), status))
             return *response;

@@ -17,7 +17,11 @@ constexpr double kLeastFactor = 1e-5;
 constexpr double kLeastPercent = 0.0009999999310821295;
 static_assert(kToPercent == 9.999999747378752e-6);
 
-double density_of_sum(double sum) { return -std::log10(std::max(sum * kToFactor, kLeastFactor)); }
+// Subtracted from 0 rather than negated, so that a perfect white has 0 and not -0.
+double density_of_sum(double sum)
+{
+    return 0 - std::log10(std::max(sum * kToFactor, kLeastFactor));
+}
 
 double clamped(double density) { return std::clamp(density, 0.0, 5.0); }
 
@@ -52,7 +56,7 @@ double weighted_density(Spectrum refl, Paper paper, int status, int response)
     return density_of_sum(sum) - density_of_sum(paper_sum);
 }
 
-double spectral_density(double refl) { return -std::log10(std::max(refl, 1e-5) / 100); }
+double spectral_density(double refl) { return 0 - std::log10(std::max(refl, 1e-5) / 100); }
 
 std::optional<double> density(Spectrum refl, Paper paper, int status, int response)
 {

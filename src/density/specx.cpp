@@ -7,7 +7,6 @@
 #include "density/spectralx.h"
 
 #include <algorithm>
-#include <cmath>
 
 using namespace vantrel;
 
@@ -48,8 +47,7 @@ int ChooseBPWavelen(const double *refl, const DENSITYPOINT *points, int count)
 double CalculateSpecialDensity(const double *refl, int centre, double *weights, int width)
 {
     VANTREL_REQUIRE(refl && weights && width >= 0, "0");
-    VANTREL_REQUIRE(centre >= width / 2 && centre < kBands && width <= kBands &&
-                        centre - width / 2 + width <= kBands,
+    VANTREL_REQUIRE(centre >= width / 2 && centre < kBands && centre - width / 2 + width <= kBands,
                     "0");
     return window_density(spectrum(refl), centre - width / 2,
                           std::span(weights, static_cast<std::size_t>(width)));
@@ -96,10 +94,7 @@ int IsChromaticLCH(const double *lch)
 void SetAChromaticConstants(const double *L1, const double *L2, const double *C1, const double *C2)
 {
     VANTREL_REQUIRE_ELSE(L1 && L2 && C1 && C2, "0", );
-    VANTREL_REQUIRE_ELSE(std::isfinite(*L1) && std::isfinite(*L2) && std::isfinite(*C1) &&
-                             std::isfinite(*C2) && *L1 != *L2,
-                         "0", );
-    set_achromatic_points({*L1, *L2, *C1, *C2});
+    VANTREL_REQUIRE_ELSE(set_achromatic_points({*L1, *L2, *C1, *C2}), "0", );
 }
 
 void GetAChromaticConstants(double *L1, double *L2, double *C1, double *C2)

@@ -12,7 +12,7 @@ static double channel_factor(Spectrum refl, const double *weights, double target
     return reading == 0 ? 1 : target / reading;
 }
 
-ChannelFactors channel_factors(Spectrum refl, int response, const double *targets,
+ChannelFactors channel_factors(Spectrum refl, int response, Targets targets,
                                const PolWeights &weights)
 {
     const bool all = response == VISUAL_RESPONSE;
@@ -52,16 +52,16 @@ std::optional<double> overall_factor(const ChannelFactors &factors, int response
     return factor == 0 || factor > 1 ? 1 : factor;
 }
 
-Polarised scaled(Spectrum refl, double factor)
+Bands scaled(Spectrum refl, double factor)
 {
-    Polarised result;
+    Bands result;
     for (int i = 0; i < kBands; ++i)
         result[i] = refl[i] * factor;
     return result;
 }
 
-std::optional<Polarised> polarised(Spectrum refl, const double *targets, const PolWeights &weights,
-                                   double noise)
+std::optional<Bands> polarised(Spectrum refl, Targets targets, const PolWeights &weights,
+                               double noise)
 {
     const int response = density_response(refl, E_STATUS, std::nullopt);
     const auto factor =

@@ -9,15 +9,15 @@ namespace vantrel {
 /// Target over reading in the red, the green and the two blue channels.
 using ChannelFactors = std::array<double, 4>;
 using PolWeights = POLWEIGHTSTRUCT;
-/// A spectrum scaled toward its reading through a polarisation filter.
-using Polarised = std::array<double, kBands>;
+/// The readings of a spectrum in the four channels.
+using Targets = std::span<const double, 4>;
 
 /// A second adjustment of an adjusted spectrum has a factor of 1 give or take rounding noise.
 inline constexpr double kRoundingNoise = 1e-12;
 
 /// The factors of the channels that a response stands for (the visual one: all four); the others,
 /// and a channel that reads 0, have 1.
-ChannelFactors channel_factors(Spectrum refl, int response, const double *targets,
+ChannelFactors channel_factors(Spectrum refl, int response, Targets targets,
                                const PolWeights &weights);
 
 /// The factor of a spectrum: the mean over the channels that the response stands for, 1 where there
@@ -25,10 +25,10 @@ ChannelFactors channel_factors(Spectrum refl, int response, const double *target
 /// more than `noise` counts as 1.
 std::optional<double> overall_factor(const ChannelFactors &factors, int response, double noise = 0);
 
-Polarised scaled(Spectrum refl, double factor);
+Bands scaled(Spectrum refl, double factor);
 
 /// The spectrum adjusted in the channel of its own Status E response.
-std::optional<Polarised> polarised(Spectrum refl, const double *targets, const PolWeights &weights,
-                                   double noise = 0);
+std::optional<Bands> polarised(Spectrum refl, Targets targets, const PolWeights &weights,
+                               double noise = 0);
 
 } // namespace vantrel

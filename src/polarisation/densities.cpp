@@ -24,25 +24,31 @@ constexpr Row kRows[] = {
 
 } // namespace
 
-std::optional<Densities> polarised_densities(Spectrum refl, const double *targets,
-                                             Paper adjusted_paper, const PolWeights &weights,
-                                             int status)
+std::optional<Densities> polarised_densities(Spectrum refl, Targets targets, Paper adjusted_paper,
+                                             const PolWeights &weights, int status)
 {
     if (status == SPECTRAL_STATUS || status == SPECTRALX_STATUS) {
         const auto adjusted = polarised(refl, targets, weights);
         return adjusted ? densities(*adjusted, adjusted_paper, status) : std::nullopt;
     }
     const ChannelFactors factors = channel_factors(refl, VISUAL_RESPONSE, targets, weights);
-    Densities set{};
-    for (const auto &[response, channel, only_status] : kRows) {
-        if (only_status >= 0 && only_status != status)
-            continue;
+    std::array<Bands, BLUE_RESPONSE + 1> adjusted;
+    for (int channel = VISUAL_RESPONSE; channel <= BLUE_RESPONSE; ++channel) {
         const auto factor = overall_factor(factors, channel);
         if (!factor)
             return std::nullopt;
-        set.density[response] =
-            density(scaled(refl, *factor), adjusted_paper, status, response).value_or(0);
+        adjusted[channel] = scaled(refl, *factor);
     }
+    // The corrected densities of a paper come as a set; it is computed once.
+    const bool as_set = adjusted_paper && status == CCR2_STATUS;
+    const Densities paper_set =
+        as_set ? *densities(*adjusted_paper, std::nullopt, status) : Densities{};
+    const Paper paper = as_set ? std::nullopt : adjusted_paper;
+    Densities set{};
+    for (const auto &[response, channel, only_status] : kRows)
+        if (only_status < 0 || only_status == status)
+            set.density[response] =
+                *density(adjusted[channel], paper, status, response) - paper_set.density[response];
     return set;
 }
 

@@ -15,6 +15,8 @@ using namespace vantrel;
 
 namespace {
 
+Targets four(const double *targets) { return Targets(targets, 4); }
+
 // The paper of a call, adjusted where there is one; failed where it cannot be adjusted.
 struct PolarisedPaper {
     PolarisedPaper(Paper refl, const double *targets, const POLWEIGHTSTRUCT &weights,
@@ -22,12 +24,12 @@ struct PolarisedPaper {
     {
         if (!refl)
             return;
-        adjusted = polarised(*refl, targets, weights, noise);
+        adjusted = polarised(*refl, four(targets), weights, noise);
         failed = !adjusted;
     }
     operator Paper() const { return adjusted ? Paper(*adjusted) : std::nullopt; }
 
-    std::optional<Polarised> adjusted;
+    std::optional<Bands> adjusted;
     bool failed = false;
 };
 
@@ -36,19 +38,19 @@ struct PolarisedPaper {
 int PolReflAdjust(const double *refl, int response, const double *targets, double *adjusted,
                   const POLWEIGHTSTRUCT *weights)
 {
-    const auto factor =
-        overall_factor(channel_factors(spectrum(refl), response, targets, *weights), response);
+    const auto factor = overall_factor(
+        channel_factors(spectrum(refl), response, four(targets), *weights), response);
     VANTREL_REQUIRE(factor, "0");
-    std::ranges::copy(scaled(spectrum(refl), *factor), adjusted);
+    store(scaled(spectrum(refl), *factor), adjusted);
     return 1;
 }
 
 int PolReflAutoAdjust(const double *refl, const double *targets, double *adjusted,
                       const POLWEIGHTSTRUCT *weights)
 {
-    const auto result = polarised(spectrum(refl), targets, *weights);
+    const auto result = polarised(spectrum(refl), four(targets), *weights);
     VANTREL_REQUIRE(result, "0");
-    std::ranges::copy(*result, adjusted);
+    store(*result, adjusted);
     return 1;
 }
 
@@ -57,10 +59,9 @@ int PolDetermineDensityResponse(const double *refl, const double *targets, int s
                                 const POLWEIGHTSTRUCT *weights)
 {
     VANTREL_REQUIRE(is_status(status), "0");
-    const auto sample = polarised(spectrum(refl), targets, *weights);
+    const auto sample = polarised(spectrum(refl), four(targets), *weights);
     const PolarisedPaper adjustedPaper(vantrel::paper(paper), paperTargets, *weights);
-    if (!sample || adjustedPaper.failed)
-        return 0;
+    VANTREL_REQUIRE(sample && !adjustedPaper.failed, "0");
     return density_response(*sample, status, adjustedPaper);
 }
 
@@ -70,10 +71,9 @@ int PolReflToDensity(const double *refl, const double *targets, const double *pa
 {
     VANTREL_REQUIRE(density, "0");
     VANTREL_REQUIRE(is_status(status), "0");
-    const auto sample = polarised(spectrum(refl), targets, *weights);
+    const auto sample = polarised(spectrum(refl), four(targets), *weights);
     const PolarisedPaper adjustedPaper(vantrel::paper(paper), paperTargets, *weights);
-    if (!sample || adjustedPaper.failed)
-        return 0;
+    VANTREL_REQUIRE(sample && !adjustedPaper.failed, "0");
     return store(vantrel::density(*sample, adjustedPaper, status, response), density);
 }
 
@@ -85,7 +85,7 @@ int PolReflToDensities(const double *refl, const double *targets, const double *
     VANTREL_REQUIRE(is_status(status), "0");
     const PolarisedPaper adjustedPaper(vantrel::paper(paper), paperTargets, *weights);
     const auto result = adjustedPaper.failed ? std::nullopt
-                                             : polarised_densities(spectrum(refl), targets,
+                                             : polarised_densities(spectrum(refl), four(targets),
                                                                    adjustedPaper, *weights, status);
     *densities = result.value_or(Densities{});
     return result ? 1 : 0;
@@ -98,14 +98,13 @@ int PolReflToHueGray(const double *refl, const double *targets, const double *pa
     VANTREL_REQUIRE(refl && grayness && hueError, "0");
     VANTREL_REQUIRE(is_status(status) && status != SPECTRALX_STATUS, "0");
     const PolarisedPaper adjustedPaper(vantrel::paper(paper), paperTargets, *weights);
-    if (adjustedPaper.failed)
-        return 0;
+    VANTREL_REQUIRE(!adjustedPaper.failed, "0");
     // The density set adjusts the paper that it is given, here one that is adjusted already.
     const PolarisedPaper twice(adjustedPaper, paperTargets, *weights, kRoundingNoise);
     if (twice.failed)
         return 9;
     const auto set =
-        polarised_densities(spectrum(refl), targets, twice, *weights, process_status(status));
+        polarised_densities(spectrum(refl), four(targets), twice, *weights, process_status(status));
     if (!set)
         return 9;
     const HueGray result = hue_gray(*set);
@@ -121,11 +120,10 @@ int PolReflToDotArea(const double *solid, const double *solidTargets, const doub
 {
     VANTREL_REQUIRE(dotArea, "0");
     VANTREL_REQUIRE(is_status(status), "0");
-    const auto adjustedSolid = polarised(spectrum(solid), solidTargets, *weights);
-    const auto adjustedTint = polarised(spectrum(tint), tintTargets, *weights);
+    const auto adjustedSolid = polarised(spectrum(solid), four(solidTargets), *weights);
+    const auto adjustedTint = polarised(spectrum(tint), four(tintTargets), *weights);
     const PolarisedPaper adjustedPaper(vantrel::paper(paper), paperTargets, *weights);
-    if (!adjustedSolid || !adjustedTint || adjustedPaper.failed)
-        return 0;
+    VANTREL_REQUIRE(adjustedSolid && adjustedTint && !adjustedPaper.failed, "0");
     return store(dot_area(*adjustedSolid, *adjustedTint, adjustedPaper, status, response, nFactor),
                  dotArea);
 }
@@ -137,11 +135,10 @@ int PolReflToDotGain(const double *solid, const double *solidTargets, const doub
 {
     VANTREL_REQUIRE(dotGain, "0");
     VANTREL_REQUIRE(is_status(status), "0");
-    const auto adjustedSolid = polarised(spectrum(solid), solidTargets, *weights);
-    const auto adjustedTint = polarised(spectrum(tint), tintTargets, *weights);
+    const auto adjustedSolid = polarised(spectrum(solid), four(solidTargets), *weights);
+    const auto adjustedTint = polarised(spectrum(tint), four(tintTargets), *weights);
     const PolarisedPaper adjustedPaper(vantrel::paper(paper), paperTargets, *weights);
-    if (!adjustedSolid || !adjustedTint || adjustedPaper.failed)
-        return 0;
+    VANTREL_REQUIRE(adjustedSolid && adjustedTint && !adjustedPaper.failed, "0");
     return store(dot_gain(*adjustedSolid, *adjustedTint, adjustedPaper, status, response, nFactor,
                           nominalDotArea),
                  dotGain);
@@ -154,11 +151,10 @@ int PolReflToPrintContrast(const double *solid, const double *solidTargets, cons
 {
     VANTREL_REQUIRE(contrast, "0");
     VANTREL_REQUIRE(is_status(status), "0");
-    const auto adjustedSolid = polarised(spectrum(solid), solidTargets, *weights);
-    const auto adjustedTint = polarised(spectrum(tint), tintTargets, *weights);
+    const auto adjustedSolid = polarised(spectrum(solid), four(solidTargets), *weights);
+    const auto adjustedTint = polarised(spectrum(tint), four(tintTargets), *weights);
     const PolarisedPaper adjustedPaper(vantrel::paper(paper), paperTargets, *weights);
-    if (!adjustedSolid || !adjustedTint || adjustedPaper.failed)
-        return 0;
+    VANTREL_REQUIRE(adjustedSolid && adjustedTint && !adjustedPaper.failed, "0");
     return store(print_contrast(*adjustedSolid, *adjustedTint, adjustedPaper, status, response),
                  contrast);
 }
@@ -170,12 +166,12 @@ int PolReflToTrap(const double *second, const double *secondTargets, const doubl
 {
     VANTREL_REQUIRE(trap, "0");
     VANTREL_REQUIRE(is_status(status), "0");
-    const auto adjustedSecond = polarised(spectrum(second), secondTargets, *weights);
-    const auto adjustedFirst = polarised(spectrum(first), firstTargets, *weights);
-    const auto adjustedOverprint = polarised(spectrum(overprint), overprintTargets, *weights);
+    const auto adjustedSecond = polarised(spectrum(second), four(secondTargets), *weights);
+    const auto adjustedFirst = polarised(spectrum(first), four(firstTargets), *weights);
+    const auto adjustedOverprint = polarised(spectrum(overprint), four(overprintTargets), *weights);
     const PolarisedPaper adjustedPaper(vantrel::paper(paper), paperTargets, *weights);
-    if (!adjustedSecond || !adjustedFirst || !adjustedOverprint || adjustedPaper.failed)
-        return 0;
+    VANTREL_REQUIRE(adjustedSecond && adjustedFirst && adjustedOverprint && !adjustedPaper.failed,
+                    "0");
     return store(vantrel::trap(*adjustedSecond, *adjustedFirst, *adjustedOverprint, adjustedPaper,
                                status, response),
                  trap);

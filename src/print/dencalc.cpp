@@ -32,9 +32,11 @@ int ReflToDotArea(const double *solid, const double *tint, const double *paper, 
 {
     VANTREL_REQUIRE(solid && tint && dotArea, "0");
     VANTREL_REQUIRE(is_status(status), "0");
-    return store(
-        dot_area(spectrum(solid), spectrum(tint), vantrel::paper(paper), status, response, nFactor),
-        dotArea);
+    const auto result =
+        dot_area(spectrum(solid), spectrum(tint), vantrel::paper(paper), status, response, nFactor);
+    VANTREL_REQUIRE(result, "0");
+    *dotArea = *result;
+    return 1;
 }
 
 int ReflToDotGain(const double *solid, const double *tint, const double *paper, int status,
@@ -42,9 +44,11 @@ int ReflToDotGain(const double *solid, const double *tint, const double *paper, 
 {
     VANTREL_REQUIRE(solid && tint && dotGain, "0");
     VANTREL_REQUIRE(is_status(status), "0");
-    return store(dot_gain(spectrum(solid), spectrum(tint), vantrel::paper(paper), status, response,
-                          nFactor, nominalDotArea),
-                 dotGain);
+    const auto result = dot_gain(spectrum(solid), spectrum(tint), vantrel::paper(paper), status,
+                                 response, nFactor, nominalDotArea);
+    VANTREL_REQUIRE(result, "0");
+    *dotGain = *result;
+    return 1;
 }
 
 int DensityToPrintContrast(double solidDensity, double tintDensity, double *contrast)

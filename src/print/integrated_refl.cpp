@@ -1,20 +1,17 @@
 #include "print/integrated_refl.h"
 
+#include "density/den_weight.h"
 #include "density/densities.h"
 #include "density/density.h"
 
-#include <algorithm>
 #include <cmath>
-#include <cstdint>
 
 namespace vantrel {
 
 double integrated_refl(double density, int status, int response)
 {
-    const auto &weights = den_weight[status][response];
-    const std::int64_t peak =
-        std::max<std::int64_t>(0, *std::max_element(std::begin(weights), std::end(weights)));
-    return 10000000 / (static_cast<double>(peak) * std::pow(10.0, density));
+    const auto peak = static_cast<double>(profile(weights_of(status, response)).peak_weight);
+    return 10000000 / (peak * std::pow(10.0, density));
 }
 
 std::optional<double> polarisation_intercept(Spectrum refl, double Dr, double Dg, double Db)
