@@ -2,36 +2,7 @@
 
 #include <sstream>
 
-namespace {
-
-// Tokens in declared order: `N` input array, `>N` output array, `k` illuminant/observer, `s`
-// status, `r` response, `d` double, `i` int; suffix `?`: null is allowed, `!`: the caller's duty.
-std::vector<Argument> parse(const char *signature)
-{
-    std::vector<Argument> arguments;
-    std::istringstream tokens(signature);
-    for (std::string token; tokens >> token;) {
-        Argument argument;
-        argument.output = token.front() == '>';
-        argument.nullable = token.back() == '?';
-        argument.unchecked = token.back() == '!';
-        const std::string core = token.substr(argument.output ? 1 : 0);
-        if (std::isalpha(static_cast<unsigned char>(core.front())))
-            argument.kind = core.front();
-        else
-            argument.count = std::stoul(core);
-        arguments.push_back(argument);
-    }
-    return arguments;
-}
-
-struct Row {
-    const char *name;
-    std::function<double(std::vector<Slot> &)> call;
-    const char *signature;
-};
-
-const Row kRows[] = {
+const std::vector<Function> kFunctions = {
     {"GetNumIlluminantObservers", call(GetNumIlluminantObservers), ""},
     {"ReflToXYZ", call(ReflToXYZ), "31 k >3"},
     {"ReflToXYZs", call(ReflToXYZs), "31 k >31 >31 >31"},
@@ -169,7 +140,23 @@ const Row kRows[] = {
     {"PolReflToTrap", call(PolReflToTrap), "31! 4! 31! 4! 31! 4! 31? 4! 124! s r >1"},
 };
 
-} // namespace
+Function::Function(const char *name_, std::function<double(std::vector<Slot> &)> call_,
+                   const char *signature)
+    : name(name_), call(std::move(call_))
+{
+    std::istringstream tokens(signature);
+    for (std::string token; tokens >> token;) {
+        Argument &argument = arguments.emplace_back();
+        argument.output = token.front() == '>';
+        argument.nullable = token.back() == '?';
+        argument.unchecked = token.back() == '!';
+        const std::string core = token.substr(argument.output ? 1 : 0);
+        if (std::isalpha(static_cast<unsigned char>(core.front())))
+            argument.kind = core.front();
+        else
+            argument.count = std::stoul(core);
+    }
+}
 
 std::vector<Slot> Function::slots() const
 {
@@ -181,21 +168,10 @@ std::vector<Slot> Function::slots() const
     return slots;
 }
 
-const std::vector<Function> &functions()
-{
-    static const std::vector<Function> all = [] {
-        std::vector<Function> result;
-        for (const Row &row : kRows)
-            result.push_back({row.name, row.call, parse(row.signature)});
-        return result;
-    }();
-    return all;
-}
+const std::vector<Function> &functions() { return kFunctions; }
 
 const Function *find_function(const std::string &name)
 {
-    for (const Function &function : functions())
-        if (function.name == name)
-            return &function;
-    return nullptr;
+    const auto it = std::ranges::find(kFunctions, name, &Function::name);
+    return it != kFunctions.end() ? &*it : nullptr;
 }

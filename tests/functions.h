@@ -39,6 +39,12 @@ struct Function {
     std::function<double(std::vector<Slot> &)> call;
     std::vector<Argument> arguments;
 
+    /// The signature gives the arguments as tokens in declared order: `N` input array, `>N` output
+    /// array, `k` illuminant/observer, `s` status, `r` response, `d` double, `i` int; suffix `?`:
+    /// null is allowed, `!`: the caller's duty.
+    Function(const char *name, std::function<double(std::vector<Slot> &)> call,
+             const char *signature);
+
     /// Slots of the right sizes, inputs all zero.
     std::vector<Slot> slots() const;
 };

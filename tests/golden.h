@@ -3,29 +3,18 @@
 
 #include "functions.h"
 
-#include <filesystem>
 #include <optional>
-
-/// One expected output: numbers, text, or how it is left.
-struct Expected {
-    enum Kind { numbers, text, unwritten, anything, null_output } kind = numbers;
-    std::vector<double> values;
-    std::string words;
-};
 
 struct GoldenCase {
     std::string where; ///< file:line
     const Function *function = nullptr;
     std::vector<Slot> slots;
     double returns = 1;
-    std::vector<Expected> outputs;
-    std::optional<double> tolerance; ///< absolute; without one, 1e-12 relative
+    std::vector<std::string> outputs; ///< what the line says of each output, in order
+    std::optional<double> tolerance;  ///< absolute; without one, 1e-12 relative
 };
 
-/// The cases of a file; throws std::runtime_error with file and line.
-std::vector<GoldenCase> read_golden(const std::filesystem::path &file);
-
-/// The cases of every file.
+/// The cases of every file; throws std::runtime_error with file and line.
 std::vector<GoldenCase> read_all_golden();
 
 /// A successful call of each function in the tables, to be spoilt one argument at a time.

@@ -23,20 +23,21 @@ std::map<std::string, Invariants> read_invariants()
     std::map<std::string, Invariants> all;
     std::ifstream in(VANTREL_INVARIANTS);
     for (std::string line; std::getline(in, line);) {
-        std::istringstream words(line);
-        std::string name, word;
-        if (!(words >> name) || name.front() == '#')
+        const std::size_t colon = line.find(':');
+        if (line.front() == '#' || colon == std::string::npos)
             continue;
-        Invariants row;
-        std::string reporter = name.substr(name.rfind(':') + 1);
-        words >> row.file >> std::ws;
-        for (std::string expression; std::getline(words, expression, '|');) {
-            if (expression.starts_with("as "))
-                reporter = expression.substr(3);
-            else
-                row.reports.push_back({reporter, expression});
+        std::istringstream names(line.substr(colon + 1));
+        for (std::string name; names >> name;) {
+            std::istringstream words(line.substr(0, colon));
+            std::string reporter = name;
+            words >> all[name].file >> std::ws;
+            for (std::string expression; std::getline(words, expression, '|');) {
+                if (expression.starts_with("as "))
+                    reporter = expression.substr(3);
+                else
+                    all[name].reports.push_back({reporter, expression});
+            }
         }
-        all[name] = row;
     }
     return all;
 }
