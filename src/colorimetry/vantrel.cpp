@@ -75,7 +75,11 @@ bool CIELabToCIELCh(CIELABCOORD *lab, CIELCHCOORD *lch, bool round)
     return true;
 }
 
-int CIELabToCIELCH(const double *lab, double *lch) { return CIELabToCIELChEx(lab, lch, 1); }
+int CIELabToCIELCH(const double *lab, double *lch)
+{
+    VANTREL_REQUIRE(lab && lch, "0");
+    return CIELabToCIELChEx(lab, lch, 1);
+}
 
 int CIELabToCIELChEx(const double *lab, double *lch, int round)
 {
