@@ -5,6 +5,7 @@
 #include <array>
 #include <cstddef>
 #include <string>
+#include <string_view>
 #include <utility>
 #include <vector>
 
@@ -28,6 +29,7 @@ struct Source {
 };
 
 struct Measurement {
+    std::string file;           // its name, safe to print
     std::vector<Patch> patches; // at least one
     Source source;
     std::vector<std::string> warnings; // one line each, without the file name
@@ -38,5 +40,16 @@ struct InputError {
     std::size_t line;
     std::string reason;
 };
+
+// A request that cannot be met: the message.
+struct RequestError {
+    std::string message;
+};
+
+// The first patch of this name, or else of this id; null where there is none.
+const Patch *find_patch(const Measurement &sheet, std::string_view name);
+
+// find_patch(); throws RequestError.
+const Patch &patch_named(const Measurement &sheet, std::string_view name);
 
 #endif

@@ -16,6 +16,26 @@ constexpr std::string_view illuminants[] = {
 };
 static_assert(std::size(illuminants) == NUM_ILLUM_OBS);
 
+// In the order of the statuses.
+constexpr std::string_view statuses[] = {
+    "A_STATUS",         "E_STATUS",    "I_STATUS",          "T_STATUS",    "SPECTRAL_STATUS",
+    "SPECTRALX_STATUS", "HIFI_STATUS", "HEXACHROME_STATUS", "CCR1_STATUS", "CCR2_STATUS",
+};
+static_assert(std::size(statuses) == NUM_STATUSES);
+
+// In the order of the responses.
+constexpr struct {
+    std::string_view name;
+    std::string_view code;
+} responses[] = {
+    {"Visual", "V"},  {"Red", "R"},           {"Green", "G"},
+    {"Blue", "B"},    {"HiFi 1", "H1"},       {"HiFi 2", "H2"},
+    {"HiFi 3", "H3"}, {"Hexachrome 1", "X1"}, {"Hexachrome 2", "X2"},
+};
+static_assert(std::size(responses) == NUM_RESPONSES);
+
+bool is_band(int status, int response) { return status == SPECTRALX_STATUS && response != 0; }
+
 } // namespace
 
 std::optional<ILLUM_OBS> illuminant_named(std::string_view name)
@@ -29,3 +49,32 @@ std::optional<ILLUM_OBS> illuminant_named(std::string_view name)
 std::string_view name_of(ILLUM_OBS illuminant) { return illuminants[illuminant]; }
 
 std::string illuminant_names() { return fmt::format("{}", fmt::join(illuminants, ", ")); }
+
+std::optional<int> status_named(std::string_view name)
+{
+    for (int i = 0; i < NUM_STATUSES; ++i)
+        if (equal_ignoring_case(statuses[i], name) ||
+            equal_ignoring_case(statuses[i], std::string(name) + "_STATUS"))
+            return i;
+    return std::nullopt;
+}
+
+std::string_view status_name(int status) { return statuses[status]; }
+
+std::string status_names() { return fmt::format("{}", fmt::join(statuses, ", ")); }
+
+std::string response_name(int status, int response)
+{
+    if (status == SPECTRAL_STATUS)
+        return fmt::format("{} nm", response);
+    return is_band(status, response) ? fmt::format("band {}", response)
+                                     : std::string(responses[response].name);
+}
+
+std::string response_code(int status, int response)
+{
+    if (status == SPECTRAL_STATUS)
+        return fmt::format("{}", response);
+    return is_band(status, response) ? fmt::format("b{}", response)
+                                     : std::string(responses[response].code);
+}

@@ -8,8 +8,19 @@
 
 #include <vantrel.h>
 
-std::optional<ILLUM_OBS> illuminant_named(std::string_view name); // in any case
+// All names come separated by ", "; each is looked up in any case.
+
+std::optional<ILLUM_OBS> illuminant_named(std::string_view name);
 std::string_view name_of(ILLUM_OBS illuminant);
-std::string illuminant_names(); // all of them, separated by ", "
+std::string illuminant_names();
+
+std::optional<int> status_named(std::string_view name); // E_STATUS, or E for short
+std::string_view status_name(int status);
+std::string status_names();
+
+// What DetermineDensityResponse() gave under a status: Visual, Red, … HiFi 1, Hexachrome 2, 560 nm,
+// band 14; the code is V, R, … H1, X2, 560, b14.
+std::string response_name(int status, int response);
+std::string response_code(int status, int response);
 
 #endif

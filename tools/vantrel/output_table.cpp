@@ -1,21 +1,34 @@
 #include <algorithm>
 #include <cmath>
 #include <iterator>
+#include <optional>
+#include <utility>
 
 #include <fmt/format.h>
 
 #include "names.h"
+#include "predict.h"
 #include "report.h"
 #include "text.h"
 
 namespace {
 
 constexpr std::size_t widest_name = 40;
+constexpr std::size_t widest_in_text = 30; // a line has 120 columns
 
-// Two decimals without a minus before zero.
-std::string fixed(double value)
+// Without a minus before zero; nothing stays blank.
+std::string fixed(const std::optional<double> &value, int decimals = 2)
 {
-    return fmt::format("{:.2f}", std::abs(value) < 0.005 ? 0.0 : value);
+    if (!value)
+        return "";
+    std::string out = fmt::format("{:.{}f}", *value, decimals);
+    return out.find_first_of("123456789in") == std::string::npos && out[0] == '-' ? out.substr(1)
+                                                                                  : out;
+}
+
+std::string fixed(const CIELABCOORD &lab)
+{
+    return fmt::format("{} {} {}", fixed(lab.L), fixed(lab.a), fixed(lab.b));
 }
 
 std::size_t characters(const std::string &text)
@@ -24,36 +37,187 @@ std::size_t characters(const std::string &text)
         std::count_if(text.begin(), text.end(), [](char c) { return (c & 0xC0) != 0x80; }));
 }
 
+std::string swatch(const Rgb &rgb)
+{
+    return fmt::format("\x1b[48;2;{};{};{}m    \x1b[0m", rgb.red, rgb.green, rgb.blue);
+}
+
+// Collects lines, none of them with spaces at its end.
+class Lines {
+public:
+    void add(std::string line)
+    {
+        line.resize(line.find_last_not_of(' ') + 1);
+        out += line + '\n';
+    }
+    std::string out;
+};
+
+void add_head(Lines &lines, const Report &report)
+{
+    const std::string paper = cut(report.paper.name, widest_in_text);
+    lines.add(fmt::format("{}: {} patches", report.file, report.patches.size()));
+    lines.add(fmt::format("{}, {}, ΔE00 and density over {}, dot area with n = {:g}",
+                          name_of(report.illuminant), status_name(report.status), paper,
+                          report.n_factor));
+    const Source &source = report.source;
+    if (source.first_nm != 400 || source.last_nm != 700 || source.bands != VANTREL_BANDS)
+        lines.add(
+            fmt::format("Of {} values from {:g} to {:g} nm, the 31 from 400 to 700 nm are used",
+                        source.bands, source.first_nm, source.last_nm));
+    if (source.scaled)
+        lines.add("The file's reflectance factors are brought to percent");
+}
+
+void add_patches(Lines &lines, const Report &report, std::size_t width, bool colour)
+{
+    lines.add("");
+    lines.add(fmt::format("{:<{}} {}{:>8}{:>8}{:>8}{:>8}{:>8}{:>8}{:>4}{:>7}{:>7}{:>7}", "Patch",
+                          width, colour ? "    " : "", "L*", "a*", "b*", "C*", "h", "ΔE00", "", "D",
+                          "Area", "Gain"));
+    for (const PatchReport &patch : report.patches) {
+        const CIELABCOORD &lab = patch.colour.lab;
+        std::string line = fmt::format("{:<{}} {}", cut(patch.name, widest_name), width,
+                                       colour ? swatch(patch.colour.rgb) : "");
+        for (const double value : {lab.L, lab.a, lab.b, patch.lch.C, patch.lch.h, patch.to_paper})
+            line += fmt::format("{:>8}", fixed(value));
+        lines.add(line +
+                  fmt::format("{:>4}{:>7}{:>7}{:>7}",
+                              patch.response ? response_code(report.status, *patch.response) : "",
+                              fixed(patch.density, 3), fixed(patch.dot_area),
+                              fixed(patch.dot_gain)));
+    }
+}
+
+void add_paper(Lines &lines, const Report &report)
+{
+    const PaperReport &paper = report.paper;
+    lines.add("");
+    lines.add(
+        fmt::format("Paper: brightness {}, whiteness {}, L*a*b* {}", fixed(paper.brightness),
+                    paper.whiteness ? fixed(paper.whiteness) : "none (" + paper.no_whiteness + ")",
+                    fixed(paper.lab)));
+    if (const auto &metamerism = report.metamerism)
+        lines.add(fmt::format("Metamerism against {}: {} (ΔE*ab under {} plus {}), DIN 6172 {}",
+                              cut(metamerism->paper, widest_in_text), fixed(metamerism->sum),
+                              name_of(report.illuminant), name_of(metamerism->illuminant),
+                              fixed(metamerism->din6172)));
+}
+
+struct Column {
+    const char *title;
+    std::optional<double> PatchReport::*value;
+    int decimals = 2;
+};
+
+// A short table of the patches that have a value in the first column.
+void add_block(Lines &lines, const Report &report, const char *title, std::size_t width,
+               const std::vector<Column> &columns)
+{
+    bool any = false;
+    for (const PatchReport &patch : report.patches) {
+        if (!(patch.*columns[0].value))
+            continue;
+        if (!std::exchange(any, true)) {
+            std::string head = fmt::format("\n{:<{}}", title, width);
+            for (const Column &column : columns)
+                head += fmt::format("{:>12}", column.title);
+            lines.add(head);
+        }
+        std::string line = fmt::format("{:<{}}", cut(patch.name, widest_name), width);
+        for (const Column &column : columns)
+            line += fmt::format("{:>12}", fixed(patch.*column.value, column.decimals));
+        lines.add(line);
+    }
+}
+
+std::string inks_of(const Prediction &prediction)
+{
+    std::string out;
+    for (const InkTint &ink : prediction.inks)
+        out += fmt::format("{}{} {} %", out.empty() ? "" : " + ", cut(ink.name, widest_in_text),
+                           ink.percent);
+    return out;
+}
+
+std::string colour_columns(const Colour &shown, bool colour)
+{
+    return fmt::format(" {}{:>7}{:>7}{:>7}", colour ? swatch(shown.rgb) : "", fixed(shown.lab.L),
+                       fixed(shown.lab.a), fixed(shown.lab.b));
+}
+
+// The mean and the largest difference of one model.
+std::string summary(const Predictions &predictions, const char *name, Estimate Prediction::*model)
+{
+    double sum = 0, largest = 0;
+    for (const Prediction &prediction : predictions.all) {
+        const double delta_e = (prediction.*model).to_measured.value_or(0);
+        sum += delta_e;
+        largest = std::max(largest, delta_e);
+    }
+    return fmt::format("{}: mean ΔE00 {}, largest {}", name,
+                       fixed(sum / static_cast<double>(predictions.all.size())), fixed(largest));
+}
+
 } // namespace
 
 std::string as_table(const Report &report, bool colour)
 {
-    std::string out =
-        fmt::format("{}: {} patches, {}, ΔE00 to {}\n", report.file, report.patches.size(),
-                    name_of(report.illuminant), cut(report.paper, widest_name));
-    const Source &source = report.source;
-    if (source.first_nm != 400 || source.last_nm != 700 || source.bands != VANTREL_BANDS)
-        out +=
-            fmt::format("Of {} values from {:g} to {:g} nm, the 31 from 400 to 700 nm are used\n",
-                        source.bands, source.first_nm, source.last_nm);
-    if (source.scaled)
-        out += "The file's reflectance factors are brought to percent\n";
-
-    std::size_t width = 5;
+    std::size_t width = 10;
     for (const PatchReport &patch : report.patches)
         width = std::max(width, characters(cut(patch.name, widest_name)));
-    const auto put = std::back_inserter(out);
-    fmt::format_to(put, "\n{:<{}} {}{:>8}{:>8}{:>8}{:>8}{:>8}{:>8}\n", "Patch", width,
-                   colour ? "    " : "", "L*", "a*", "b*", "C*", "h", "ΔE00");
-    for (const PatchReport &patch : report.patches) {
-        fmt::format_to(put, "{:<{}} ", cut(patch.name, widest_name), width);
-        if (colour)
-            fmt::format_to(put, "\x1b[48;2;{};{};{}m    \x1b[0m", patch.red, patch.green,
-                           patch.blue);
-        for (const double value :
-             {patch.lab.L, patch.lab.a, patch.lab.b, patch.lch.C, patch.lch.h, patch.to_paper})
-            fmt::format_to(put, "{:>8}", fixed(value));
-        out += '\n';
+    Lines lines;
+    add_head(lines, report);
+    add_patches(lines, report, width, colour);
+    add_paper(lines, report);
+    add_block(lines, report, "Solids", width,
+              {{"hue error", &PatchReport::hue_error},
+               {"grayness", &PatchReport::grayness},
+               {"density", &PatchReport::density, 3}});
+    add_block(lines, report, "Overprints", width, {{"trap", &PatchReport::trap}});
+    add_block(lines, report, "Shadows", width, {{"contrast", &PatchReport::print_contrast}});
+    if (report.inks.size() > 1)
+        lines.add(fmt::format("\nInks print in the order {}", fmt::join(report.inks, ", ")));
+    return lines.out;
+}
+
+std::string as_table(const Predictions &predictions, bool colour)
+{
+    const std::size_t widest = colour ? 26 : 38; // 120 columns in all
+    const auto title = [&](const Prediction &prediction) {
+        return cut(prediction.measured ? prediction.measured->patch : inks_of(prediction), widest);
+    };
+    std::size_t width = 11;
+    for (const Prediction &prediction : predictions.all)
+        width = std::max(width, characters(title(prediction)));
+    Lines lines;
+    lines.add(fmt::format("{}: {}, on {}", predictions.file, name_of(predictions.illuminant),
+                          cut(predictions.paper, widest_name)));
+    if (predictions.all.size() == 1)
+        lines.add(inks_of(predictions.all[0]));
+    const std::string gap = colour ? "    " : "";
+    const std::string lab = fmt::format(" {}{:>7}{:>7}{:>7}", gap, "L*", "a*", "b*");
+    lines.add(fmt::format("\n{:<{}} {}{:>28} {}{:>28} {}{:>21}", "", width, gap, "Halftone", gap,
+                          "Film", gap, "Measured"));
+    lines.add(
+        fmt::format("{:<{}}{}{:>7}{}{:>7}{}", "Combination", width, lab, "ΔE00", lab, "ΔE00", lab));
+    for (const Prediction &prediction : predictions.all) {
+        std::string line = fmt::format("{:<{}}", title(prediction), width);
+        for (const Estimate *estimate : {&prediction.halftone, &prediction.film})
+            line += colour_columns(estimate->colour, colour) +
+                    fmt::format("{:>7}", fixed(estimate->to_measured));
+        if (prediction.measured)
+            line += colour_columns(prediction.measured->colour, colour);
+        lines.add(line);
     }
-    return out;
+    if (predictions.all.size() > 1) { // every one of them measured
+        lines.add("");
+        lines.add(summary(predictions, "Halftone", &Prediction::halftone));
+        lines.add(summary(predictions, "Film", &Prediction::film));
+    }
+    if (predictions.left_out)
+        lines.add(fmt::format("Left out: {} overprints of more than three inks, of fractions of a "
+                              "percent, or without a solid",
+                              predictions.left_out));
+    return lines.out;
 }

@@ -1,51 +1,120 @@
 #include "report.h"
 
+#include <fmt/format.h>
+
+#include "densitometer.h"
+#include "names.h"
+
 namespace {
 
-CIELABCOORD lab_of(const Spectrum &refl, ILLUM_OBS illuminant)
+// A gain is never negative: a tint that prints too light has none.
+double gain_of(double dot_area, double nominal)
 {
-    double lab[3];
-    ReflToCIELAB(refl.data(), illuminant, lab);
-    return {lab[0], lab[1], lab[2]};
+    return dot_area >= nominal ? dot_area - nominal : 0;
 }
 
-CIELCHCOORD lch_of(const CIELABCOORD &lab)
+void measure_tint(PatchReport &row, const Patch &patch, const Patch &solid, double nominal,
+                  const Densitometer &densitometer, double n_factor)
 {
-    const double from[3] = {lab.L, lab.a, lab.b};
-    double lch[3];
-    CIELabToCIELCH(from, lch);
-    return {lch[0], lch[1], lch[2]};
+    row.dot_area = densitometer.dot_area(solid.refl, patch.refl, n_factor);
+    if (row.dot_area)
+        row.dot_gain = gain_of(*row.dot_area, nominal);
+    if (nominal >= 75 && nominal <= 80)
+        row.print_contrast = densitometer.print_contrast(solid.refl, patch.refl);
 }
 
-PatchReport patch_report(const Patch &patch, ILLUM_OBS illuminant, const CIELABCOORD &paper)
+// The attributes that need to know with which inks the patch was printed.
+void measure_inks(PatchReport &row, const Patch &patch, const Inks &inks,
+                  const Densitometer &densitometer, double n_factor)
+{
+    const auto tints = inks.tints_of(patch);
+    if (inks.ink_of_solid(patch)) {
+        if (const auto measured = densitometer.hue_gray(patch.refl)) {
+            row.hue_error = measured->hue_error;
+            row.grayness = measured->grayness;
+        }
+    } else if (tints && tints->size() == 1) {
+        if (const Patch *solid = inks.solid((*tints)[0].ink))
+            measure_tint(row, patch, *solid, (*tints)[0].percent, densitometer, n_factor);
+    } else if (tints && tints->size() == 2 && (*tints)[0].percent == 100 &&
+               (*tints)[1].percent == 100) {
+        const Patch *first = inks.solid((*tints)[0].ink);
+        const Patch *second = inks.solid((*tints)[1].ink);
+        if (first && second)
+            row.trap = densitometer.trap(first->refl, second->refl, patch.refl);
+    }
+}
+
+PatchReport patch_report(const Patch &patch, const Inks &inks, const Request &request,
+                         const CIELABCOORD &paper)
 {
     PatchReport row;
     row.id = patch.id;
     row.name = patch.name;
     row.device = patch.device;
-    row.lab = lab_of(patch.refl, illuminant);
-    row.lch = lch_of(row.lab);
-    LabToDE2000(&paper, &row.lab, 1, 1, &row.to_paper);
-    unsigned int rgb = 0;
-    ReflToRGB(patch.refl.data(), illuminant, &rgb);
-    row.red = rgb & 0xFF;
-    row.green = rgb >> 8 & 0xFF;
-    row.blue = rgb >> 16 & 0xFF;
+    row.colour = colour_of(patch.refl, request.illuminant);
+    row.to_paper = delta_e00(paper, row.colour.lab);
+    const double lab[3] = {row.colour.lab.L, row.colour.lab.a, row.colour.lab.b};
+    double lch[3];
+    CIELabToCIELCH(lab, lch);
+    row.lch = {lch[0], lch[1], lch[2]};
+
+    const Densitometer densitometer(request.paper->refl, request.status);
+    row.response = densitometer.response(patch.refl);
+    if (row.response)
+        row.density = densitometer.density(patch.refl, *row.response);
+    measure_inks(row, patch, inks, densitometer, request.n_factor);
     return row;
+}
+
+PaperReport paper_report(const Patch &paper, ILLUM_OBS illuminant)
+{
+    PaperReport out{.name = paper.name,
+                    .lab = colour_of(paper.refl, illuminant).lab,
+                    .brightness = 0,
+                    .whiteness = {},
+                    .no_whiteness = {}};
+    ReflToBrightness(paper.refl.data(), &out.brightness);
+    double whiteness = 0;
+    if (ReflToWhiteE313_98(paper.refl.data(), illuminant, &whiteness))
+        out.whiteness = whiteness;
+    else if (illuminant < C_2DEG || illuminant > D65_10DEG)
+        out.no_whiteness =
+            fmt::format("under {}: ASTM E313 has C, D50 and D65 alone", name_of(illuminant));
+    else
+        out.no_whiteness = "outside its limits, 40 < W < 5 Y - 280";
+    return out;
+}
+
+MetamerismReport metamerism_of(const Request &request)
+{
+    MetamerismReport out{.paper = request.second_paper->name,
+                         .illuminant = request.second_illuminant,
+                         .sum = 0,
+                         .din6172 = 0};
+    const double *first = request.paper->refl.data();
+    const double *second = request.second_paper->refl.data();
+    Metamerism(first, second, request.illuminant, out.illuminant, &out.sum);
+    ReflToDIN6172(first, second, request.illuminant, out.illuminant, &out.din6172);
+    return out;
 }
 
 } // namespace
 
-Report report_of(const Measurement &sheet, const std::string &file, ILLUM_OBS illuminant,
-                 const Patch &paper)
+Report report_of(const Measurement &sheet, const Inks &inks, const Request &request)
 {
-    Report report{.file = file,
-                  .illuminant = illuminant,
-                  .paper = paper.name,
+    Report report{.file = sheet.file,
+                  .illuminant = request.illuminant,
+                  .status = request.status,
+                  .n_factor = request.n_factor,
+                  .inks = inks.names(),
                   .source = sheet.source,
+                  .paper = paper_report(*request.paper, request.illuminant),
+                  .metamerism = {},
                   .patches = {}};
-    const CIELABCOORD paper_lab = lab_of(paper.refl, illuminant);
+    if (request.second_paper)
+        report.metamerism = metamerism_of(request);
     for (const Patch &patch : sheet.patches)
-        report.patches.push_back(patch_report(patch, illuminant, paper_lab));
+        report.patches.push_back(patch_report(patch, inks, request, report.paper.lab));
     return report;
 }

@@ -1,0 +1,25 @@
+#include "colour.h"
+
+#include <fmt/format.h>
+
+Colour colour_of(const Spectrum &refl, ILLUM_OBS illuminant)
+{
+    double lab[3];
+    ReflToCIELAB(refl.data(), illuminant, lab);
+    unsigned int rgb = 0;
+    ReflToRGB(refl.data(), illuminant, &rgb);
+    const auto level = [&](int shift) { return static_cast<std::uint8_t>(rgb >> shift & 0xFF); };
+    return {{lab[0], lab[1], lab[2]}, {level(0), level(8), level(16)}};
+}
+
+double delta_e00(const CIELABCOORD &first, const CIELABCOORD &second)
+{
+    double delta_e = 0;
+    LabToDE2000(&first, &second, 1, 1, &delta_e);
+    return delta_e;
+}
+
+std::string hex(const Rgb &rgb)
+{
+    return fmt::format("#{:02x}{:02x}{:02x}", rgb.red, rgb.green, rgb.blue);
+}

@@ -1,0 +1,59 @@
+// What inks will measure as tints and over one another, beside what was measured.
+#ifndef VANTREL_TOOL_PREDICT_H
+#define VANTREL_TOOL_PREDICT_H
+
+#include <optional>
+#include <string>
+#include <vector>
+
+#include "colour.h"
+#include "inks.h"
+#include "measurement.h"
+
+struct InkTint {
+    std::string name; // of the solid's patch
+    int percent;
+};
+
+// One model's estimate.
+struct Estimate {
+    Spectrum refl{};
+    Colour colour;
+    std::optional<double> to_measured; // ΔE00
+};
+
+struct Measured {
+    std::string patch;
+    Colour colour;
+};
+
+struct Prediction {
+    std::vector<InkTint> inks; // in the order of printing
+    Estimate halftone;         // tints as ink and paper mixed by area
+    Estimate film;             // tints as thinner films
+    std::optional<Measured> measured;
+};
+
+struct Predictions {
+    std::string file;
+    ILLUM_OBS illuminant;
+    std::string paper;
+    std::vector<Prediction> all;
+    std::size_t left_out = 0; // measured overprints that cannot be predicted
+};
+
+// The combination that `wishes` name, each NAME:PERCENT, in the order of printing; throws
+// RequestError.
+Predictions predict(const Measurement &sheet, const Inks &inks, const Patch &paper,
+                    ILLUM_OBS illuminant, const std::vector<std::string> &wishes);
+
+// Every measured overprint of two or three inks; throws RequestError where there is none.
+Predictions predict_overprints(const Measurement &sheet, const Inks &inks, const Patch &paper,
+                               ILLUM_OBS illuminant);
+
+// The output formats; each gives the whole text.
+std::string as_table(const Predictions &predictions, bool colour);
+std::string as_csv(const Predictions &predictions);
+std::string as_json(const Predictions &predictions);
+
+#endif
