@@ -4,6 +4,7 @@ cd "$(dirname "${BASH_SOURCE[0]}")/.."
 
 build_packages=(cmake ninja-build g++ pkg-config
     libcli11-dev libfmt-dev nlohmann-json3-dev liblcms2-dev)
+fuzz_packages=(clang libclang-rt-14-dev)
 test_packages=(libgtest-dev clang clang-tidy clang-format doxygen binutils)
 
 # Installs those of the packages that the system does not have. Stops where it may not.

@@ -84,7 +84,15 @@ const std::vector<Function> kFunctions = {
          return ChooseBPWavelen(refl, bands ? points : nullptr, std::min(count, 3));
      }),
      "31 3 i"},
-    {"CalculateSpecialDensity", call(CalculateSpecialDensity), "31 i 5 i"},
+    // five weights, and zeros up to any width that fits into a spectrum
+    {"CalculateSpecialDensity",
+     call(+[](const double *refl, int centre, double *weights, int width) {
+         double all[VANTREL_BANDS] = {};
+         if (weights)
+             std::copy(weights, weights + 5, all);
+         return CalculateSpecialDensity(refl, centre, weights ? all : nullptr, width);
+     }),
+     "31 i 5 i"},
     {"SetSpectralXConstants", call(SetSpectralXConstants), "1! 1! 1! 1! 1!"},
     {"GetSpectralXConstants", call(GetSpectralXConstants), ">1? >1? >1? >1? >1?"},
     {"IsChromatic", call(IsChromatic), "31 i"},

@@ -13,8 +13,9 @@
 #include <utility>
 #include <vector>
 
-/// One argument of a call. Arrays stand between guards; an output is filled with a pattern, so that
-/// what a function wrote, left alone, or wrote beyond the end can be told.
+/// One argument of a call. An output stands between guards and is filled with a pattern, so that
+/// what a function wrote, left alone, or wrote beyond the end can be told. An input has memory of
+/// just its size, so that AddressSanitizer sees what is read beyond it.
 struct Slot {
     std::vector<double> values; ///< an input, or what an output received
     std::string text;           ///< what an output of wide characters received
@@ -22,7 +23,11 @@ struct Slot {
     bool null = false;
     bool written = false;
     bool overrun = false;
+    const Slot *in_place = nullptr; ///< the input in whose array an output goes, if it is as large
     std::vector<std::byte> memory;
+
+    static constexpr std::size_t kGuard = 64;
+    static constexpr std::byte kPattern{0xA5};
 };
 
 /// How an argument is declared.
@@ -70,8 +75,16 @@ template <class P> struct Parameter {
     using Pointee = std::remove_cv_t<std::remove_pointer_t<std::remove_reference_t<P>>>;
     using Element = std::conditional_t<std::is_class_v<Pointee>, double, Pointee>;
     static constexpr bool is_value = !std::is_pointer_v<P> && !std::is_reference_v<P>;
-    static constexpr std::size_t kGuard = 64;
-    static constexpr std::byte kPattern{0xA5};
+    static void prepare(Slot &slot)
+    {
+        if constexpr (!is_value) {
+            const std::size_t guards = slot.output ? 2 * Slot::kGuard : 0;
+            slot.memory.assign(slot.values.size() * sizeof(Element) + guards, Slot::kPattern);
+            if (!slot.output)
+                std::transform(slot.values.begin(), slot.values.end(), array(slot),
+                               element_of<Element>);
+        }
+    }
 
     static P pass(Slot &slot)
     {
@@ -80,11 +93,7 @@ template <class P> struct Parameter {
         } else if constexpr (is_value) {
             return static_cast<P>(static_cast<long long>(slot.values.at(0)));
         } else {
-            slot.memory.assign(slot.values.size() * sizeof(Element) + 2 * kGuard, kPattern);
-            auto *array = reinterpret_cast<Element *>(&slot.memory[kGuard]);
-            if (!slot.output)
-                std::transform(slot.values.begin(), slot.values.end(), array, element_of<Element>);
-            auto *pointer = reinterpret_cast<Pointee *>(array);
+            auto *pointer = reinterpret_cast<Pointee *>(array(slot));
             if constexpr (std::is_reference_v<P>)
                 return *pointer;
             else
@@ -97,27 +106,38 @@ template <class P> struct Parameter {
         if constexpr (!is_value) {
             if (!slot.output)
                 return;
-            const auto touched = [](std::byte b) { return b != kPattern; };
-            const auto begin = slot.memory.begin() + kGuard, end = slot.memory.end() - kGuard;
+            const auto touched = [](std::byte b) { return b != Slot::kPattern; };
+            const auto begin = slot.memory.begin() + Slot::kGuard;
+            const auto end = slot.memory.end() - Slot::kGuard;
             slot.overrun = std::any_of(slot.memory.begin(), begin, touched) ||
                            std::any_of(end, slot.memory.end(), touched);
             slot.written = std::any_of(begin, end, touched);
-            const auto *array = reinterpret_cast<const Element *>(&slot.memory[kGuard]);
+            const Element *result = array(slot);
             if constexpr (std::is_same_v<Element, wchar_t>)
-                for (std::size_t i = 0; slot.written && i < slot.values.size() && array[i]; ++i)
-                    slot.text += static_cast<char>(array[i]);
+                for (std::size_t i = 0; slot.written && i < slot.values.size() && result[i]; ++i)
+                    slot.text += static_cast<char>(result[i]);
             else
-                std::copy(array, array + slot.values.size(), slot.values.begin());
+                std::copy(result, result + slot.values.size(), slot.values.begin());
         }
+    }
+
+    static Element *array(const Slot &slot)
+    {
+        const bool shared =
+            slot.in_place && slot.in_place->memory.size() == slot.values.size() * sizeof(Element);
+        const std::byte *begin = shared        ? slot.in_place->memory.data()
+                                 : slot.output ? slot.memory.data() + Slot::kGuard
+                                               : slot.memory.data();
+        return reinterpret_cast<Element *>(const_cast<std::byte *>(begin));
     }
 };
 
 /// The four curves of 31 weights, one after the other.
 template <> struct Parameter<const POLWEIGHTSTRUCT *> {
+    static void prepare(Slot &slot) { slot.memory.resize(sizeof(POLWEIGHTSTRUCT)); }
     static const POLWEIGHTSTRUCT *pass(Slot &slot)
     {
         const double *curve = slot.values.data();
-        slot.memory.resize(sizeof(POLWEIGHTSTRUCT));
         return new (slot.memory.data()) POLWEIGHTSTRUCT{curve, curve + 31, curve + 62, curve + 93};
     }
     static void take_back(Slot &) {}
@@ -129,6 +149,7 @@ template <class R, class... P> std::function<double(std::vector<Slot> &)> call(R
         return [&]<std::size_t... I>(std::index_sequence<I...>)
         {
             double result = 1;
+            (Parameter<P>::prepare(slots.at(I)), ...);
             if constexpr (std::is_void_v<R>)
                 function(Parameter<P>::pass(slots.at(I))...);
             else

@@ -130,6 +130,8 @@ TEST(Report, RefusesBadFilesInOneLine)
          ":7: no value at 400 nm in spectra of 31 values from 405 to 700 nm; every 10 nm from 400 "
          "to 700 is needed"},
         {replaced(good, "SPECTRAL_NM410", "R_400"), ":7: 400 nm occurs twice in a spectrum"},
+        {replaced(content(data + "tables_fine_steps.txt"), "\"1.0\"", "\"1e-320\""),
+         ":15: a value is too large in percent"},
         {replaced(content(data + "pairs_decimal_comma.txt"), "\t700\t", "\t699\t"),
          ":11: no value at 700 nm in spectra of 36 values from 380 to 730 nm; every 10 nm from 400 "
          "to 700 is needed"},

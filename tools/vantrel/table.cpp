@@ -210,8 +210,11 @@ Measurement measurement_of(const Table &table)
     const double factor = percent_factor(table, pairs, sheet.patches);
     sheet.source.scaled = factor != 1;
     if (sheet.source.scaled)
-        for (Patch &patch : sheet.patches)
-            for (double &value : patch.refl)
+        for (std::size_t row = 0; row < sheet.patches.size(); ++row)
+            for (double &value : sheet.patches[row].refl) {
                 value *= factor;
+                if (!std::isfinite(value))
+                    throw InputError{table.row_lines[row], "a value is too large in percent"};
+            }
     return sheet;
 }

@@ -1,0 +1,52 @@
+// Hands arbitrary bytes to the reader of measurement files, and stops where it neither refuses them
+// in one printable line nor hands on a sheet that can be measured and printed.
+#include "cgats.h"
+#include "text.h"
+
+#include <algorithm>
+#include <cmath>
+#include <cstdint>
+#include <cstdio>
+#include <cstdlib>
+
+namespace {
+
+void require(bool holds, const char *fault)
+{
+    if (holds)
+        return;
+    std::fprintf(stderr, "FAULT: %s\n", fault);
+    std::abort();
+}
+
+bool finite(double value) { return std::isfinite(value); }
+bool is_printable(const std::string &text) { return printable(text) == text; }
+
+void check(const Measurement &sheet)
+{
+    require(!sheet.patches.empty(), "a sheet without patches");
+    for (const Patch &patch : sheet.patches) {
+        require(std::all_of(patch.refl.begin(), patch.refl.end(), finite), "a band is not finite");
+        require(!patch.id.empty() && is_printable(patch.id), "an id cannot be printed");
+        require(!patch.name.empty() && is_printable(patch.name), "a name cannot be printed");
+        for (const auto &[field, value] : patch.device)
+            require(finite(value) && is_printable(field), "a device value cannot be printed");
+    }
+    require(sheet.source.bands >= VANTREL_BANDS && sheet.source.first_nm <= 400 &&
+                sheet.source.last_nm >= 700,
+            "fewer bands than a spectrum has");
+    require(std::all_of(sheet.warnings.begin(), sheet.warnings.end(), is_printable),
+            "a warning cannot be printed");
+}
+
+} // namespace
+
+extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t *data, std::size_t size)
+{
+    try {
+        check(read_cgats({reinterpret_cast<const char *>(data), size}));
+    } catch (const InputError &error) {
+        require(!error.reason.empty() && is_printable(error.reason), "a reason cannot be printed");
+    }
+    return 0;
+}
