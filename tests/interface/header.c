@@ -1,4 +1,6 @@
 /* A host in C99: the header compiles without a warning, and a function of every group links. */
+#include "layout.h"
+
 #include <vantrel.h>
 
 int main(void)

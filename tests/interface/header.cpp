@@ -1,4 +1,6 @@
 // A host in C++11: the header compiles without a warning, and what only C++ sees links.
+#include "layout.h"
+
 #include <vantrel.h>
 
 int main()
