@@ -424,7 +424,7 @@ VANTREL_API int ReflToDensities(const double *refl, const double *paper, int sta
 VANTREL_API int ReflToDensitiesNoPaper(const double *refl, int status, DENSITYSTRUCT *densities);
 
 /**
- * Which response reads this ink: the visual one for what IsChromatic() under #D65_10DEG calls
+ * Which response reads this ink: the visual one for what IsChromatic() under D65_10DEG calls
  * neutral, else the one of the largest density. The third HiFi ink is told from cyan by a hue error
  * above 39.5 %, the Hexachrome inks from yellow by one above 30 %, and from one another by their
  * hue (the second between 90 and 270 degrees). With a paper the spectrum is first sharpened by
