@@ -42,19 +42,18 @@ constexpr bool rows_in_order()
 }
 static_assert(rows_in_order());
 
-// A column, in thousandths: a digit that slips changes its sum.
-constexpr int column_sum(double (*value)(const Illuminant &))
+// A digit that slips changes the sum of its column.
+constexpr bool adds_up(double (*value)(const Illuminant &), double sum)
 {
-    int sum = 0;
     for (const Row &row : kIlluminants)
-        sum += static_cast<int>(value(row.illuminant) * 1000 + 0.5);
-    return sum;
+        sum -= value(row.illuminant);
+    return -1e-9 < sum && sum < 1e-9;
 }
-static_assert(column_sum([](const Illuminant &i) { return i.white.x; }) == 1806355);
-static_assert(column_sum([](const Illuminant &i) { return i.white.y; }) == 1800002);
-static_assert(column_sum([](const Illuminant &i) { return i.white.z; }) == 1490996);
-static_assert(column_sum([](const Illuminant &i) { return i.ka; }) == 3184800);
-static_assert(column_sum([](const Illuminant &i) { return i.kb; }) == 1033910);
+static_assert(adds_up([](const Illuminant &i) { return i.white.x; }, 1806.355));
+static_assert(adds_up([](const Illuminant &i) { return i.white.y; }, 1800.002));
+static_assert(adds_up([](const Illuminant &i) { return i.white.z; }, 1490.996));
+static_assert(adds_up([](const Illuminant &i) { return i.ka; }, 3184.80));
+static_assert(adds_up([](const Illuminant &i) { return i.kb; }, 1033.91));
 
 } // namespace
 
