@@ -202,20 +202,24 @@ List read_list(const std::string &file)
     std::ifstream in(file);
     for (std::string line; std::getline(in, line);) {
         std::istringstream words(line);
-        std::string key, name;
+        std::string key;
         if (!(words >> key) || key == "#")
             continue;
         if (key == "digest") {
             words >> std::hex >> list.digest;
-        } else if (key == "bound") {
+            continue;
+        }
+        if (key == "bound") {
             words >> list.bound;
-        } else if (words >> name && missing.erase(name)) {
+            continue;
+        }
+        for (std::string name; words >> name;) {
+            if (!missing.erase(name))
+                throw std::runtime_error(file + ": no such function, or twice: " + name);
             const bool exact = key == "exact";
             (exact ? list.exact : list.libm).push_back(find_function(name));
             if (!exact)
                 list.scales[name] = std::stod(key);
-        } else {
-            throw std::runtime_error(file + ": no such function, or twice: " + line);
         }
     }
     for (const std::string &name : missing)
