@@ -14,10 +14,10 @@ std::optional<double> print_contrast(double Ds, double Dt)
 std::optional<double> print_contrast(Spectrum solid, Spectrum tint, Paper paper, int status,
                                      int response)
 {
-    const auto densities = patch_densities<2>({solid, tint}, paper, status, response);
+    const auto densities = patch_densities({solid, tint}, paper, status, response);
     if (!densities)
         return std::nullopt;
-    const auto [Ds, Dt] = *densities;
+    const auto [Ds, Dt, unused] = *densities;
     return print_contrast(Ds, Dt);
 }
 
@@ -31,7 +31,7 @@ std::optional<double> trap(double Dop, double D2, double D1)
 std::optional<double> trap(Spectrum second, Spectrum first, Spectrum overprint, Paper paper,
                            int status, int response)
 {
-    const auto densities = patch_densities<3>({second, first, overprint}, paper, status, response);
+    const auto densities = patch_densities({second, first, overprint}, paper, status, response);
     if (!densities)
         return std::nullopt;
     const auto [D2, D1, Dop] = *densities;

@@ -24,10 +24,10 @@ double tint_density(double Ds, double dot_area, double n)
 std::optional<double> dot_area(Spectrum solid, Spectrum tint, Paper paper, int status, int response,
                                double n)
 {
-    const auto densities = patch_densities<2>({solid, tint}, paper, status, response);
+    const auto densities = patch_densities({solid, tint}, paper, status, response);
     if (!densities || n == 0)
         return std::nullopt;
-    const auto [Ds, Dt] = *densities;
+    const auto [Ds, Dt, unused] = *densities;
     return dot_area(Ds, Dt, n);
 }
 
