@@ -1,5 +1,6 @@
 #include "golden.h"
 
+#include <algorithm>
 #include <climits>
 #include <filesystem>
 #include <fstream>
@@ -79,6 +80,11 @@ Named read_names()
 GoldenCase parse_case(std::vector<std::string> words)
 {
     GoldenCase result;
+    if (const auto mark = std::ranges::find(words, "!"); mark != words.end()) {
+        for (auto word = mark + 1; word != words.end(); ++word)
+            result.reported += (result.reported.empty() ? "" : " ") + *word;
+        words.erase(mark, words.end());
+    }
     if (words.size() > 2 && words[words.size() - 2] == "~") {
         result.tolerance = golden_values(words.back()).at(0);
         words.resize(words.size() - 2);

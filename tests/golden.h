@@ -12,6 +12,7 @@ struct GoldenCase {
     double returns = 1;
     std::vector<std::string> outputs; ///< what the line says of each output, in order
     std::optional<double> tolerance;  ///< absolute; without one, 1e-12 relative
+    std::string reported; ///< what the checking build says is violated; empty for nothing
 };
 
 /// The cases of every file; throws std::runtime_error with file and line.

@@ -10,7 +10,7 @@
 namespace {
 
 struct Report {
-    std::string function, expression;
+    std::string reporter, expression;
 };
 
 struct Invariants {
@@ -42,6 +42,19 @@ std::map<std::string, Invariants> read_invariants()
     return all;
 }
 
+std::string reported_by(const Function &function, std::vector<Slot> &slots)
+{
+    testing::internal::CaptureStderr();
+    function.call(slots);
+    return testing::internal::GetCapturedStderr();
+}
+
+std::string line(const std::string &function, const std::string &file,
+                 const std::string &expression)
+{
+    return "vantrel: " + function + " (" + file + "): violated: " + expression + "\n";
+}
+
 } // namespace
 
 TEST(CheckingBuild, ReportsEveryRefusedArgumentInOneLine)
@@ -60,16 +73,26 @@ TEST(CheckingBuild, ReportsEveryRefusedArgumentInOneLine)
                 reports.size() == 1 ? reports[0] : reports.at(checked);
             ++checked;
             for (auto &slots : calls) {
-                testing::internal::CaptureStderr();
-                good.function->call(slots);
-                const std::string said = testing::internal::GetCapturedStderr();
-                if (expression == "-")
-                    EXPECT_EQ(said, "") << good.function->name << " argument " << i;
-                else
-                    EXPECT_EQ(said, "vantrel: " + reporter + " (" + file +
-                                        "): violated: " + expression + "\n")
-                        << good.function->name << " argument " << i;
+                EXPECT_EQ(reported_by(*good.function, slots),
+                          expression == "-" ? "" : line(reporter, file, expression))
+                    << good.function->name << " argument " << i;
             }
         }
+    }
+}
+
+TEST(CheckingBuild, ReportsWhatTheGoldenTablesSay)
+{
+    const auto invariants = read_invariants();
+    for (GoldenCase &golden : read_all_golden()) {
+        const std::string said = reported_by(*golden.function, golden.slots);
+        const std::string &wanted = golden.reported;
+        const std::size_t colon = wanted.find(": ");
+        const auto reporter =
+            colon < wanted.size() ? wanted.substr(0, colon) : golden.function->name;
+        const auto expression = colon < wanted.size() ? wanted.substr(colon + 2) : wanted;
+        EXPECT_EQ(said,
+                  wanted.empty() ? "" : line(reporter, invariants.at(reporter).file, expression))
+            << golden.where;
     }
 }
