@@ -3,6 +3,7 @@ notice. Prints the changes that they let pass, and the share that they killed.""
 
 import argparse
 import concurrent.futures
+import itertools
 import json
 import os
 import pathlib
@@ -15,6 +16,7 @@ import tempfile
 
 ROOT = pathlib.Path(__file__).resolve().parent.parent
 FIGURES_OF_A_ROW = 3  # of a row of a table only so many are changed, unless all are asked for
+FIGURES_OF_A_NUMBER = 12  # what the tests tell apart: they compare to a relative 1e-12
 SECONDS = 60  # a change that keeps the tests busy for longer is noticed
 
 # What is never changed: comments, text, the preprocessor's lines, assertions of the compiler.
@@ -33,8 +35,10 @@ NUMBER = re.compile(r"(?<![\w.])(?:0x[\da-fp]+|(\d+\.?\d*)(?:e[-+]?\d+)?)[fu]?(?
 
 
 def other_number(number):
-    """The last digit of the mantissa one up, or 8 for 9."""
-    last = max(i for i, c in enumerate(re.split("[epf]", number)[0] or number) if c.isdigit())
+    """The last digit of the mantissa, at most the twelfth, one up, or 8 for 9."""
+    digits = [i for i, c in enumerate(re.split("[epf]", number)[0] or number) if c.isdigit()]
+    leading = sum(1 for _ in itertools.takewhile(lambda i: number[i] == "0", digits[:-1]))
+    last = digits[leading:][:FIGURES_OF_A_NUMBER][-1]
     digit = 8 if number[last] == "9" else int(number[last]) + 1
     return number[:last] + str(digit) + number[last + 1:]
 
@@ -81,22 +85,23 @@ def succeeds(*command, seconds=None):
         return False
 
 
-def passes(tests):
-    return all(succeeds(tests, f"--gtest_filter={part}", "--gtest_fail_fast", seconds=SECONDS)
-               for part in ("Golden.*", "-Golden.*"))
-
-
 class Build:
     """The library and its tests, built once. A change compiles what it concerns, and links again."""
 
-    def __init__(self, folder):
+    # The tests, the quick ones first, and what has the objects of their programs.
+    PROGRAMS = {"tests/CMakeFiles/vantrel_tests.dir/": [
+                    ["--gtest_filter=Golden.*", "--gtest_fail_fast"],
+                    ["--gtest_filter=-Golden.*", "--gtest_fail_fast"]],
+                "tests/bits/CMakeFiles/bits.dir/": [[ROOT / "tests/bits/functions.txt", os.devnull]]}
+
+    def __init__(self, folder, *flags):
         self.folder = folder
-        subprocess.run(["nice", "ninja", "-C", folder, "-j2", "vantrel_tests"],
+        self.flags = flags
+        subprocess.run(["nice", "ninja", "-C", folder, "-j2", "vantrel_tests", "bits"],
                        check=True, stdout=subprocess.DEVNULL)
         listed = json.loads((folder / "compile_commands.json").read_text())
         commands = [shlex.split(entry["command"]) for entry in listed]
         self.commands = {c[c.index("-o") + 1]: c for c in commands}
-        self.tests = [o for o in self.commands if o.startswith("tests/CMakeFiles/vantrel_tests")]
         # Which files each object is made from, headers included.
         known = subprocess.run(["ninja", "-C", folder, "-t", "deps"], stdout=subprocess.PIPE,
                                text=True, check=True).stdout
@@ -105,25 +110,35 @@ class Build:
             self.sources[target.split(":")[0]] = {(folder / f.strip()).resolve() for f in files}
 
     def survives(self, change):
-        path, text, start, end, replacement = change
+        """Whether the tests pass with the change, or as things are with None."""
+        path, text, start, end, replacement = change or (None, "", 0, 0, "")
         with tempfile.TemporaryDirectory() as name:
             overlay = pathlib.Path(name)
-            changed = overlay / path.relative_to(ROOT)
-            changed.parent.mkdir(parents=True)
-            changed.write_text(text[:start] + replacement + text[end:])
-            objects = {target: self.folder / target for target in self.tests}
+            if change:
+                changed = overlay / path.relative_to(ROOT)
+                changed.parent.mkdir(parents=True)
+                changed.write_text(text[:start] + replacement + text[end:])
+            compiler = next(iter(self.commands.values()))[0]
+            objects = {target: self.folder / target for target in self.commands}
             for target, files in self.sources.items():
                 if path not in files:
                     continue
                 objects[target] = overlay / target.replace("/", ".")
-                compiler, *arguments = self.commands[target]
                 arguments = [{str(path): changed, target: objects[target]}.get(a, a)
-                             for a in arguments]
+                             for a in self.commands[target][1:]]
                 if not succeeds(compiler, f"-I{overlay / 'src'}", *arguments):
                     return False
-            tests = overlay / "tests"
-            return (succeeds(compiler, "-o", tests, *objects.values(), self.folder / "libVantrel.a",
-                             "-lgtest_main", "-lgtest", "-pthread") and passes(tests))
+            library = [o for t, o in objects.items() if t.startswith("CMakeFiles/Vantrel.dir/")]
+            for prefix, runs in self.PROGRAMS.items():
+                own = [o for t, o in objects.items() if t.startswith(prefix)]
+                program = overlay / "program"
+                # The tests have a file of the library in themselves: the first definition counts.
+                if not succeeds(compiler, *self.flags, "-Wl,-z,muldefs", "-o", program, *own,
+                                *library, "-lgtest_main", "-lgtest", "-pthread"):
+                    return False
+                if not all(succeeds(program, *run, seconds=SECONDS) for run in runs):
+                    return False
+            return True
 
 
 def main():
@@ -148,12 +163,18 @@ def main():
     if chosen.list:
         print(*map(described, changes), sep="\n")
         return
-    build = Build(ROOT / "build-mutate")
-    if not passes(build.folder / "tests/vantrel_tests"):
+    # What passes the fast build is tried again where sanitizers and argument checks report.
+    builds = [Build(ROOT / "build-mutate"),
+              Build(ROOT / "build-mutate-checked", "-fsanitize=address,undefined")]
+    if not all(build.survives(None) for build in builds):
         sys.exit("The tests fail without any change.")
+
+    def survives(change):
+        return all(build.survives(change) for build in builds)
+
     killed = 0
     with concurrent.futures.ThreadPoolExecutor(chosen.jobs) as pool:
-        for change, survived in zip(changes, pool.map(build.survives, changes)):
+        for change, survived in zip(changes, pool.map(survives, changes)):
             killed += not survived
             if survived:
                 print(described(change), flush=True)

@@ -16,7 +16,7 @@ ChannelFactors channel_factors(Spectrum refl, int response, Targets targets,
                                const PolWeights &weights)
 {
     const bool all = response == VISUAL_RESPONSE;
-    ChannelFactors f = {1, 1, 1, 1};
+    ChannelFactors f{};
     if (all || response == RED_RESPONSE)
         f[0] = channel_factor(refl, weights.RedWeights, targets[0]);
     if (all || response == GREEN_RESPONSE)

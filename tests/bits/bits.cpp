@@ -5,8 +5,9 @@
 // writes all results to FILE. Those of the functions that use + - * / and the square root alone are
 // the same bits in every build: their digest stands in LIST, functions.txt. The mathematics library
 // differs from system to system: what rests on it is compared with FIRST, the file of another
-// build. The distance of two results is counted in units in the last place of the result or, where
-// that is more, of the scale in LIST: the size of the terms that cancel out in it.
+// build, and a second digest in LIST is that of the same results in thousandths. The distance of
+// two results is counted in units in the last place of the result or, where that is more, of the
+// scale in LIST: the size of the terms that cancel out in it.
 //
 // Behind a rounding or a threshold (L*C*h, words, responses, display values) a last place can
 // become a step. None can hide: the smallest, 0.000001, is millions of units. And none is taken by
@@ -49,10 +50,14 @@ private:
     std::uint64_t state;
 };
 
-/// FNV-1a over 64-bit words.
+/// FNV-1a over 64-bit words, the high half of each product folded into the low one.
 class Digest {
 public:
-    void add(std::uint64_t word) { value = (value ^ word) * 0x100000001B3; }
+    void add(std::uint64_t word)
+    {
+        value = (value ^ word) * 0x100000001B3;
+        value ^= value >> 32;
+    }
 
     std::uint64_t value = 0xCBF29CE484222325;
 };
@@ -189,7 +194,7 @@ using Results = std::map<std::string, std::vector<double>>;
 struct List {
     std::vector<const Function *> exact, libm;
     std::map<std::string, double> scales; ///< of those in libm
-    std::uint64_t digest = 0;
+    std::uint64_t digest = 0, thousandths = 0;
     double bound = 0;
 };
 
@@ -205,8 +210,8 @@ List read_list(const std::string &file)
         std::string key;
         if (!(words >> key) || key == "#")
             continue;
-        if (key == "digest") {
-            words >> std::hex >> list.digest;
+        if (key == "digest" || key == "thousandths") {
+            words >> std::hex >> (key == "digest" ? list.digest : list.thousandths);
             continue;
         }
         if (key == "bound") {
@@ -252,13 +257,35 @@ Results run(const List &list)
     return results;
 }
 
-std::uint64_t digest_of(const List &list, const Results &results)
+double as_it_is(double value) { return value; }
+
+// In steps of 2^-10, of large results of a millionth. A zero has no sign here.
+double in_thousandths(double value)
+{
+    if (!std::isfinite(value))
+        return value;
+    const double step = std::ldexp(1.0, std::ilogb(std::fmax(std::fabs(value), 1024)) - 20);
+    return std::round(value / step) * step + 0.0;
+}
+
+std::uint64_t digest_of(const std::vector<const Function *> &functions, const Results &results,
+                        double (*seen)(double))
 {
     Digest result;
-    for (const Function *function : list.exact)
+    for (const Function *function : functions)
         for (const double value : results.at(function->name))
-            result.add(std::bit_cast<std::uint64_t>(value));
+            result.add(std::bit_cast<std::uint64_t>(seen(value)));
     return result.value;
+}
+
+/// Prints a digest, and whether it is the one of the list.
+bool is_digest(const char *name, std::uint64_t digest, std::uint64_t listed)
+{
+    std::printf("    %s %016llx\n", name, static_cast<unsigned long long>(digest));
+    if (digest != listed)
+        std::printf("    expected %016llx: these are not the same numbers\n",
+                    static_cast<unsigned long long>(listed));
+    return digest == listed;
 }
 
 void write(const Results &results, const std::string &file)
@@ -322,12 +349,9 @@ try {
     const List list = read_list(argv[1]);
     const Results results = run(list);
     write(results, argv[2]);
-    const std::uint64_t digest = digest_of(list, results);
-    std::printf("    digest %016llx\n", static_cast<unsigned long long>(digest));
-    bool good = digest == list.digest;
-    if (!good)
-        std::printf("    expected %016llx: these are not the same bits\n",
-                    static_cast<unsigned long long>(list.digest));
+    bool good = is_digest("digest", digest_of(list.exact, results, as_it_is), list.digest);
+    good &=
+        is_digest("thousandths", digest_of(list.libm, results, in_thousandths), list.thousandths);
     if (argc > 3)
         good &= compare(list, results, read(argv[3], results));
     return good ? 0 : 1;
