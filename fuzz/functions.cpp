@@ -189,12 +189,14 @@ int response_limit(const std::string &name, double status)
     return by_band ? int{VANTREL_BANDS} : int{NUM_RESPONSES};
 }
 
-/// Whether a checked pointer is null, or an index out of range.
+/// Whether a checked pointer is null, or an index out of range. The words of a colour are asked for
+/// by a choice that may leave out any of them.
 bool refusable(const Function &function, const std::vector<Slot> &slots)
 {
     for (std::size_t i = 0; i < slots.size(); ++i) {
         const Argument &argument = function.arguments[i];
-        if (slots[i].null && !argument.nullable)
+        const bool optional_words = function.name == "VerbalColorDifference" && i > 4;
+        if (slots[i].null && !argument.nullable && !optional_words)
             return true;
         const int limit = argument.kind == 'k'   ? int{NUM_ILLUM_OBS}
                           : argument.kind == 's' ? int{NUM_STATUSES}
@@ -216,7 +218,8 @@ void check(const Function &function, const std::vector<Slot> &slots, double resu
     const std::string &name = function.name;
     if (!is_documented(name, result))
         stop(function, "not a documented answer", result);
-    if (result != 0 && name != "VerbalColorDifference" && refusable(function, slots))
+    const bool refused = refusable(function, slots);
+    if (result != 0 && refused)
         stop(function, "accepted a null pointer or an index out of range", result);
     const bool failed = result == 0 || result == 9;
     for (std::size_t i = 0; i < slots.size(); ++i) {
@@ -231,7 +234,7 @@ void check(const Function &function, const std::vector<Slot> &slots, double resu
             stop(function, "left an output as it was", result);
         if (!failed || !slot.written)
             continue;
-        const auto allowed = on_failure(name);
+        const auto allowed = refused ? std::nullopt : on_failure(name);
         const bool as_documented =
             allowed ? slot.values == std::vector(slot.values.size(), *allowed)
                     : name == "GetNormalizedDensityWeights" && (i == 3 || i == 5);
@@ -261,6 +264,18 @@ void check_in_place(const Function &function, std::vector<Slot> slots, std::size
             stop(function, "other values in place", result);
 }
 
+/// Of the arrays for three inks, what a call with fewer may read.
+void keep_inks(const Function &function, std::vector<Slot> &slots)
+{
+    static const std::set<std::string> counted = {"EstimateRefls", "EstimateColor",
+                                                  "EstimateReflsForBestVisualColor"};
+    const double inks = counted.contains(function.name) ? slots[0].values[0] : 0;
+    if (inks != 1 && inks != 2)
+        return;
+    for (const std::size_t i : {1, 2})
+        slots[i].values.resize(slots[i].values.size() / 3 * static_cast<std::size_t>(inks));
+}
+
 void call_next(Bytes &bytes)
 {
     const std::size_t index = bytes.next<std::uint8_t>() % (functions().size() + 1);
@@ -287,6 +302,7 @@ void call_next(Bytes &bytes)
             slots[i].values[0] = arguments[i].kind == 'd' ? bytes.next_double() : bytes.next_int();
         }
     }
+    keep_inks(function, slots);
     if (shared_input < slots.size() && !slots[shared_input].null) {
         check_in_place(function, slots, shared_output, shared_input);
         return;

@@ -19,6 +19,8 @@ bool agrees(double got, double wanted, std::optional<double> tolerance)
 {
     if (std::isnan(wanted))
         return std::isnan(got);
+    if (std::isinf(wanted))
+        return got == wanted;
     const double allowed = tolerance.value_or(1e-12 * std::fmax(1, std::fabs(wanted)));
     return got == wanted || std::fabs(got - wanted) <= allowed;
 }

@@ -78,6 +78,9 @@ TEST(CheckingBuild, ReportsEveryRefusedArgumentInOneLine)
                     << good.function->name << " argument " << i;
             }
         }
+        if (const auto row = invariants.find(good.function->name); row != invariants.end())
+            EXPECT_TRUE(row->second.reports.size() == 1 || row->second.reports.size() == checked)
+                << good.function->name << " has other arguments than its row";
     }
 }
 
