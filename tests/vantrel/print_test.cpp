@@ -242,19 +242,6 @@ Inks print in the order CMYK_M, CMYK_Y
         }
 }
 
-TEST(Print, FillsEveryFieldOfTheCsv)
-{
-    const std::vector<std::string> lines = lines_of(vantrel("report --format csv " + example).out);
-    ASSERT_EQ(lines.size(), 32u);
-    EXPECT_TRUE(lines[0].ends_with("dE00_paper,response,density,dot_area,dot_gain,print_contrast,"
-                                   "hue_error,grayness,trap"));
-    for (const std::string &line : lines)
-        EXPECT_EQ(std::count(line.begin(), line.end(), ','), 16) << line;
-    EXPECT_TRUE(lines[6].ends_with(",Green,0.2497,68.6173,18.6173,,,,")) << lines[6];
-    EXPECT_TRUE(lines[11].ends_with(",Green,0.4404,,,,46.3384,34.3626,")) << lines[11];
-    EXPECT_TRUE(lines[31].ends_with(",Blue,0.7829,,,,,,68.1005")) << lines[31];
-}
-
 TEST(Print, RefusesBadRequestsInOneLine)
 {
     expect_refusals("report " + example,

@@ -50,12 +50,14 @@ inline Outcome shell(const std::string &command)
 
 inline Outcome vantrel(const std::string &words) { return shell(program + " " + words); }
 
-// What a command says in JSON.
+// What a command says in JSON; of a report the one sheet.
 inline Json json_of(const std::string &words, const std::string &command = "report")
 {
     const Outcome done = vantrel(command + " --format json " + words);
     EXPECT_EQ(done.status, 0) << done.err;
-    return Json::parse(done.out);
+    Json out = Json::parse(done.out);
+    EXPECT_EQ(out["command"], command.substr(0, command.find(' ')));
+    return command == "report" ? out["sheets"].at(0) : out;
 }
 
 inline const Json &patch(const Json &sheet, const std::string &name)

@@ -8,6 +8,14 @@ std::optional<int> Densitometer::response(const Spectrum &refl) const
     return found ? std::optional(response) : std::nullopt;
 }
 
+Reading Densitometer::read(const Spectrum &refl) const
+{
+    Reading out{response(refl), std::nullopt};
+    if (out.response)
+        out.density = density(refl, *out.response);
+    return out;
+}
+
 double Densitometer::density(const Spectrum &refl, int response) const
 {
     double density = 0;

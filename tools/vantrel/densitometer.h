@@ -6,6 +6,12 @@
 
 #include "measurement.h"
 
+// A density over the paper, in the response that reads the ink; both missing where there is none.
+struct Reading {
+    std::optional<int> response;
+    std::optional<double> density;
+};
+
 class Densitometer {
 public:
     Densitometer(const Spectrum &paper, int status) : paper(paper), status(status) {}
@@ -13,6 +19,8 @@ public:
     // The response that reads this ink, as DetermineDensityResponse() gives it; nothing where there
     // is none.
     std::optional<int> response(const Spectrum &refl) const;
+
+    Reading read(const Spectrum &refl) const;
 
     // Over the paper under every status: SPECTRAL_STATUS, which takes no paper, included.
     double density(const Spectrum &refl, int response) const;

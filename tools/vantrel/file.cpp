@@ -33,9 +33,3 @@ std::string read_file(const std::string &path)
         throw InputError{0, std::strerror(errno)};
     return text;
 }
-
-std::string write_output(std::string_view text)
-{
-    const bool written = std::fwrite(text.data(), 1, text.size(), stdout) == text.size();
-    return written && std::fflush(stdout) == 0 ? "" : std::strerror(errno);
-}

@@ -54,25 +54,31 @@ Json patch_json(const PatchReport &patch, int status)
             {"print_contrast", or_null(patch.print_contrast)},
             {"hue_error", or_null(patch.hue_error)},
             {"grayness", or_null(patch.grayness)},
-            {"trap", or_null(patch.trap)}};
+            {"trap", or_null(patch.trap)},
+            {"refl", patch.refl}};
 }
 
-Json estimate_json(const Estimate &estimate)
+// The members of an object, each added to `out`.
+void add_reading(Json &out, const Reading &reading, int status)
 {
-    return {{"rgb", hex(estimate.colour.rgb)},
-            {"lab", lab_json(estimate.colour.lab)},
-            {"de00_to_measured", or_null(estimate.to_measured)},
-            {"refl", estimate.refl}};
+    out["response"] = reading.response ? Json(response_name(status, *reading.response)) : Json();
+    out["density"] = or_null(reading.density);
 }
 
-} // namespace
-
-std::string as_json(const Report &report)
+Json estimate_json(const Estimate &estimate, int status)
 {
-    Json patches = Json::array();
-    for (const PatchReport &patch : report.patches)
-        patches.push_back(patch_json(patch, report.status));
-    const Json sheet = {
+    Json out = {{"rgb", hex(estimate.colour.rgb)},
+                {"lab", lab_json(estimate.colour.lab)},
+                {"de00_to_measured", or_null(estimate.to_measured)},
+                {"refl", estimate.refl}};
+    add_reading(out, estimate.reading, status);
+    return out;
+}
+
+// The head of a sheet, then a line for each patch: the patches never stand in memory together.
+std::string sheet_json(const Report &report)
+{
+    const Json head = {
         {"file", report.file},
         {"illuminant", name_of(report.illuminant)},
         {"status", status_name(report.status)},
@@ -84,9 +90,25 @@ std::string as_json(const Report &report)
           {"bands", report.source.bands},
           {"scaled_to_percent", report.source.scaled}}},
         {"paper", paper_json(report)},
-        {"patches", patches},
     };
-    return sheet.dump(2) + '\n';
+    std::string out = head.dump(2);
+    out.erase(out.rfind("\n}"));
+    out += ",\n  \"patches\": [";
+    for (const PatchReport &patch : report.patches) {
+        out += out.back() == '[' ? "\n" : ",\n";
+        out += patch_json(patch, report.status).dump();
+    }
+    return out + "\n  ]\n}";
+}
+
+} // namespace
+
+std::string as_json(const std::vector<Report> &sheets)
+{
+    std::string out = "{\n\"command\": \"report\",\n\"sheets\": [\n";
+    for (const Report &report : sheets)
+        out += (&report == sheets.data() ? "" : ",\n") + sheet_json(report);
+    return out + "\n]\n}\n";
 }
 
 std::string as_json(const Predictions &predictions)
@@ -96,18 +118,25 @@ std::string as_json(const Predictions &predictions)
         Json inks = Json::array();
         for (const InkTint &ink : prediction.inks)
             inks.push_back({{"name", ink.name}, {"percent", ink.percent}});
-        const auto &measured = prediction.measured;
+        Json measured;
+        if (prediction.measured) {
+            measured = {{"name", prediction.measured->patch},
+                        {"rgb", hex(prediction.measured->colour.rgb)},
+                        {"lab", lab_json(prediction.measured->colour.lab)}};
+            add_reading(measured, prediction.measured->reading, predictions.status);
+        }
         all.push_back({{"inks", inks},
-                       {"halftone", estimate_json(prediction.halftone)},
-                       {"film", estimate_json(prediction.film)},
-                       {"measured", measured ? Json{{"name", measured->patch},
-                                                    {"rgb", hex(measured->colour.rgb)},
-                                                    {"lab", lab_json(measured->colour.lab)}}
-                                             : Json()}});
+                       {"halftone", estimate_json(prediction.halftone, predictions.status)},
+                       {"film", estimate_json(prediction.film, predictions.status)},
+                       {"measured", measured}});
     }
     const Json out = {
-        {"file", predictions.file},   {"illuminant", name_of(predictions.illuminant)},
-        {"paper", predictions.paper}, {"left_out", predictions.left_out},
+        {"command", "predict"},
+        {"file", predictions.file},
+        {"illuminant", name_of(predictions.illuminant)},
+        {"status", status_name(predictions.status)},
+        {"paper", predictions.paper},
+        {"left_out", predictions.left_out},
         {"predictions", all},
     };
     return out.dump(2) + '\n';

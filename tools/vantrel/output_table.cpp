@@ -131,19 +131,30 @@ void add_block(Lines &lines, const Report &report, const char *title, std::size_
     }
 }
 
-std::string inks_of(const Prediction &prediction)
-{
-    std::string out;
-    for (const InkTint &ink : prediction.inks)
-        out += fmt::format("{}{} {} %", out.empty() ? "" : " + ", cut(ink.name, widest_in_text),
-                           ink.percent);
-    return out;
-}
-
 std::string colour_columns(const Colour &shown, bool colour)
 {
     return fmt::format(" {}{:>7}{:>7}{:>7}", colour ? swatch(shown.rgb) : "", fixed(shown.lab.L),
                        fixed(shown.lab.a), fixed(shown.lab.b));
+}
+
+std::string shown(const Reading &reading, int status)
+{
+    return reading.density ? fmt::format("{} {}", response_code(status, *reading.response),
+                                         fixed(reading.density, 3))
+                           : "none";
+}
+
+// The densities of the one prediction.
+std::string densities_of(const Predictions &predictions)
+{
+    const Prediction &only = predictions.all[0];
+    std::string out =
+        fmt::format("\nDensity ({}): halftone {}, film {}", status_name(predictions.status),
+                    shown(only.halftone.reading, predictions.status),
+                    shown(only.film.reading, predictions.status));
+    if (only.measured)
+        out += ", measured " + shown(only.measured->reading, predictions.status);
+    return out;
 }
 
 // The mean and the largest difference of one model.
@@ -158,8 +169,6 @@ std::string summary(const Predictions &predictions, const char *name, Estimate P
     return fmt::format("{}: mean ΔE00 {}, largest {}", name,
                        fixed(sum / static_cast<double>(predictions.all.size())), fixed(largest));
 }
-
-} // namespace
 
 std::string as_table(const Report &report, bool colour)
 {
@@ -181,11 +190,23 @@ std::string as_table(const Report &report, bool colour)
     return lines.out;
 }
 
+} // namespace
+
+std::string as_table(const std::vector<Report> &sheets, bool colour)
+{
+    std::string out;
+    for (const Report &report : sheets)
+        out += (out.empty() ? "" : "\n\n") + as_table(report, colour);
+    return out;
+}
+
 std::string as_table(const Predictions &predictions, bool colour)
 {
     const std::size_t widest = colour ? 26 : 38; // 120 columns in all
     const auto title = [&](const Prediction &prediction) {
-        return cut(prediction.measured ? prediction.measured->patch : inks_of(prediction), widest);
+        return cut(prediction.measured ? prediction.measured->patch
+                                       : inks_of(prediction, widest_in_text),
+                   widest);
     };
     std::size_t width = 11;
     for (const Prediction &prediction : predictions.all)
@@ -194,7 +215,7 @@ std::string as_table(const Predictions &predictions, bool colour)
     lines.add(fmt::format("{}: {}, on {}", predictions.file, name_of(predictions.illuminant),
                           cut(predictions.paper, widest_name)));
     if (predictions.all.size() == 1)
-        lines.add(inks_of(predictions.all[0]));
+        lines.add(inks_of(predictions.all[0], widest_in_text));
     const std::string gap = colour ? "    " : "";
     const std::string lab = fmt::format(" {}{:>7}{:>7}{:>7}", gap, "L*", "a*", "b*");
     lines.add(fmt::format("\n{:<{}} {}{:>28} {}{:>28} {}{:>21}", "", width, gap, "Halftone", gap,
@@ -215,6 +236,8 @@ std::string as_table(const Predictions &predictions, bool colour)
         lines.add(summary(predictions, "Halftone", &Prediction::halftone));
         lines.add(summary(predictions, "Film", &Prediction::film));
     }
+    if (predictions.all.size() == 1)
+        lines.add(densities_of(predictions));
     if (predictions.left_out)
         lines.add(fmt::format("Left out: {} overprints of more than three inks, of fractions of a "
                               "percent, or without a solid",

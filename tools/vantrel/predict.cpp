@@ -19,7 +19,7 @@ struct Layer {
 using Model = int(int n, const double *inks, const int *percent, const double *paper, double *refl);
 
 Estimate estimate(Model *model, const std::vector<Layer> &layers, const Spectrum &paper,
-                  ILLUM_OBS illuminant, const std::optional<Measured> &measured)
+                  ILLUM_OBS illuminant, int status, const std::optional<Measured> &measured)
 {
     std::vector<double> inks;
     std::vector<int> percent;
@@ -31,22 +31,24 @@ Estimate estimate(Model *model, const std::vector<Layer> &layers, const Spectrum
     model(static_cast<int>(layers.size()), inks.data(), percent.data(), paper.data(),
           out.refl.data());
     out.colour = colour_of(out.refl, illuminant);
+    out.reading = Densitometer(paper, status).read(out.refl);
     if (measured)
         out.to_measured = delta_e00(measured->colour.lab, out.colour.lab);
     return out;
 }
 
 Prediction prediction_of(const std::vector<Layer> &layers, const Patch &paper, ILLUM_OBS illuminant,
-                         const Patch *patch)
+                         int status, const Patch *patch)
 {
     Prediction out;
     for (const Layer &layer : layers)
         out.inks.push_back({layer.solid->name, layer.percent});
     if (patch)
-        out.measured = {patch->name, colour_of(patch->refl, illuminant)};
-    out.halftone = estimate(EstimateRefls, layers, paper.refl, illuminant, out.measured);
-    out.film =
-        estimate(EstimateReflsForBestVisualColor, layers, paper.refl, illuminant, out.measured);
+        out.measured = {patch->name, colour_of(patch->refl, illuminant),
+                        Densitometer(paper.refl, status).read(patch->refl)};
+    out.halftone = estimate(EstimateRefls, layers, paper.refl, illuminant, status, out.measured);
+    out.film = estimate(EstimateReflsForBestVisualColor, layers, paper.refl, illuminant, status,
+                        out.measured);
     return out;
 }
 
@@ -108,7 +110,7 @@ std::vector<Layer> layers_of(const Tints &tints, const Inks &inks)
 } // namespace
 
 Predictions predict(const Measurement &sheet, const Inks &inks, const Patch &paper,
-                    ILLUM_OBS illuminant, const std::vector<std::string> &wishes)
+                    ILLUM_OBS illuminant, int status, const std::vector<std::string> &wishes)
 {
     if (wishes.size() > most_inks)
         throw RequestError{fmt::format("{} inks; {} are the most", wishes.size(), most_inks)};
@@ -123,14 +125,19 @@ Predictions predict(const Measurement &sheet, const Inks &inks, const Patch &pap
     }
     return {.file = sheet.file,
             .illuminant = illuminant,
+            .status = status,
             .paper = paper.name,
-            .all = {prediction_of(layers, paper, illuminant, measured_of(layers, inks))}};
+            .all = {prediction_of(layers, paper, illuminant, status, measured_of(layers, inks))}};
 }
 
 Predictions predict_overprints(const Measurement &sheet, const Inks &inks, const Patch &paper,
-                               ILLUM_OBS illuminant)
+                               ILLUM_OBS illuminant, int status)
 {
-    Predictions out{.file = sheet.file, .illuminant = illuminant, .paper = paper.name, .all = {}};
+    Predictions out{.file = sheet.file,
+                    .illuminant = illuminant,
+                    .status = status,
+                    .paper = paper.name,
+                    .all = {}};
     for (const Patch &patch : sheet.patches) {
         const auto tints = inks.tints_of(patch);
         if (!tints || tints->size() < 2)
@@ -139,11 +146,20 @@ Predictions predict_overprints(const Measurement &sheet, const Inks &inks, const
         if (layers.empty())
             ++out.left_out;
         else
-            out.all.push_back(prediction_of(layers, paper, illuminant, &patch));
+            out.all.push_back(prediction_of(layers, paper, illuminant, status, &patch));
     }
     if (out.all.empty())
         throw RequestError{fmt::format(
             "{} holds no overprint of two or three inks beside their solids; name inks with --ink",
             sheet.file)};
+    return out;
+}
+
+std::string inks_of(const Prediction &prediction, std::size_t widest_name)
+{
+    std::string out;
+    for (const InkTint &ink : prediction.inks)
+        out += fmt::format("{}{} {} %", out.empty() ? "" : " + ", cut(ink.name, widest_name),
+                           ink.percent);
     return out;
 }

@@ -7,6 +7,8 @@
 #include <vector>
 
 #include "colour.h"
+#include "densitometer.h"
+#include "flat.h"
 #include "inks.h"
 #include "measurement.h"
 
@@ -20,11 +22,13 @@ struct Estimate {
     Spectrum refl{};
     Colour colour;
     std::optional<double> to_measured; // ΔE00
+    Reading reading;
 };
 
 struct Measured {
     std::string patch;
     Colour colour;
+    Reading reading;
 };
 
 struct Prediction {
@@ -37,6 +41,7 @@ struct Prediction {
 struct Predictions {
     std::string file;
     ILLUM_OBS illuminant;
+    int status;
     std::string paper;
     std::vector<Prediction> all;
     std::size_t left_out = 0; // measured overprints that cannot be predicted
@@ -45,15 +50,18 @@ struct Predictions {
 // The combination that `wishes` name, each NAME:PERCENT, in the order of printing; throws
 // RequestError.
 Predictions predict(const Measurement &sheet, const Inks &inks, const Patch &paper,
-                    ILLUM_OBS illuminant, const std::vector<std::string> &wishes);
+                    ILLUM_OBS illuminant, int status, const std::vector<std::string> &wishes);
 
 // Every measured overprint of two or three inks; throws RequestError where there is none.
 Predictions predict_overprints(const Measurement &sheet, const Inks &inks, const Patch &paper,
-                               ILLUM_OBS illuminant);
+                               ILLUM_OBS illuminant, int status);
+
+// "Magenta 100 40 % + Yellow 100 70 %", each name cut to a number of characters.
+std::string inks_of(const Prediction &prediction, std::size_t widest_name);
 
 // The output formats; each gives the whole text.
 std::string as_table(const Predictions &predictions, bool colour);
-std::string as_csv(const Predictions &predictions);
 std::string as_json(const Predictions &predictions);
+std::vector<Flat> flat_of(const Predictions &predictions);
 
 #endif

@@ -52,6 +52,7 @@ PatchReport patch_report(const Patch &patch, const Inks &inks, const Request &re
     row.id = patch.id;
     row.name = patch.name;
     row.device = patch.device;
+    row.refl = patch.refl;
     row.colour = colour_of(patch.refl, request.illuminant);
     row.to_paper = delta_e00(paper, row.colour.lab);
     const double lab[3] = {row.colour.lab.L, row.colour.lab.a, row.colour.lab.b};
@@ -60,9 +61,9 @@ PatchReport patch_report(const Patch &patch, const Inks &inks, const Request &re
     row.lch = {lch[0], lch[1], lch[2]};
 
     const Densitometer densitometer(request.paper->refl, request.status);
-    row.response = densitometer.response(patch.refl);
-    if (row.response)
-        row.density = densitometer.density(patch.refl, *row.response);
+    const Reading reading = densitometer.read(patch.refl);
+    row.response = reading.response;
+    row.density = reading.density;
     measure_inks(row, patch, inks, densitometer, request.n_factor);
     return row;
 }

@@ -8,6 +8,7 @@
 #include <vector>
 
 #include "colour.h"
+#include "flat.h"
 #include "inks.h"
 #include "measurement.h"
 
@@ -26,6 +27,7 @@ struct PatchReport {
     std::string id;
     std::string name;
     std::vector<std::pair<std::string, double>> device; // as in Patch
+    Spectrum refl{};
     Colour colour;
     CIELCHCOORD lch{};
     double to_paper = 0;                       // ΔE00
@@ -68,8 +70,8 @@ struct Report {
 Report report_of(const Measurement &sheet, const Inks &inks, const Request &request);
 
 // The output formats; each gives the whole text.
-std::string as_table(const Report &report, bool colour);
-std::string as_csv(const Report &report);
-std::string as_json(const Report &report);
+std::string as_table(const std::vector<Report> &sheets, bool colour);
+std::string as_json(const std::vector<Report> &sheets);
+std::vector<Flat> flat_of(const std::vector<Report> &sheets);
 
 #endif

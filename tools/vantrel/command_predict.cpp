@@ -1,0 +1,55 @@
+// vantrel predict FILE
+
+#include <memory>
+
+#include "options.h"
+#include "predict.h"
+
+namespace {
+
+struct PredictOptions : Options {
+    std::string file;
+    std::vector<std::string> order;     // of printing
+    std::vector<std::string> ink_tints; // NAME:PERCENT
+};
+
+Outcome run(PredictOptions &options)
+{
+    const ILLUM_OBS illuminant = illuminant_of(options.illuminant);
+    const int status = status_of(options.status);
+    const Measurement sheet = sheet_of(options.file, options);
+    const Inks inks(sheet, options.order);
+    const Patch &paper = paper_of(sheet, options);
+    return outcome_of(options.ink_tints.empty()
+                          ? predict_overprints(sheet, inks, paper, illuminant, status)
+                          : predict(sheet, inks, paper, illuminant, status, options.ink_tints),
+                      options);
+}
+
+constexpr const char *footer =
+    "Two models stand side by side: tints as halftones, which mix ink and paper by area, and as "
+    "thinner\nfilms. Where the file holds the same combination, its colour and the difference are "
+    "shown.\n\n"
+    "CSV, CGATS and JSON (its fields stand in docs/json.md) hold the predicted spectra too; in CSV "
+    "and\nCGATS each prediction is a row for each model.\n\n"
+    "Example:\n  vantrel predict two_ink_halftone.txt --ink \"Magenta 100:40\" --ink CMYK_Y:70";
+
+} // namespace
+
+Command add_predict(CLI::App &app)
+{
+    const auto options = std::make_shared<PredictOptions>();
+    CLI::App *command = app.add_subcommand(
+        "predict", "The colour that inks will have as tints and over one another");
+    command->add_option("FILE", options->file, "Measurement file with spectra")->required();
+    add_sheet_options(*command, *options);
+    add_order_option(*command, options->order);
+    command
+        ->add_option("--ink", options->ink_tints,
+                     "NAME:PERCENT, once for each of one to three inks in the order of printing. "
+                     "NAME is the solid's patch by name or id, or the ink's device field. Without "
+                     "any, every measured overprint of two or three inks is predicted")
+        ->allow_extra_args(false);
+    command->footer(footer);
+    return {command, [options] { return run(*options); }};
+}

@@ -1,0 +1,77 @@
+// vantrel report FILE…
+
+#include <cmath>
+#include <memory>
+
+#include "options.h"
+#include "report.h"
+
+namespace {
+
+struct ReportOptions : Options {
+    std::vector<std::string> files;
+    std::vector<std::string> order; // of printing
+    double n_factor = 1;
+    std::string second_paper;      // none where it is empty
+    std::string second_illuminant; // its default follows the first
+};
+
+Report report_of_file(const std::string &file, Request request, ReportOptions &options)
+{
+    const Measurement sheet = sheet_of(file, options);
+    request.paper = &paper_of(sheet, options);
+    if (!options.second_paper.empty())
+        request.second_paper = &patch_named(sheet, options.second_paper);
+    return report_of(sheet, Inks(sheet, options.order), request);
+}
+
+Outcome run(ReportOptions &options)
+{
+    if (!(options.n_factor > 0) || !std::isfinite(options.n_factor))
+        throw RequestError{"--n-factor takes a number above 0"};
+    Request request;
+    request.illuminant = illuminant_of(options.illuminant);
+    request.status = status_of(options.status);
+    request.n_factor = options.n_factor;
+    request.second_illuminant = options.second_illuminant.empty()
+                                    ? usual_second(request.illuminant)
+                                    : illuminant_of(options.second_illuminant);
+    std::vector<Report> sheets;
+    for (const std::string &file : options.files)
+        sheets.push_back(report_of_file(file, request, options));
+    return outcome_of(sheets, options);
+}
+
+constexpr const char *footer =
+    "The response that reads a patch is V(isual), R(ed), G(reen), B(lue), H1 to H3 (HiFi), X1 or "
+    "X2\n(Hexachrome), a wavelength in nm under SPECTRAL_STATUS, a band (b0 is 400 nm, b30 700 nm) "
+    "under\nSPECTRALX_STATUS. Densities are over the paper under every status. Dot area and gain "
+    "are those\nof tints of one ink, in the response of its solid; print contrast that of tints "
+    "from 75 to 80 %;\ntrap (Preucil) that of two solids, in the response of the second ink. "
+    "Device values tell the inks.\n\n"
+    "Output as CSV and CGATS has a row for each patch, with its device values and its spectrum in\n"
+    "percent. The fields of the JSON stand in docs/json.md.\n\n"
+    "Example:\n"
+    "  vantrel report two_ink_halftone.txt --status T_STATUS --paper Paper\n"
+    "  vantrel report monday.txt tuesday.txt --format csv -o week.csv";
+
+} // namespace
+
+Command add_report(CLI::App &app)
+{
+    const auto options = std::make_shared<ReportOptions>();
+    CLI::App *command = app.add_subcommand(
+        "report", "The colour, density and print attributes of every patch of a sheet");
+    command->add_option("FILE", options->files, "Measurement files with spectra")->required();
+    add_sheet_options(*command, *options);
+    add_order_option(*command, options->order);
+    command->add_option("--n-factor", options->n_factor, "Yule-Nielsen factor of the dot areas")
+        ->capture_default_str();
+    command->add_option("--second-paper", options->second_paper,
+                        "Patch to tell the paper's metamerism against, by name or id");
+    command->add_option("--second-illuminant", options->second_illuminant,
+                        "Illuminant of that metamerism beside --illuminant (default: A_2DEG or "
+                        "A_10DEG, beside these D65_2DEG or D65_10DEG)");
+    command->footer(footer);
+    return {command, [options] { return run(*options); }};
+}

@@ -1,0 +1,105 @@
+#include "options.h"
+
+#include <cstdio>
+#include <cstdlib>
+#include <unistd.h>
+
+#include <fmt/format.h>
+
+#include "cgats.h"
+#include "file.h"
+#include "names.h"
+#include "text.h"
+
+void add_common_options(CLI::App &command, Options &options)
+{
+    command.add_option("--format", options.format, "table, csv, json, cgats or html")
+        ->check(CLI::IsMember({"table", "csv", "json", "cgats", "html"}))
+        ->capture_default_str();
+    command.add_option("-o,--output", options.output,
+                       "Write to this file instead of standard output; it is replaced whole or not "
+                       "at all");
+    command.add_flag("--no-color", options.no_color, "No colour swatches on a terminal");
+}
+
+void add_sheet_options(CLI::App &command, Options &options)
+{
+    command
+        .add_option("--illuminant", options.illuminant,
+                    "Illuminant and observer: " + illuminant_names())
+        ->capture_default_str();
+    command.add_option("--status", options.status, "Density status: " + status_names())
+        ->capture_default_str();
+    command.add_option("--paper", options.paper,
+                       "The paper's patch by name or id (default: the first patch)");
+    add_common_options(command, options);
+}
+
+void add_order_option(CLI::App &command, std::vector<std::string> &order)
+{
+    command
+        .add_option("--order", order,
+                    "Inks in the order of printing, by device field or solid, with commas between "
+                    "(default: the order of the device fields)")
+        ->delimiter(',')
+        ->allow_extra_args(false);
+}
+
+ILLUM_OBS illuminant_of(const std::string &name)
+{
+    const auto illuminant = illuminant_named(name);
+    if (!illuminant)
+        throw RequestError{
+            fmt::format("no illuminant {}; there are {}", in_quotes(name), illuminant_names())};
+    return *illuminant;
+}
+
+int status_of(const std::string &name)
+{
+    const auto status = status_named(name);
+    if (!status)
+        throw RequestError{
+            fmt::format("no status {}; there are {}", in_quotes(name), status_names())};
+    return *status;
+}
+
+const Patch &paper_of(const Measurement &sheet, const Options &options)
+{
+    return options.paper.empty() ? sheet.patches.front() : patch_named(sheet, options.paper);
+}
+
+ILLUM_OBS usual_second(ILLUM_OBS first)
+{
+    const bool ten_degrees = first % 2 == 1;
+    if (first == A_2DEG || first == A_10DEG)
+        return ten_degrees ? D65_10DEG : D65_2DEG;
+    return ten_degrees ? A_10DEG : A_2DEG;
+}
+
+Measurement sheet_of(const std::string &path, Options &options)
+{
+    const std::string file = printable(path);
+    try {
+        Measurement sheet = read_cgats(read_file(path));
+        sheet.file = file;
+        for (const std::string &warning : sheet.warnings)
+            options.warnings.push_back(fmt::format("{}:{}", file, warning));
+        return sheet;
+    } catch (const InputError &error) {
+        throw RequestError{fmt::format(
+            "{}{}: {}", file, error.line ? fmt::format(":{}", error.line) : "", error.reason)};
+    }
+}
+
+bool shows_colour(const Options &options)
+{
+    const char *terminal = std::getenv("TERM");
+    const char *no_color = std::getenv("NO_COLOR");
+    return !options.no_color && options.output.empty() && isatty(STDOUT_FILENO) &&
+           !(no_color && *no_color) && !(terminal && std::string_view(terminal) == "dumb");
+}
+
+void complain(const std::string &message)
+{
+    static_cast<void>(std::fputs(("vantrel: " + message + "\n").c_str(), stderr));
+}

@@ -1,0 +1,78 @@
+// What every command takes, and how its result leaves the program.
+#ifndef VANTREL_TOOL_OPTIONS_H
+#define VANTREL_TOOL_OPTIONS_H
+
+#include <functional>
+#include <string>
+#include <vector>
+
+#include <CLI/CLI.hpp>
+
+#include "flat.h"
+#include "measurement.h"
+#include "output_html.h"
+
+struct Options {
+    std::string illuminant = "D50_2DEG";
+    std::string status = "E_STATUS";
+    std::string paper; // name or id
+    std::string format = "table";
+    std::string output; // a file; standard output where it is empty
+    bool no_color = false;
+    std::vector<std::string> warnings; // of the files that were read
+};
+
+// What a command has to say.
+struct Outcome {
+    std::string text;
+    std::string output; // as in Options
+    std::vector<std::string> warnings;
+    bool within_tolerance = true;
+};
+
+struct Command {
+    CLI::App *app;
+    std::function<Outcome()> run; // throws RequestError
+};
+
+// The commands; each stands in a file of its own.
+Command add_report(CLI::App &app);
+Command add_predict(CLI::App &app);
+
+// The options that every command has, and those of commands that measure a sheet.
+void add_common_options(CLI::App &command, Options &options);
+void add_sheet_options(CLI::App &command, Options &options);
+void add_order_option(CLI::App &command, std::vector<std::string> &order);
+
+// What the options name; throw RequestError.
+ILLUM_OBS illuminant_of(const std::string &name);
+int status_of(const std::string &name);
+const Patch &paper_of(const Measurement &sheet, const Options &options);
+
+// Illuminant A beside daylight and lamps, D65 beside A, with the same observer.
+ILLUM_OBS usual_second(ILLUM_OBS first);
+
+// Reads a file; throws RequestError.
+Measurement sheet_of(const std::string &path, Options &options);
+
+bool shows_colour(const Options &options);
+
+// One line on standard error; there is nobody to tell when that cannot be written.
+void complain(const std::string &message);
+
+// A result in the format that the options ask for.
+template <typename Result> Outcome outcome_of(const Result &result, const Options &options)
+{
+    const auto text = [&]() -> std::string {
+        if (options.format == "json")
+            return as_json(result);
+        if (options.format == "html")
+            return as_html(as_json(result));
+        if (options.format == "table")
+            return as_table(result, shows_colour(options));
+        return options.format == "csv" ? as_csv(flat_of(result)) : as_cgats(flat_of(result));
+    };
+    return {text(), options.output, options.warnings};
+}
+
+#endif
