@@ -37,6 +37,7 @@ struct Command {
 
 // The commands; each stands in a file of its own.
 Command add_report(CLI::App &app);
+Command add_compare(CLI::App &app);
 Command add_predict(CLI::App &app);
 
 // The options that every command has, and those of commands that measure a sheet.

@@ -1,19 +1,9 @@
-#include <nlohmann/json.hpp>
-
+#include "json_text.h"
 #include "names.h"
 #include "predict.h"
 #include "report.h"
 
 namespace {
-
-using Json = nlohmann::ordered_json;
-
-template <typename Value> Json or_null(const std::optional<Value> &value)
-{
-    return value ? Json(*value) : Json();
-}
-
-Json lab_json(const CIELABCOORD &lab) { return {lab.L, lab.a, lab.b}; }
 
 Json paper_json(const Report &report)
 {
@@ -58,13 +48,6 @@ Json patch_json(const PatchReport &patch, int status)
             {"refl", patch.refl}};
 }
 
-// The members of an object, each added to `out`.
-void add_reading(Json &out, const Reading &reading, int status)
-{
-    out["response"] = reading.response ? Json(response_name(status, *reading.response)) : Json();
-    out["density"] = or_null(reading.density);
-}
-
 Json estimate_json(const Estimate &estimate, int status)
 {
     Json out = {{"rgb", hex(estimate.colour.rgb)},
@@ -75,7 +58,6 @@ Json estimate_json(const Estimate &estimate, int status)
     return out;
 }
 
-// The head of a sheet, then a line for each patch: the patches never stand in memory together.
 std::string sheet_json(const Report &report)
 {
     const Json head = {
@@ -91,14 +73,26 @@ std::string sheet_json(const Report &report)
           {"scaled_to_percent", report.source.scaled}}},
         {"paper", paper_json(report)},
     };
-    std::string out = head.dump(2);
-    out.erase(out.rfind("\n}"));
-    out += ",\n  \"patches\": [";
-    for (const PatchReport &patch : report.patches) {
-        out += out.back() == '[' ? "\n" : ",\n";
-        out += patch_json(patch, report.status).dump();
+    return with_array(head, "patches", report.patches.size(),
+                      [&](std::size_t i) { return patch_json(report.patches[i], report.status); });
+}
+
+Json prediction_json(const Prediction &prediction, int status)
+{
+    Json inks = Json::array();
+    for (const InkTint &ink : prediction.inks)
+        inks.push_back({{"name", ink.name}, {"percent", ink.percent}});
+    Json measured;
+    if (prediction.measured) {
+        measured = {{"name", prediction.measured->patch},
+                    {"rgb", hex(prediction.measured->colour.rgb)},
+                    {"lab", lab_json(prediction.measured->colour.lab)}};
+        add_reading(measured, prediction.measured->reading, status);
     }
-    return out + "\n  ]\n}";
+    return {{"inks", inks},
+            {"halftone", estimate_json(prediction.halftone, status)},
+            {"film", estimate_json(prediction.film, status)},
+            {"measured", measured}};
 }
 
 } // namespace
@@ -113,31 +107,17 @@ std::string as_json(const std::vector<Report> &sheets)
 
 std::string as_json(const Predictions &predictions)
 {
-    Json all = Json::array();
-    for (const Prediction &prediction : predictions.all) {
-        Json inks = Json::array();
-        for (const InkTint &ink : prediction.inks)
-            inks.push_back({{"name", ink.name}, {"percent", ink.percent}});
-        Json measured;
-        if (prediction.measured) {
-            measured = {{"name", prediction.measured->patch},
-                        {"rgb", hex(prediction.measured->colour.rgb)},
-                        {"lab", lab_json(prediction.measured->colour.lab)}};
-            add_reading(measured, prediction.measured->reading, predictions.status);
-        }
-        all.push_back({{"inks", inks},
-                       {"halftone", estimate_json(prediction.halftone, predictions.status)},
-                       {"film", estimate_json(prediction.film, predictions.status)},
-                       {"measured", measured}});
-    }
-    const Json out = {
+    const Json head = {
         {"command", "predict"},
         {"file", predictions.file},
         {"illuminant", name_of(predictions.illuminant)},
         {"status", status_name(predictions.status)},
         {"paper", predictions.paper},
         {"left_out", predictions.left_out},
-        {"predictions", all},
     };
-    return out.dump(2) + '\n';
+    return with_array(head, "predictions", predictions.all.size(),
+                      [&](std::size_t i) {
+                          return prediction_json(predictions.all[i], predictions.status);
+                      }) +
+           '\n';
 }

@@ -9,49 +9,10 @@
 #include "names.h"
 #include "predict.h"
 #include "report.h"
+#include "table_text.h"
 #include "text.h"
 
 namespace {
-
-constexpr std::size_t widest_name = 40;
-constexpr std::size_t widest_in_text = 30; // a line has 120 columns
-
-// Without a minus before zero; nothing stays blank.
-std::string fixed(const std::optional<double> &value, int decimals = 2)
-{
-    if (!value)
-        return "";
-    std::string out = fmt::format("{:.{}f}", *value, decimals);
-    return out.find_first_of("123456789in") == std::string::npos && out[0] == '-' ? out.substr(1)
-                                                                                  : out;
-}
-
-std::string fixed(const CIELABCOORD &lab)
-{
-    return fmt::format("{} {} {}", fixed(lab.L), fixed(lab.a), fixed(lab.b));
-}
-
-std::size_t characters(const std::string &text)
-{
-    return static_cast<std::size_t>(
-        std::count_if(text.begin(), text.end(), [](char c) { return (c & 0xC0) != 0x80; }));
-}
-
-std::string swatch(const Rgb &rgb)
-{
-    return fmt::format("\x1b[48;2;{};{};{}m    \x1b[0m", rgb.red, rgb.green, rgb.blue);
-}
-
-// Collects lines, none of them with spaces at its end.
-class Lines {
-public:
-    void add(std::string line)
-    {
-        line.resize(line.find_last_not_of(' ') + 1);
-        out += line + '\n';
-    }
-    std::string out;
-};
 
 void add_head(Lines &lines, const Report &report)
 {

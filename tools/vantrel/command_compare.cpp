@@ -1,0 +1,175 @@
+// vantrel compare REFERENCE SAMPLE
+
+#include <algorithm>
+#include <cmath>
+#include <memory>
+
+#include <fmt/format.h>
+
+#include "compare.h"
+#include "options.h"
+#include "text.h"
+
+namespace {
+
+struct CompareOptions : Options {
+    std::string reference, sample;
+    std::string pairing = "auto";
+    std::vector<std::string> formulas = {"de2000"};
+    std::vector<std::string> weights; // FORMULA=A,B
+    std::string second_illuminant;    // its default follows the first
+    std::string words = "ab";
+    std::optional<double> tolerance;
+    bool all = false;
+};
+
+Formula formula_of(std::string_view name)
+{
+    const auto formula = formula_named(name);
+    if (!formula)
+        throw RequestError{
+            fmt::format("no formula {}; there are de2000, cmc, de94, de76", in_quotes(name))};
+    return *formula;
+}
+
+// FORMULA=A,B
+Metric weighted_metric(std::string_view wish)
+{
+    const auto equals = wish.find('=');
+    const auto comma = wish.find(',', equals == std::string_view::npos ? 0 : equals);
+    if (equals == std::string_view::npos || comma == std::string_view::npos)
+        throw RequestError{
+            fmt::format("--weights takes FORMULA=LIGHTNESS,CHROMA, not {}", in_quotes(wish))};
+    Metric metric = usual_metric(formula_of(wish.substr(0, equals)));
+    if (metric.formula == Formula::de76)
+        throw RequestError{"the formula de76 has no weights"};
+    const auto lightness = number_in(wish.substr(equals + 1, comma - equals - 1));
+    const auto chroma = number_in(wish.substr(comma + 1));
+    if (!lightness || !chroma || *lightness <= 0 || *chroma <= 0)
+        throw RequestError{
+            fmt::format("--weights takes two numbers above 0, not {}", in_quotes(wish))};
+    metric.lightness = *lightness;
+    metric.chroma = *chroma;
+    return metric;
+}
+
+std::vector<Metric> metrics_of(const CompareOptions &options)
+{
+    std::vector<Metric> metrics;
+    const auto find = [&](Formula formula) {
+        return std::find_if(metrics.begin(), metrics.end(),
+                            [&](const Metric &metric) { return metric.formula == formula; });
+    };
+    for (const std::string &name : options.formulas) {
+        const Formula formula = formula_of(name);
+        if (find(formula) != metrics.end())
+            throw RequestError{fmt::format("the formula {} is named twice", name_of(formula))};
+        metrics.push_back(usual_metric(formula));
+    }
+    for (const std::string &wish : options.weights) {
+        const Metric weighted = weighted_metric(wish);
+        const auto metric = find(weighted.formula);
+        if (metric == metrics.end())
+            throw RequestError{fmt::format("--weights of {}, which --formula does not name",
+                                           name_of(weighted.formula))};
+        *metric = weighted;
+    }
+    return metrics;
+}
+
+Pairing pairing_of(const std::string &name)
+{
+    for (const Pairing pairing : {Pairing::name, Pairing::id, Pairing::order})
+        if (name == name_of(pairing))
+            return pairing;
+    return Pairing::automatic;
+}
+
+Outcome run(CompareOptions &options)
+{
+    if (options.tolerance && !(*options.tolerance >= 0 && std::isfinite(*options.tolerance)))
+        throw RequestError{"--tolerance takes a number from 0 up"};
+    CompareRequest request;
+    request.pairing = pairing_of(options.pairing);
+    request.metrics = metrics_of(options);
+    request.illuminant = illuminant_of(options.illuminant);
+    request.second_illuminant = options.second_illuminant.empty()
+                                    ? usual_second(request.illuminant)
+                                    : illuminant_of(options.second_illuminant);
+    request.status = status_of(options.status);
+    request.words_of_hue = options.words == "hue";
+    request.tolerance = options.tolerance;
+    const Measurement reference = sheet_of(options.reference, options);
+    const Measurement sample = sheet_of(options.sample, options);
+    request.reference_paper = &paper_of(reference, options);
+    request.sample_paper = &paper_of(sample, options);
+
+    Comparison comparison = compare(reference, sample, request);
+    comparison.list_all = options.all;
+    for (const auto &[sheet, names] : {std::pair{&reference, &comparison.only_reference},
+                                       std::pair{&sample, &comparison.only_sample}})
+        if (!names->empty())
+            options.warnings.push_back(fmt::format("{}: {} of {} patches have no partner",
+                                                   sheet->file, names->size(),
+                                                   sheet->patches.size()));
+    Outcome outcome = outcome_of(comparison, options);
+    outcome.within_tolerance = comparison.passed();
+    return outcome;
+}
+
+constexpr const char *footer =
+    "Patches pair by name, by id or by their place in the file; of several with the same name the "
+    "first\npairs with the first. auto goes by name, or else by id, where at least half of the "
+    "shorter sheet's\npatches find a partner, or else by place where the sheets are equally long. "
+    "Patches without a\npartner are told, and do not count.\n\n"
+    "With --tolerance the sheet fails, and the exit status is 1, when any pair is above it in the "
+    "first\nformula. The 95th percentile is the smallest difference that at least 95 % of the "
+    "pairs do not\nexceed. CIE94 and CMC weigh by the colour of the reference. Metamerism is the "
+    "sum of the two\nDelta E*ab under the two illuminants; DIN 6172 tells how far the difference "
+    "moves between them.\nDensities are over each sheet's own paper, in the response that reads "
+    "the reference.\n\n"
+    "CSV and CGATS have a row for each pair, with the spectrum of the sample. The fields of the "
+    "JSON\nstand in docs/json.md.\n\n"
+    "Example:\n"
+    "  vantrel compare reference.txt sheet.txt --formula de2000,cmc --weights cmc=1,1 --tolerance "
+    "2.0";
+
+} // namespace
+
+Command add_compare(CLI::App &app)
+{
+    const auto options = std::make_shared<CompareOptions>();
+    CLI::App *command =
+        app.add_subcommand("compare", "How a sheet differs from its reference, patch by patch");
+    command->add_option("REFERENCE", options->reference, "Measurement file to compare with")
+        ->required();
+    command->add_option("SAMPLE", options->sample, "Measurement file of the sheet")->required();
+    add_sheet_options(*command, *options);
+    command->add_option("--pair", options->pairing, "Pair patches by: auto, name, id or order")
+        ->check(CLI::IsMember({"auto", "name", "id", "order"}))
+        ->capture_default_str();
+    command
+        ->add_option("--formula", options->formulas,
+                     "Colour differences, with commas between: de2000, cmc, de94, de76; the first "
+                     "decides on worst and tolerance")
+        ->delimiter(',')
+        ->allow_extra_args(false)
+        ->capture_default_str();
+    command
+        ->add_option("--weights", options->weights,
+                     "FORMULA=LIGHTNESS,CHROMA: kL and kC of de2000 and de94 (default 1,1), l and "
+                     "c of cmc (default 2,1); once for each formula")
+        ->allow_extra_args(false);
+    command->add_option("--second-illuminant", options->second_illuminant,
+                        "Illuminant of the metamerism beside --illuminant (default: A_2DEG or "
+                        "A_10DEG, beside these D65_2DEG or D65_10DEG)");
+    command
+        ->add_option("--words", options->words,
+                     "The difference in words: ab along a* and b*, hue as chroma and hue")
+        ->check(CLI::IsMember({"ab", "hue"}))
+        ->capture_default_str();
+    command->add_option("--tolerance", options->tolerance, "Largest difference that is accepted");
+    command->add_flag("--all", options->all, "List every pair in the table, not the worst ten");
+    command->footer(footer);
+    return {command, [options] { return run(*options); }};
+}
