@@ -12,6 +12,14 @@ Colour colour_of(const Spectrum &refl, ILLUM_OBS illuminant)
     return {{lab[0], lab[1], lab[2]}, {level(0), level(8), level(16)}};
 }
 
+CIELCHCOORD lch_of(const CIELABCOORD &lab)
+{
+    const double from[3] = {lab.L, lab.a, lab.b};
+    double lch[3];
+    CIELabToCIELCH(from, lch);
+    return {lch[0], lch[1], lch[2]};
+}
+
 double delta_e00(const CIELABCOORD &first, const CIELABCOORD &second)
 {
     double delta_e = 0;

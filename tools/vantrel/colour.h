@@ -18,6 +18,7 @@ struct Colour {
 };
 
 Colour colour_of(const Spectrum &refl, ILLUM_OBS illuminant);
+CIELCHCOORD lch_of(const CIELABCOORD &lab);
 double delta_e00(const CIELABCOORD &first, const CIELABCOORD &second);
 std::string hex(const Rgb &rgb); // #rrggbb
 

@@ -34,27 +34,28 @@ std::optional<double> density_difference(const PairReport &pair)
 void add_pairs(Lines &lines, const Comparison &comparison, const std::vector<std::size_t> &chosen,
                bool colour)
 {
-    std::size_t width = 10;
+    // A line has 120 columns, 51 of them for what stands behind the differences.
+    const std::size_t widest = 69 - (colour ? 10 : 0) - 7 * (comparison.metrics.size() + 3);
+    std::size_t width = 5;
     for (const std::size_t i : chosen)
-        width =
-            std::max(width, characters(cut(comparison.pairs[i].reference.name, widest_in_text)));
+        width = std::max(width, characters(cut(comparison.pairs[i].reference.name, widest - 1)));
     std::string head = fmt::format("{:<{}}{}", "Patch", width, colour ? "          " : "");
     for (const Metric &metric : comparison.metrics)
-        head += fmt::format("{:>8}", title_of(metric.formula));
-    lines.add(fmt::format("{}{:>8}{:>8}{:>8}{:>4}{:>7}{:>8}  {}", head, "ΔL*", "Δa*", "Δb*", "",
+        head += fmt::format("{:>7}", title_of(metric.formula));
+    lines.add(fmt::format("{}{:>7}{:>7}{:>7}{:>4}{:>7}{:>7}  {}", head, "ΔL*", "Δa*", "Δb*", "",
                           "ΔD", "Metam.", "Sample is"));
     for (const std::size_t i : chosen) {
         const PairReport &pair = comparison.pairs[i];
         const CIELABCOORD &aim = pair.reference.colour.lab, &lab = pair.sample.colour.lab;
-        std::string line = fmt::format("{:<{}}", cut(pair.reference.name, widest_in_text), width);
+        std::string line = fmt::format("{:<{}}", cut(pair.reference.name, widest - 1), width);
         if (colour)
             line += ' ' + swatch(pair.reference.colour.rgb) + swatch(pair.sample.colour.rgb) + ' ';
         for (const double delta_e : pair.delta_e)
-            line += fmt::format("{:>8}", fixed(delta_e));
+            line += fmt::format("{:>7}", fixed(delta_e));
         for (const double difference : {lab.L - aim.L, lab.a - aim.a, lab.b - aim.b})
-            line += fmt::format("{:>8}", fixed(difference));
+            line += fmt::format("{:>7}", fixed(difference));
         lines.add(line +
-                  fmt::format("{:>4}{:>7}{:>8}  {}",
+                  fmt::format("{:>4}{:>7}{:>7}  {}",
                               pair.response ? response_code(comparison.status, *pair.response) : "",
                               fixed(density_difference(pair), 3), fixed(pair.metamerism),
                               pair.verbal));

@@ -20,10 +20,14 @@ template <typename Value> Json or_null(const std::optional<Value> &value)
     return value ? Json(*value) : Json();
 }
 
+struct PatchReport;
+
 Json lab_json(const CIELABCOORD &lab);
 
 // Adds `response` and `density`.
 void add_reading(Json &object, const Reading &reading, int status);
+
+Json patch_json(const PatchReport &patch, int status);
 
 // The object with one more member, an array whose elements never stand in memory together: each is
 // a line.

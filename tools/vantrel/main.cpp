@@ -22,7 +22,8 @@ Outcome run(CLI::App &app, int count, char **words)
 {
     app.require_subcommand(1);
     app.set_version_flag("--version", VANTREL_VERSION);
-    const Command commands[] = {add_report(app), add_compare(app), add_predict(app)};
+    const Command commands[] = {add_report(app), add_compare(app), add_predict(app), add_ink(app),
+                                add_list(app)};
     app.footer("Exit status: 0 done; 1 a sheet failed its --tolerance; 2 the request or a file is "
                "at fault;\n3 the output could not be written.\n\n"
                "Example:\n  vantrel report two_ink_halftone.txt\n\n"

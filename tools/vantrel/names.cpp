@@ -63,6 +63,33 @@ std::string_view status_name(int status) { return statuses[status]; }
 
 std::string status_names() { return fmt::format("{}", fmt::join(statuses, ", ")); }
 
+bool has_response(int status, int response)
+{
+    if (status == SPECTRAL_STATUS || status == SPECTRALX_STATUS)
+        return false;
+    const bool hifi = response >= HIFI1_RESPONSE && response <= HIFI3_RESPONSE;
+    const bool hexachrome = response == HEXACHROME1_RESPONSE || response == HEXACHROME2_RESPONSE;
+    return !(hifi || hexachrome) || (hifi && status == HIFI_STATUS) ||
+           (hexachrome && status == HEXACHROME_STATUS);
+}
+
+std::optional<int> response_named(std::string_view name)
+{
+    for (int i = 0; i < NUM_RESPONSES; ++i)
+        if (equal_ignoring_case(responses[i].name, name) ||
+            equal_ignoring_case(responses[i].code, name))
+            return i;
+    return std::nullopt;
+}
+
+std::string response_names()
+{
+    std::string out;
+    for (const auto &response : responses)
+        out += fmt::format("{}{}", out.empty() ? "" : ", ", response.name);
+    return out;
+}
+
 std::string response_name(int status, int response)
 {
     if (status == SPECTRAL_STATUS)

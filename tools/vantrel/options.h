@@ -39,6 +39,8 @@ struct Command {
 Command add_report(CLI::App &app);
 Command add_compare(CLI::App &app);
 Command add_predict(CLI::App &app);
+Command add_ink(CLI::App &app);
+Command add_list(CLI::App &app);
 
 // The options that every command has, and those of commands that measure a sheet.
 void add_common_options(CLI::App &command, Options &options);

@@ -24,30 +24,6 @@ Json paper_json(const Report &report)
     return out;
 }
 
-Json patch_json(const PatchReport &patch, int status)
-{
-    Json device = Json::object();
-    for (const auto &[field, value] : patch.device)
-        device[field] = value;
-    return {{"id", patch.id},
-            {"name", patch.name},
-            {"device", device},
-            {"rgb", hex(patch.colour.rgb)},
-            {"lab", lab_json(patch.colour.lab)},
-            {"lch", {patch.lch.L, patch.lch.C, patch.lch.h}},
-            {"de00_to_paper", patch.to_paper},
-            {"response", patch.response ? Json(response_name(status, *patch.response)) : Json()},
-            {"response_id", or_null(patch.response)},
-            {"density", or_null(patch.density)},
-            {"dot_area", or_null(patch.dot_area)},
-            {"dot_gain", or_null(patch.dot_gain)},
-            {"print_contrast", or_null(patch.print_contrast)},
-            {"hue_error", or_null(patch.hue_error)},
-            {"grayness", or_null(patch.grayness)},
-            {"trap", or_null(patch.trap)},
-            {"refl", patch.refl}};
-}
-
 Json estimate_json(const Estimate &estimate, int status)
 {
     Json out = {{"rgb", hex(estimate.colour.rgb)},
@@ -96,6 +72,30 @@ Json prediction_json(const Prediction &prediction, int status)
 }
 
 } // namespace
+
+Json patch_json(const PatchReport &patch, int status)
+{
+    Json device = Json::object();
+    for (const auto &[field, value] : patch.device)
+        device[field] = value;
+    return {{"id", patch.id},
+            {"name", patch.name},
+            {"device", device},
+            {"rgb", hex(patch.colour.rgb)},
+            {"lab", lab_json(patch.colour.lab)},
+            {"lch", {patch.lch.L, patch.lch.C, patch.lch.h}},
+            {"de00_to_paper", patch.to_paper},
+            {"response", patch.response ? Json(response_name(status, *patch.response)) : Json()},
+            {"response_id", or_null(patch.response)},
+            {"density", or_null(patch.density)},
+            {"dot_area", or_null(patch.dot_area)},
+            {"dot_gain", or_null(patch.dot_gain)},
+            {"print_contrast", or_null(patch.print_contrast)},
+            {"hue_error", or_null(patch.hue_error)},
+            {"grayness", or_null(patch.grayness)},
+            {"trap", or_null(patch.trap)},
+            {"refl", patch.refl}};
+}
 
 std::string as_json(const std::vector<Report> &sheets)
 {

@@ -45,6 +45,8 @@ void measure_inks(PatchReport &row, const Patch &patch, const Inks &inks,
     }
 }
 
+} // namespace
+
 PatchReport patch_report(const Patch &patch, const Inks &inks, const Request &request,
                          const CIELABCOORD &paper)
 {
@@ -55,10 +57,7 @@ PatchReport patch_report(const Patch &patch, const Inks &inks, const Request &re
     row.refl = patch.refl;
     row.colour = colour_of(patch.refl, request.illuminant);
     row.to_paper = delta_e00(paper, row.colour.lab);
-    const double lab[3] = {row.colour.lab.L, row.colour.lab.a, row.colour.lab.b};
-    double lch[3];
-    CIELabToCIELCH(lab, lch);
-    row.lch = {lch[0], lch[1], lch[2]};
+    row.lch = lch_of(row.colour.lab);
 
     const Densitometer densitometer(request.paper->refl, request.status);
     const Reading reading = densitometer.read(patch.refl);
@@ -86,6 +85,8 @@ PaperReport paper_report(const Patch &paper, ILLUM_OBS illuminant)
         out.no_whiteness = "outside its limits, 40 < W < 5 Y - 280";
     return out;
 }
+
+namespace {
 
 MetamerismReport metamerism_of(const Request &request)
 {

@@ -67,6 +67,11 @@ struct Report {
     std::vector<PatchReport> patches;
 };
 
+// One patch; `paper` is the colour of the paper.
+PatchReport patch_report(const Patch &patch, const Inks &inks, const Request &request,
+                         const CIELABCOORD &paper);
+PaperReport paper_report(const Patch &paper, ILLUM_OBS illuminant);
+
 Report report_of(const Measurement &sheet, const Inks &inks, const Request &request);
 
 // The output formats; each gives the whole text.

@@ -1,0 +1,52 @@
+// vantrel ink FILE --patch NAME
+
+#include <memory>
+
+#include "options.h"
+#include "patch_study.h"
+
+namespace {
+
+struct InkOptions : Options {
+    std::string file;
+    std::string patch, against;
+    std::vector<std::string> order; // of printing
+};
+
+Outcome run(InkOptions &options)
+{
+    Request request;
+    request.illuminant = illuminant_of(options.illuminant);
+    request.status = status_of(options.status);
+    const Measurement sheet = sheet_of(options.file, options);
+    request.paper = &paper_of(sheet, options);
+    const Patch &patch = patch_named(sheet, options.patch);
+    const Patch *other = options.against.empty() ? nullptr : &patch_named(sheet, options.against);
+    return outcome_of(study_of(sheet, Inks(sheet, options.order), request, patch, other), options);
+}
+
+constexpr const char *footer =
+    "Densities are over the paper. Brightness and the whiteness of ASTM E313 describe the patch as "
+    "a\npaper. With --against there are, under every illuminant, the difference from that patch "
+    "(Delta E00)\nand the metamerism of the two beside --illuminant (sum of two Delta E*ab; DIN "
+    "6172), and for each\nband its share in the difference along a* and b* as a signed weight, the "
+    "largest 100: positive where\nthe patch is redder, or yellower.\n\n"
+    "CSV and CGATS hold one table after the other: spectra, bands, densities, colours; the first "
+    "column of\nthe CSV names the table. The fields of the JSON stand in docs/json.md.\n\n"
+    "Example:\n  vantrel ink two_ink_halftone.txt --patch \"Magenta 100\" --against \"Magenta 90\"";
+
+} // namespace
+
+Command add_ink(CLI::App &app)
+{
+    const auto options = std::make_shared<InkOptions>();
+    CLI::App *command = app.add_subcommand(
+        "ink", "Everything about one patch: spectrum, densities, colours, differences");
+    command->add_option("FILE", options->file, "Measurement file with spectra")->required();
+    command->add_option("--patch", options->patch, "The patch by name or id")->required();
+    command->add_option("--against", options->against, "Another patch to set it beside");
+    add_sheet_options(*command, *options);
+    add_order_option(*command, options->order);
+    command->footer(footer);
+    return {command, [options] { return run(*options); }};
+}
