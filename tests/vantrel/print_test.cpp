@@ -159,6 +159,16 @@ TEST(Print, TakesNominalTintsAsTheyAre)
     const Json loss = json_of(changed("\"Magenta 50\"\t50", "\"Magenta 50\"\t70"));
     EXPECT_NEAR(patch(loss, "Magenta 50")["dot_area"], 68.617341855, 1e-8);
     EXPECT_EQ(patch(loss, "Magenta 50")["dot_gain"], 0.0); // a gain is never negative
+    // The mean of two tints of one nominal value stands in the curve, whose means are the patches'.
+    const Json repeated = json_of(changed("\"Magenta 50\"\t50", "\"Magenta 50\"\t40"));
+    const Json &curve = repeated["tone_values"][0];
+    EXPECT_EQ(curve["solid"], "Magenta 100");
+    EXPECT_EQ(curve["values"].size(), 8u);
+    EXPECT_EQ(curve["values"][3]["patches"], 2);
+    EXPECT_NEAR(2 * double(curve["values"][3]["dot_area"]),
+                double(patch(repeated, "Magenta 40")["dot_area"]) +
+                    double(patch(repeated, "Magenta 50")["dot_area"]),
+                1e-9);
     // The first of two solids counts.
     const Json twice = json_of(changed("\"Magenta 90\"\t90", "\"Magenta 90\"\t100"));
     EXPECT_GT(patch(twice, "Magenta 50")["dot_area"], 70);
@@ -228,6 +238,18 @@ Magenta 100 Yellow 100       68.10
 Shadows                   contrast
 Magenta 80                   16.32
 Yellow 80                    20.08
+
+Tone values          CMYK_M          CMYK_Y
+    nominal     area   gain     area   gain
+         10    12.73   2.73    15.90   5.90
+         20    28.22   8.22    31.10  11.10
+         30    42.92  12.92    44.75  14.75
+         40    56.00  16.00    57.37  17.37
+         50    68.62  18.62    69.13  19.13
+         60    78.75  18.75    77.60  17.60
+         70    85.48  15.48    86.69  16.69
+         80    89.76   9.76    90.82  10.82
+         90    94.89   4.89    96.18   6.18
 
 Inks print in the order CMYK_M, CMYK_Y
 )";

@@ -34,6 +34,21 @@ Json estimate_json(const Estimate &estimate, int status)
     return out;
 }
 
+Json tone_values_json(const Report &report)
+{
+    Json out = Json::array();
+    for (const ToneCurve &curve : report.tone_curves) {
+        Json values = Json::array();
+        for (const ToneValue &value : curve.values)
+            values.push_back({{"nominal", value.nominal},
+                              {"dot_area", value.dot_area},
+                              {"dot_gain", value.dot_gain},
+                              {"patches", value.patches}});
+        out.push_back({{"ink", curve.ink}, {"solid", curve.solid}, {"values", values}});
+    }
+    return out;
+}
+
 std::string sheet_json(const Report &report)
 {
     const Json head = {
@@ -48,6 +63,7 @@ std::string sheet_json(const Report &report)
           {"bands", report.source.bands},
           {"scaled_to_percent", report.source.scaled}}},
         {"paper", paper_json(report)},
+        {"tone_values", tone_values_json(report)},
     };
     return with_array(head, "patches", report.patches.size(),
                       [&](std::size_t i) { return patch_json(report.patches[i], report.status); });

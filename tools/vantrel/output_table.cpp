@@ -1,6 +1,7 @@
 #include <algorithm>
 #include <cmath>
 #include <iterator>
+#include <map>
 #include <optional>
 #include <utility>
 
@@ -98,6 +99,38 @@ std::string colour_columns(const Colour &shown, bool colour)
                        fixed(shown.lab.a), fixed(shown.lab.b));
 }
 
+// Dot area and gain of every ink by nominal value, six inks side by side.
+void add_tone_values(Lines &lines, const Report &report)
+{
+    constexpr std::size_t side_by_side = 6;
+    const std::vector<ToneCurve> &curves = report.tone_curves;
+    for (std::size_t first = 0; first < curves.size(); first += side_by_side) {
+        const std::size_t end = std::min(curves.size(), first + side_by_side);
+        std::string inks = fmt::format("\n{:<11}", "Tone values");
+        std::string head = fmt::format("{:>11}", "nominal");
+        std::map<double, std::vector<const ToneValue *>> rows;
+        for (std::size_t ink = first; ink < end; ++ink) {
+            inks += fmt::format("{:>16}", cut(curves[ink].ink, 14));
+            head += fmt::format("{:>9}{:>7}", "area", "gain");
+            for (const ToneValue &value : curves[ink].values) {
+                auto &row = rows[value.nominal];
+                row.resize(end - first);
+                row[ink - first] = &value;
+            }
+        }
+        lines.add(inks);
+        lines.add(head);
+        for (const auto &[nominal, values] : rows) {
+            std::string line = fmt::format("{:>11g}", nominal);
+            for (const ToneValue *value : values)
+                line += value ? fmt::format("{:>9}{:>7}", fixed(value->dot_area),
+                                            fixed(value->dot_gain))
+                              : fmt::format("{:>16}", "");
+            lines.add(line);
+        }
+    }
+}
+
 std::string shown(const Reading &reading, int status)
 {
     return reading.density ? fmt::format("{} {}", response_code(status, *reading.response),
@@ -146,6 +179,7 @@ std::string as_table(const Report &report, bool colour)
                {"density", &PatchReport::density, 3}});
     add_block(lines, report, "Overprints", width, {{"trap", &PatchReport::trap}});
     add_block(lines, report, "Shadows", width, {{"contrast", &PatchReport::print_contrast}});
+    add_tone_values(lines, report);
     if (report.inks.size() > 1)
         lines.add(fmt::format("\nInks print in the order {}", fmt::join(report.inks, ", ")));
     return lines.out;

@@ -1,5 +1,7 @@
 #include "report.h"
 
+#include <map>
+
 #include <fmt/format.h>
 
 #include "densitometer.h"
@@ -103,6 +105,40 @@ MetamerismReport metamerism_of(const Request &request)
 
 } // namespace
 
+namespace {
+
+std::vector<ToneCurve> tone_curves(const Measurement &sheet, const Inks &inks,
+                                   const std::vector<PatchReport> &rows)
+{
+    std::vector<std::map<double, ToneValue>> sums(inks.names().size());
+    for (std::size_t i = 0; i < rows.size(); ++i) {
+        if (!rows[i].dot_area)
+            continue;
+        const Tint tint = inks.tints_of(sheet.patches[i])->front(); // the only one
+        ToneValue &sum = sums[tint.ink].try_emplace(tint.percent).first->second;
+        sum.nominal = tint.percent;
+        sum.dot_area += *rows[i].dot_area;
+        sum.dot_gain += *rows[i].dot_gain;
+        ++sum.patches;
+    }
+    std::vector<ToneCurve> curves;
+    for (std::size_t ink = 0; ink < sums.size(); ++ink) {
+        if (sums[ink].empty())
+            continue;
+        ToneCurve &curve = curves.emplace_back();
+        curve.ink = inks.names()[ink];
+        curve.solid = inks.solid(ink)->name;
+        for (auto &[nominal, sum] : sums[ink]) {
+            sum.dot_area /= static_cast<double>(sum.patches);
+            sum.dot_gain /= static_cast<double>(sum.patches);
+            curve.values.push_back(sum);
+        }
+    }
+    return curves;
+}
+
+} // namespace
+
 Report report_of(const Measurement &sheet, const Inks &inks, const Request &request)
 {
     Report report{.file = sheet.file,
@@ -113,10 +149,12 @@ Report report_of(const Measurement &sheet, const Inks &inks, const Request &requ
                   .source = sheet.source,
                   .paper = paper_report(*request.paper, request.illuminant),
                   .metamerism = {},
-                  .patches = {}};
+                  .patches = {},
+                  .tone_curves = {}};
     if (request.second_paper)
         report.metamerism = metamerism_of(request);
     for (const Patch &patch : sheet.patches)
         report.patches.push_back(patch_report(patch, inks, request, report.paper.lab));
+    report.tone_curves = tone_curves(sheet, inks, report.patches);
     return report;
 }

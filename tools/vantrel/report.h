@@ -55,6 +55,21 @@ struct MetamerismReport {
     double din6172;
 };
 
+// Of patches of one nominal value: their means.
+struct ToneValue {
+    double nominal;
+    double dot_area;
+    double dot_gain;
+    std::size_t patches;
+};
+
+// From the lightest tint to the darkest.
+struct ToneCurve {
+    std::string ink; // device field
+    std::string solid;
+    std::vector<ToneValue> values;
+};
+
 struct Report {
     std::string file;
     ILLUM_OBS illuminant;
@@ -65,6 +80,7 @@ struct Report {
     PaperReport paper;
     std::optional<MetamerismReport> metamerism;
     std::vector<PatchReport> patches;
+    std::vector<ToneCurve> tone_curves; // of the inks that have measured tints
 };
 
 // One patch; `paper` is the colour of the paper.
