@@ -165,11 +165,11 @@ std::string_view name_of(Pairing pairing)
 
 Pairs pairs_of(const Measurement &reference, const Measurement &sample, Pairing wish)
 {
-    const Pairs pairs = wish == Pairing::automatic ? automatic_pairs(reference, sample)
-                        : wish == Pairing::name    ? pairs_by(reference, sample, wish, &Patch::name)
-                        : wish == Pairing::id
-                            ? pairs_by(reference, sample, wish, &Patch::id)
-                            : pairs_in_order(reference.patches.size(), sample.patches.size());
+    Pairs pairs = wish == Pairing::automatic ? automatic_pairs(reference, sample)
+                  : wish == Pairing::name    ? pairs_by(reference, sample, wish, &Patch::name)
+                  : wish == Pairing::id
+                      ? pairs_by(reference, sample, wish, &Patch::id)
+                      : pairs_in_order(reference.patches.size(), sample.patches.size());
     if (pairs.matched.empty())
         throw RequestError{fmt::format("no patch of {} has a partner in {} by {}", reference.file,
                                        sample.file, name_of(pairs.by))};

@@ -16,7 +16,7 @@ namespace {
 // ΔE00, ΔE CMC(2:1), ΔE94 (kL 2, kC 1)
 std::string full_title(const Metric &metric)
 {
-    const std::string title(title_of(metric.formula));
+    std::string title(title_of(metric.formula));
     if (metric.formula == Formula::cmc)
         return fmt::format("{}({:g}:{:g})", title, metric.lightness, metric.chroma);
     if (metric.lightness == 1 && metric.chroma == 1)

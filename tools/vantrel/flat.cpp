@@ -19,7 +19,7 @@ bool is_formula(const std::string &text)
 
 std::string csv_text(const std::string &text)
 {
-    const std::string safe = is_formula(text) ? '\'' + text : text;
+    std::string safe = is_formula(text) ? '\'' + text : text;
     if (safe.find_first_of(",\"\r\n") == std::string::npos)
         return safe;
     std::string out = "\"";
