@@ -3,7 +3,7 @@
 cd "$(dirname "${BASH_SOURCE[0]}")/.."
 
 build_packages=(cmake ninja-build g++ pkg-config
-    libcli11-dev libfmt-dev nlohmann-json3-dev liblcms2-dev)
+    libcli11-dev libfmt-dev nlohmann-json3-dev libpugixml-dev)
 fuzz_packages=(clang libclang-rt-14-dev)
 test_packages=(libgtest-dev clang clang-tidy clang-format doxygen binutils)
 

@@ -149,7 +149,7 @@ TEST(Print, LeavesBlankWhatMakesNoSense)
 
     // A "solid" that is the paper has no density to compare with.
     EXPECT_EQ(present(patch(json_of("--paper 'Magenta 100' " + example), "Magenta 50")), "d");
-    EXPECT_EQ(json_of(data + "tables_fine_steps.txt")["inks"], Json::array());
+    EXPECT_EQ(json_of(data + "pairs_decimal_comma.txt")["inks"], Json::array());
 }
 
 TEST(Print, TakesNominalTintsAsTheyAre)
@@ -279,7 +279,8 @@ TEST(Print, RefusesBadRequestsInOneLine)
                                                   "CMYK_Y"},
                      {"--order 'Magenta 50'", example + " holds no ink \"Magenta 50\""},
                      {"--order CMYK_M,11", "the ink \"11\" is named twice"}});
-    expect_refusals("report " + data + "tables_fine_steps.txt",
-                    {{"--order CMYK_C", data + "tables_fine_steps.txt holds no ink \"CMYK_C\"; its "
-                                               "inks are unknown"}});
+    expect_refusals(
+        "report " + data + "pairs_decimal_comma.txt",
+        {{"--order CMYK_C", data + "pairs_decimal_comma.txt holds no ink \"CMYK_C\"; its "
+                                   "inks are unknown"}});
 }

@@ -73,12 +73,6 @@ TEST(Report, ReadsTheDialectsOfOtherPrograms)
          false,
          31,
          ""},
-        {"tables_fine_steps.txt",
-         {"1", "2", "3"},
-         true,
-         61,
-         "vantrel: FILE:13: NUMBER_OF_SETS is 4, but 3 follow\n"
-         "vantrel: FILE:22: further spectra are left out, from this table on\n"},
     };
     for (const auto &dialect : dialects) {
         const std::string file = data + dialect.file;
@@ -113,7 +107,6 @@ TEST(Report, RefusesBadFilesInOneLine)
         std::string text;
         const char *complaint; // after the file's name
     } cases[] = {
-        {"", ": not CGATS text: no fields are named (BEGIN_DATA_FORMAT)"},
         {good + '\0', ": not a text file"},
         {good.substr(0, good.size() / 2), ":25: 5 values in a row of 35 fields"},
         {good.substr(0, good.rfind("END_DATA")), ":41: the file ends before END_DATA"},
@@ -126,15 +119,11 @@ TEST(Report, RefusesBadFilesInOneLine)
         {replaced(good, "\"Magenta 10\"\t10", "\"Magenta 10\"\tten"),
          ":12: CMYK_M is \"ten\", not a number"},
         {replaced(good, "\"Magenta 10\"", "\"Magenta 10"), ":12: a quoted text is not closed"},
-        {replaced(good, "SPECTRAL_NM400", "SPECTRAL_NM405"),
-         ":7: no value at 400 nm in spectra of 31 values from 405 to 700 nm; every 10 nm from 400 "
-         "to 700 is needed"},
         {replaced(good, "SPECTRAL_NM410", "R_400"), ":7: 400 nm occurs twice in a spectrum"},
-        {replaced(content(data + "tables_fine_steps.txt"), "\"1.0\"", "\"1e-320\""),
-         ":15: a value is too large in percent"},
-        {replaced(content(data + "pairs_decimal_comma.txt"), "\t700\t", "\t699\t"),
-         ":11: no value at 700 nm in spectra of 36 values from 380 to 730 nm; every 10 nm from 400 "
-         "to 700 is needed"},
+        {"SPECTRAL_NORM 1e-320\n" + good, ":12: a value is too large in percent"},
+        {replaced(content(data + "pairs_decimal_comma.txt"), "\t700\t", "\t712\t"),
+         ":11: the range is too short in spectra of 36 values from 380 to 730 nm; every 10 nm from "
+         "400 to 700 is needed, or finer steps"},
     };
     const std::string file = scratch("bad.txt");
     for (const auto &bad : cases) {
@@ -147,8 +136,15 @@ TEST(Report, RefusesBadFilesInOneLine)
     EXPECT_EQ(vantrel("report /nowhere").err, "vantrel: /nowhere: No such file or directory\n");
     EXPECT_EQ(vantrel("report " + data).err, "vantrel: " + data + ": Is a directory\n");
     const Outcome endless = vantrel("report /dev/zero");
-    EXPECT_EQ(endless.err, "vantrel: /dev/zero: larger than 64 MiB\n");
+    EXPECT_EQ(endless.err, "vantrel: /dev/zero: larger than 512 MiB\n");
     EXPECT_EQ(endless.status, 2);
+    EXPECT_EQ(
+        shell("tail -n +2 " + data + "conditions.cxf | " + program + " report --condition M2 -")
+            .err,
+        "vantrel: -: no spectra under M2; the file has M0, M1\n");
+    EXPECT_NE(vantrel("report --scale percent " + data + "conditions.cxf")
+                  .out.find(" nm, M1; in percent (by --scale)\n"),
+              std::string::npos);
 }
 
 TEST(Program, NamesWhatARequestMayHold)

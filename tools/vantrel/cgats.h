@@ -1,12 +1,13 @@
-// Measurement files in CGATS text (ISO 28178).
+// CGATS text (ISO 28178) as instruments and programs export it.
 #ifndef VANTREL_TOOL_CGATS_H
 #define VANTREL_TOOL_CGATS_H
 
 #include <string_view>
 
-#include "measurement.h"
+#include "sheet.h"
 
-// The patches of the first table that holds spectra; throws InputError.
-Measurement read_cgats(std::string_view file);
+// The first table that holds spectra, with the rows of later tables of the same fields. Throws
+// InputError.
+void read_cgats(std::string_view text, Sheet &sheet);
 
 #endif

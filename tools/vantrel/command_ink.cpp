@@ -42,7 +42,10 @@ Command add_ink(CLI::App &app)
     const auto options = std::make_shared<InkOptions>();
     CLI::App *command = app.add_subcommand(
         "ink", "Everything about one patch: spectrum, densities, colours, differences");
-    command->add_option("FILE", options->file, "Measurement file with spectra")->required();
+    command
+        ->add_option("FILE", options->file,
+                     "Measurement file: CGATS text, CSV or CxF with spectra; - is standard input")
+        ->required();
     command->add_option("--patch", options->patch, "The patch by name or id")->required();
     command->add_option("--against", options->against, "Another patch to set it beside");
     add_sheet_options(*command, *options);

@@ -41,7 +41,10 @@ Command add_predict(CLI::App &app)
     const auto options = std::make_shared<PredictOptions>();
     CLI::App *command = app.add_subcommand(
         "predict", "The colour that inks will have as tints and over one another");
-    command->add_option("FILE", options->file, "Measurement file with spectra")->required();
+    command
+        ->add_option("FILE", options->file,
+                     "Measurement file: CGATS text, CSV or CxF with spectra; - is standard input")
+        ->required();
     add_sheet_options(*command, *options);
     add_order_option(*command, options->order);
     command

@@ -62,7 +62,10 @@ Command add_report(CLI::App &app)
     const auto options = std::make_shared<ReportOptions>();
     CLI::App *command = app.add_subcommand(
         "report", "The colour, density and print attributes of every patch of a sheet");
-    command->add_option("FILE", options->files, "Measurement files with spectra")->required();
+    command
+        ->add_option("FILE", options->files,
+                     "Measurement files: CGATS text, CSV or CxF with spectra; - is standard input")
+        ->required();
     add_sheet_options(*command, *options);
     add_order_option(*command, options->order);
     command->add_option("--n-factor", options->n_factor, "Yule-Nielsen factor of the dot areas")

@@ -8,9 +8,9 @@ std::optional<int> Densitometer::response(const Spectrum &refl) const
     return found ? std::optional(response) : std::nullopt;
 }
 
-Reading Densitometer::read(const Spectrum &refl) const
+DensityReading Densitometer::read(const Spectrum &refl) const
 {
-    Reading out{response(refl), std::nullopt};
+    DensityReading out{response(refl), std::nullopt};
     if (out.response)
         out.density = density(refl, *out.response);
     return out;

@@ -7,7 +7,7 @@
 #include "measurement.h"
 
 // A density over the paper, in the response that reads the ink; both missing where there is none.
-struct Reading {
+struct DensityReading {
     std::optional<int> response;
     std::optional<double> density;
 };
@@ -20,7 +20,7 @@ public:
     // is none.
     std::optional<int> response(const Spectrum &refl) const;
 
-    Reading read(const Spectrum &refl) const;
+    DensityReading read(const Spectrum &refl) const;
 
     // Over the paper under every status: SPECTRAL_STATUS, which takes no paper, included.
     double density(const Spectrum &refl, int response) const;

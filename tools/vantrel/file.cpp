@@ -9,17 +9,22 @@
 
 namespace {
 
-constexpr std::size_t largest_file = 64u << 20;
+constexpr std::size_t largest_file = 512u << 20;
 
 struct Close {
-    void operator()(std::FILE *file) const { static_cast<void>(std::fclose(file)); }
+    void operator()(std::FILE *file) const
+    {
+        if (file != stdin)
+            static_cast<void>(std::fclose(file));
+    }
 };
 
 } // namespace
 
 std::string read_file(const std::string &path)
 {
-    const std::unique_ptr<std::FILE, Close> file(std::fopen(path.c_str(), "rb"));
+    const std::unique_ptr<std::FILE, Close> file(path == "-" ? stdin
+                                                             : std::fopen(path.c_str(), "rb"));
     if (!file)
         throw InputError{0, std::strerror(errno)};
     std::string text;
@@ -27,7 +32,7 @@ std::string read_file(const std::string &path)
     while (const std::size_t got = std::fread(block, 1, sizeof block, file.get())) {
         text.append(block, got);
         if (text.size() > largest_file)
-            throw InputError{0, "larger than 64 MiB"};
+            throw InputError{0, "larger than 512 MiB"};
     }
     if (std::ferror(file.get()))
         throw InputError{0, std::strerror(errno)};

@@ -4,7 +4,7 @@
 
 #include <string>
 
-// The whole file; throws InputError.
+// The whole file, or standard input for -; throws InputError.
 std::string read_file(const std::string &path);
 
 #endif

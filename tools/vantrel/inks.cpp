@@ -8,12 +8,10 @@
 
 Inks::Inks(const Measurement &sheet, const std::vector<std::string> &order) : sheet(sheet)
 {
-    const auto &device = sheet.patches.front().device; // every patch has the same fields
-    for (std::size_t i = 0; i < device.size(); ++i)
-        if (!device[i].first.starts_with("RGB_")) {
-            columns.push_back(i);
-            fields.push_back(device[i].first);
-        }
+    for (const Patch &patch : sheet.patches)
+        for (const auto &[field, percent] : patch.device)
+            if (!field.starts_with("RGB_") && numbers.emplace(field, fields.size()).second)
+                fields.push_back(field);
 
     std::vector<std::size_t> sequence;
     for (const std::string &name : order) {
@@ -29,10 +27,10 @@ Inks::Inks(const Measurement &sheet, const std::vector<std::string> &order) : sh
     for (std::size_t ink = 0; ink < fields.size(); ++ink)
         if (std::find(sequence.begin(), sequence.end(), ink) == sequence.end())
             sequence.push_back(ink);
-    const auto in_file = std::pair(fields, columns);
+    const std::vector<std::string> in_file = fields;
     for (std::size_t i = 0; i < sequence.size(); ++i) {
-        fields[i] = in_file.first[sequence[i]];
-        columns[i] = in_file.second[sequence[i]];
+        fields[i] = in_file[sequence[i]];
+        numbers[fields[i]] = i;
     }
     for (const Patch &patch : sheet.patches)
         if (const auto tints = tints_of(patch))
@@ -41,17 +39,23 @@ Inks::Inks(const Measurement &sheet, const std::vector<std::string> &order) : sh
 
 std::optional<Tints> Inks::tints_of(const Patch &patch) const
 {
-    if (columns.empty())
+    if (fields.empty() || patch.device.empty())
         return std::nullopt;
     Tints tints;
-    for (std::size_t ink = 0; ink < columns.size(); ++ink) {
-        const double percent = patch.device[columns[ink]].second;
+    for (const auto &[field, percent] : patch.device) {
+        const auto number = numbers.find(field);
+        if (number == numbers.end()) // no ink
+            continue;
         if (percent < 0 || percent > 100)
             return std::nullopt;
         if (percent > 0)
-            tints.push_back({ink, percent});
+            tints.push_back({number->second, percent});
     }
-    return tints;
+    std::sort(tints.begin(), tints.end());
+    const bool twice = std::adjacent_find(tints.begin(), tints.end(), [](auto &a, auto &b) {
+                           return a.ink == b.ink;
+                       }) != tints.end();
+    return twice ? std::nullopt : std::optional(tints);
 }
 
 const Patch *Inks::measured(const Tints &tints) const

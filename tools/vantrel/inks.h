@@ -32,7 +32,7 @@ public:
     // The device fields in the order of printing.
     const std::vector<std::string> &names() const { return fields; }
 
-    // Nothing where the device values are no inks, or not from 0 to 100.
+    // Nothing where the patch has no device values, or they are no inks or not from 0 to 100.
     std::optional<Tints> tints_of(const Patch &patch) const;
 
     // The first patch of this combination, null where there is none.
@@ -48,7 +48,7 @@ public:
 private:
     const Measurement &sheet;
     std::vector<std::string> fields;
-    std::vector<std::size_t> columns; // where a patch's device values hold them
+    std::map<std::string, std::size_t> numbers; // of the fields, in the order of printing
     std::map<Tints, const Patch *> patches;
 };
 

@@ -6,7 +6,7 @@
 
 Json lab_json(const CIELABCOORD &lab) { return {lab.L, lab.a, lab.b}; }
 
-void add_reading(Json &object, const Reading &reading, int status)
+void add_reading(Json &object, const DensityReading &reading, int status)
 {
     object["response"] = reading.response ? Json(response_name(status, *reading.response)) : Json();
     object["density"] = or_null(reading.density);

@@ -25,7 +25,7 @@ struct PatchReport;
 Json lab_json(const CIELABCOORD &lab);
 
 // Adds `response` and `density`.
-void add_reading(Json &object, const Reading &reading, int status);
+void add_reading(Json &object, const DensityReading &reading, int status);
 
 Json patch_json(const PatchReport &patch, int status);
 

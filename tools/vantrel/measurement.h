@@ -17,15 +17,28 @@ struct Patch {
     std::string id;
     std::string name;
     Spectrum refl{};
-    std::vector<std::pair<std::string, double>> device; // CMYK_M, … in percent, by field name
+    // CMYK_M, … in percent, by field name; empty where the file has none for this patch. Inks that
+    // other patches name and this one does not are at 0.
+    std::vector<std::pair<std::string, double>> device;
 };
 
 // What the spectra looked like in the file.
 struct Source {
     double first_nm = 0;
     double last_nm = 0;
+    double step_nm = 0;
     std::size_t bands = 0;
-    bool scaled = false; // not in percent there
+    bool averaged = false; // several of its values make a band
+    bool scaled = false;   // not in percent there
+    std::string scale_by;  // what told the scale: a keyword, "values" or "--scale"
+    std::string condition; // M0 to M3 (ISO 13655), empty where the file does not say
+};
+
+// How a file is to be read.
+enum class Scale { automatic, percent, fraction };
+struct Reading {
+    Scale scale = Scale::automatic;
+    std::string condition; // M0 to M3; empty for the one that the file has, or M1 of several
 };
 
 struct Measurement {

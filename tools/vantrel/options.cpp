@@ -6,9 +6,9 @@
 
 #include <fmt/format.h>
 
-#include "cgats.h"
 #include "file.h"
 #include "names.h"
+#include "reader.h"
 #include "text.h"
 
 void add_common_options(CLI::App &command, Options &options)
@@ -32,6 +32,16 @@ void add_sheet_options(CLI::App &command, Options &options)
         ->capture_default_str();
     command.add_option("--paper", options.paper,
                        "The paper's patch by name or id (default: the first patch)");
+    command
+        .add_option("--scale", options.scale,
+                    "Scale of a file's reflectances: auto, percent, or fraction for 0 to 1")
+        ->check(CLI::IsMember({"auto", "percent", "fraction"}))
+        ->capture_default_str();
+    command
+        .add_option("--condition", options.condition,
+                    "Measurement condition to read from a file with several: M0, M1, M2 or M3 "
+                    "(default: M1, or else the first)")
+        ->check(CLI::IsMember({"M0", "M1", "M2", "M3"}, CLI::ignore_case));
     add_common_options(command, options);
 }
 
@@ -80,7 +90,11 @@ Measurement sheet_of(const std::string &path, Options &options)
 {
     const std::string file = printable(path);
     try {
-        Measurement sheet = read_cgats(read_file(path));
+        Reading reading;
+        if (options.scale != "auto")
+            reading.scale = options.scale == "percent" ? Scale::percent : Scale::fraction;
+        reading.condition = options.condition;
+        Measurement sheet = read_measurement(read_file(path), reading);
         sheet.file = file;
         for (const std::string &warning : sheet.warnings)
             options.warnings.push_back(fmt::format("{}:{}", file, warning));

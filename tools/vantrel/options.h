@@ -16,6 +16,8 @@ struct Options {
     std::string illuminant = "D50_2DEG";
     std::string status = "E_STATUS";
     std::string paper; // name or id
+    std::string scale = "auto";
+    std::string condition; // M1 or the only one where it is empty
     std::string format = "table";
     std::string output; // a file; standard output where it is empty
     bool no_color = false;

@@ -23,7 +23,7 @@ const Column print_columns[] = {
     {{"trap", "TRAP"}, &PatchReport::trap},
 };
 
-void add_reading_cells(Row &row, const Reading &reading, int status)
+void add_reading_cells(Row &row, const DensityReading &reading, int status)
 {
     row.push_back(reading.response ? response_name(status, *reading.response) : "");
     row.push_back(cell(reading.density));

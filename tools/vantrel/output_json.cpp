@@ -60,8 +60,12 @@ std::string sheet_json(const Report &report)
         {"source",
          {{"first_nm", report.source.first_nm},
           {"last_nm", report.source.last_nm},
+          {"step_nm", report.source.step_nm},
           {"bands", report.source.bands},
-          {"scaled_to_percent", report.source.scaled}}},
+          {"averaged", report.source.averaged},
+          {"scaled_to_percent", report.source.scaled},
+          {"scale_by", report.source.scale_by},
+          {"condition", report.source.condition.empty() ? Json() : Json(report.source.condition)}}},
         {"paper", paper_json(report)},
         {"tone_values", tone_values_json(report)},
     };

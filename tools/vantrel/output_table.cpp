@@ -15,6 +15,21 @@
 
 namespace {
 
+// Where the 31 bands in percent come from.
+std::string spectra_of(const Source &source)
+{
+    std::string out = fmt::format("Spectra: {} values from {:g} to {:g} nm", source.bands,
+                                  source.first_nm, source.last_nm);
+    if (source.averaged)
+        out += fmt::format(" in steps of {:.3g}, averaged to 10 nm by a triangle", source.step_nm);
+    else if (source.first_nm != 400 || source.last_nm != 700)
+        out += ", those from 400 to 700 nm used";
+    if (!source.condition.empty())
+        out += ", " + source.condition;
+    return out + fmt::format("; {} (by {})", source.scaled ? "brought to percent" : "in percent",
+                             source.scale_by);
+}
+
 void add_head(Lines &lines, const Report &report)
 {
     const std::string paper = cut(report.paper.name, widest_in_text);
@@ -22,13 +37,7 @@ void add_head(Lines &lines, const Report &report)
     lines.add(fmt::format("{}, {}, ΔE00 and density over {}, dot area with n = {:g}",
                           name_of(report.illuminant), status_name(report.status), paper,
                           report.n_factor));
-    const Source &source = report.source;
-    if (source.first_nm != 400 || source.last_nm != 700 || source.bands != VANTREL_BANDS)
-        lines.add(
-            fmt::format("Of {} values from {:g} to {:g} nm, the 31 from 400 to 700 nm are used",
-                        source.bands, source.first_nm, source.last_nm));
-    if (source.scaled)
-        lines.add("The file's reflectance factors are brought to percent");
+    lines.add(spectra_of(report.source));
 }
 
 void add_patches(Lines &lines, const Report &report, std::size_t width, bool colour)
@@ -131,7 +140,7 @@ void add_tone_values(Lines &lines, const Report &report)
     }
 }
 
-std::string shown(const Reading &reading, int status)
+std::string shown(const DensityReading &reading, int status)
 {
     return reading.density ? fmt::format("{} {}", response_code(status, *reading.response),
                                          fixed(reading.density, 3))

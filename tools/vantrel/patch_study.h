@@ -12,7 +12,7 @@
 #include "report.h"
 
 struct StatusReading {
-    Reading reading; // in the response that reads the patch
+    DensityReading reading; // in the response that reads the patch
     std::array<std::optional<double>, NUM_RESPONSES> densities; // of the status's own responses
 };
 

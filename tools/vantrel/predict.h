@@ -22,13 +22,13 @@ struct Estimate {
     Spectrum refl{};
     Colour colour;
     std::optional<double> to_measured; // ΔE00
-    Reading reading;
+    DensityReading reading;
 };
 
 struct Measured {
     std::string patch;
     Colour colour;
-    Reading reading;
+    DensityReading reading;
 };
 
 struct Prediction {

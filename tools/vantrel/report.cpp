@@ -6,6 +6,7 @@
 
 #include "densitometer.h"
 #include "names.h"
+#include "progress.h"
 
 namespace {
 
@@ -62,7 +63,7 @@ PatchReport patch_report(const Patch &patch, const Inks &inks, const Request &re
     row.lch = lch_of(row.colour.lab);
 
     const Densitometer densitometer(request.paper->refl, request.status);
-    const Reading reading = densitometer.read(patch.refl);
+    const DensityReading reading = densitometer.read(patch.refl);
     row.response = reading.response;
     row.density = reading.density;
     measure_inks(row, patch, inks, densitometer, request.n_factor);
@@ -153,8 +154,11 @@ Report report_of(const Measurement &sheet, const Inks &inks, const Request &requ
                   .tone_curves = {}};
     if (request.second_paper)
         report.metamerism = metamerism_of(request);
-    for (const Patch &patch : sheet.patches)
+    Progress progress("Measuring", sheet.patches.size());
+    for (const Patch &patch : sheet.patches) {
+        progress.done(report.patches.size());
         report.patches.push_back(patch_report(patch, inks, request, report.paper.lab));
+    }
     report.tone_curves = tone_curves(sheet, inks, report.patches);
     return report;
 }

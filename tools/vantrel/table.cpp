@@ -1,8 +1,9 @@
 #include "table.h"
 
 #include <algorithm>
+#include <array>
 #include <cmath>
-#include <map>
+#include <initializer_list>
 
 #include <fmt/format.h>
 
@@ -11,29 +12,65 @@
 namespace {
 
 constexpr std::size_t none = static_cast<std::size_t>(-1);
+constexpr std::size_t longest_ink_name = 80;
 
 // SAMPLE_ID, SampleID and Sample Id are the same field.
 std::string letters(std::string_view field)
 {
     std::string out = upper(field);
-    std::erase_if(out, [](char c) { return c == '_' || c == ' '; });
+    std::erase_if(out, [](char c) { return c == '_' || c == ' ' || c == '-'; });
     return out;
 }
 
-std::size_t column_of(const Table &table, std::string_view field)
+// The column of the first of these fields that there is.
+std::size_t column_of(const std::vector<std::string> &keys,
+                      std::initializer_list<std::string_view> fields)
 {
-    for (std::size_t i = 0; i < table.fields.size(); ++i)
-        if (letters(table.fields[i]) == field)
-            return i;
+    for (const std::string_view field : fields) {
+        const auto found = std::find(keys.begin(), keys.end(), field);
+        if (found != keys.end())
+            return static_cast<std::size_t>(found - keys.begin());
+    }
     return none;
 }
 
-// CMYK_M, CMY_C, RGB_R, 6CLR_1: what the printer was asked for.
-bool is_device_value(std::string_view field)
+// CMYK_M, CMYKOG_O, CMY_C, RGB_R, 6CLR_1: what the printer was asked for, by the standard's names.
+bool is_standard_device_field(std::string_view field)
 {
     const std::string name = upper(field);
-    return name.starts_with("CMYK_") || name.starts_with("CMY_") || name.starts_with("RGB_") ||
-           (name.size() > 5 && name[0] >= '0' && name[0] <= '9' && name.substr(1, 4) == "CLR_");
+    const auto end = std::min(name.find('_'), name.size());
+    const std::string_view space = std::string_view(name).substr(0, end);
+    return end + 1 < name.size() &&
+           (space == "RGB" || space == "CMY" ||
+            (space.starts_with("CMYK") &&
+             space.find_first_not_of("ABCDEFGHIJKLMNOPQRSTUVWXYZ") == std::string_view::npos) ||
+            (space.size() > 3 && space.ends_with("CLR") &&
+             space.find_first_not_of("0123456789") == space.size() - 3));
+}
+
+// The ink of a column such as cyan, magenta_pct, Yellow %, Orange (percent); empty where it is
+// none.
+// A lone C, Y or K may be chroma or a tristimulus value; initials say whether all four are there.
+std::string ink_of(std::string key, bool initials)
+{
+    std::erase_if(key, [](char c) { return c == '(' || c == ')' || c == '[' || c == ']'; });
+    bool percent = false;
+    for (const std::string_view unit : {"PERCENT", "PCT", "%"})
+        if (key.ends_with(unit)) {
+            key.resize(key.size() - unit.size());
+            percent = true;
+            break;
+        }
+    constexpr std::array process = {"CYAN", "MAGENTA", "YELLOW", "BLACK"};
+    constexpr std::string_view letters = "CMYK";
+    for (std::size_t i = 0; i < process.size(); ++i)
+        if (key == process[i] || (key.size() == 1 && key[0] == letters[i] && (percent || initials)))
+            return fmt::format("CMYK_{}", letters[i]);
+    if (percent)
+        for (const std::string_view other : {"ORANGE", "GREEN", "VIOLET", "RED", "BLUE", "WHITE"})
+            if (key == other)
+                return key;
+    return percent && (key.starts_with("SPOT") || key.starts_with("INK")) ? key : "";
 }
 
 bool is_pair_value(std::string_view field)
@@ -41,124 +78,18 @@ bool is_pair_value(std::string_view field)
     return equal_ignoring_case(field, "SPECTRAL_DEC") || equal_ignoring_case(field, "SPECTRAL_PCT");
 }
 
-// The columns of a wavelength/value pair.
-struct Pair {
-    std::size_t wavelength;
-    std::size_t value;
-};
-
-std::vector<Pair> pairs_in(const std::vector<std::string> &fields)
+bool begins_pair(const std::vector<std::string> &fields, std::size_t column)
 {
-    std::vector<Pair> pairs;
-    for (std::size_t i = 0; i + 1 < fields.size(); ++i)
-        if (equal_ignoring_case(fields[i], "SPECTRAL_NM") && is_pair_value(fields[i + 1]))
-            pairs.push_back({i, i + 1});
-    return pairs;
-}
-
-double value_at(const Table &table, std::size_t row, std::size_t column)
-{
-    const std::string_view text = trimmed(table.cell(row, column));
-    const auto value = number_in(text);
-    if (!value)
-        throw InputError{table.row_lines[row],
-                         fmt::format("{} is {}, not a number", printable(table.fields[column]),
-                                     in_quotes(text))};
-    return *value;
-}
-
-// Which column holds each wavelength, in thousandths of a nanometre.
-using Columns = std::map<long, std::size_t>;
-
-void add(Columns &columns, double wavelength, std::size_t column, std::size_t line)
-{
-    if (!columns.emplace(std::lround(wavelength * 1000), column).second)
-        throw InputError{line, fmt::format("{:g} nm occurs twice in a spectrum", wavelength)};
-}
-
-Source source_of(const Columns &columns)
-{
-    return {.first_nm = static_cast<double>(columns.begin()->first) / 1000,
-            .last_nm = static_cast<double>(columns.rbegin()->first) / 1000,
-            .bands = columns.size(),
-            .scaled = false};
-}
-
-// The columns of the 31 bands: wider ranges are cut, of finer steps every tenth nanometre is taken.
-std::array<std::size_t, VANTREL_BANDS> bands_in(const Columns &columns, std::size_t line)
-{
-    std::array<std::size_t, VANTREL_BANDS> bands{};
-    for (std::size_t i = 0; i < bands.size(); ++i) {
-        const auto found = columns.find(static_cast<long>(400 + 10 * i) * 1000);
-        if (found == columns.end()) {
-            const Source source = source_of(columns);
-            throw InputError{
-                line, fmt::format("no value at {} nm in spectra of {} values from {:g} "
-                                  "to {:g} nm; every 10 nm from 400 to 700 is needed",
-                                  400 + 10 * i, source.bands, source.first_nm, source.last_nm)};
-        }
-        bands[i] = found->second;
-    }
-    return bands;
-}
-
-Columns pair_columns(const Table &table, const std::vector<Pair> &pairs, std::size_t row)
-{
-    Columns columns;
-    for (const Pair &pair : pairs) {
-        const double wavelength = value_at(table, row, pair.wavelength);
-        if (wavelength < 100 || wavelength > 5000)
-            throw InputError{table.row_lines[row],
-                             fmt::format("{:g} nm is no wavelength of light", wavelength)};
-        add(columns, wavelength, pair.value, table.row_lines[row]);
-    }
-    return columns;
-}
-
-// What a value of the table is multiplied by to give percent.
-double percent_factor(const Table &table, const std::vector<Pair> &pairs,
-                      const std::vector<Patch> &patches)
-{
-    if (!pairs.empty())
-        return equal_ignoring_case(table.fields[pairs[0].value], "SPECTRAL_DEC") ? 100 : 1;
-    if (table.full_scale)
-        return 100 / *table.full_scale;
-    double largest = 0;
-    for (const Patch &patch : patches)
-        largest = std::max(largest, *std::max_element(patch.refl.begin(), patch.refl.end()));
-    return largest <= 2 ? 100 : 1; // paper with optical brightener reads up to 1.4 on a scale 0..1
-}
-
-void read_names(const Table &table, std::vector<Patch> &patches)
-{
-    const std::size_t id = column_of(table, "SAMPLEID");
-    const std::size_t name = column_of(table, "SAMPLENAME");
-    for (std::size_t row = 0; row < patches.size(); ++row) {
-        Patch &patch = patches[row];
-        if (id != none)
-            patch.id = printable(trimmed(table.cell(row, id)));
-        if (patch.id.empty())
-            patch.id = std::to_string(row + 1);
-        if (name != none)
-            patch.name = printable(trimmed(table.cell(row, name)));
-        if (patch.name.empty())
-            patch.name = patch.id;
-    }
-}
-
-void read_device_values(const Table &table, std::vector<Patch> &patches)
-{
-    for (std::size_t column = 0; column < table.fields.size(); ++column)
-        if (is_device_value(table.fields[column]))
-            for (std::size_t row = 0; row < patches.size(); ++row)
-                patches[row].device.emplace_back(upper(table.fields[column]),
-                                                 value_at(table, row, column));
+    return column + 1 < fields.size() && equal_ignoring_case(fields[column], "SPECTRAL_NM") &&
+           is_pair_value(fields[column + 1]);
 }
 
 } // namespace
 
 std::optional<double> wavelength_of(std::string_view field)
 {
+    if (field.find_first_of("0123456789") == std::string_view::npos || field.size() > 32)
+        return std::nullopt;
     std::string name = upper(field);
     for (const std::string_view prefix : {"SPECTRAL_NM", "SPECTRAL", "SPECTRUM", "SPEC", "NM", "R"})
         if (name.starts_with(prefix)) {
@@ -169,7 +100,9 @@ std::optional<double> wavelength_of(std::string_view field)
         name.erase(0, 1);
     if (name.ends_with("NM"))
         name.resize(name.size() - 2);
-    if (name.find_first_not_of("0123456789.") != std::string::npos)
+    while (name.ends_with(' ') || name.ends_with('_'))
+        name.pop_back();
+    if (name.find_first_not_of("0123456789.,") != std::string::npos)
         return std::nullopt;
     const auto wavelength = number_in(name);
     return wavelength && *wavelength >= 100 && *wavelength <= 5000 ? wavelength : std::nullopt;
@@ -177,44 +110,156 @@ std::optional<double> wavelength_of(std::string_view field)
 
 bool has_spectra(const std::vector<std::string> &fields)
 {
-    return !pairs_in(fields).empty() || std::any_of(fields.begin(), fields.end(), wavelength_of);
+    for (std::size_t i = 0; i < fields.size(); ++i)
+        if (begins_pair(fields, i) || wavelength_of(fields[i]))
+            return true;
+    return false;
 }
 
-Measurement measurement_of(const Table &table)
+Table::Table(Sheet &sheet, std::vector<std::string> names, std::size_t line)
+    : fields(std::move(names)), sheet(sheet)
 {
-    const std::vector<Pair> pairs = pairs_in(table.fields);
-    Columns columns;
-    std::array<std::size_t, VANTREL_BANDS> bands{};
-    if (pairs.empty()) {
-        for (std::size_t i = 0; i < table.fields.size(); ++i)
-            if (const auto wavelength = wavelength_of(table.fields[i]))
-                add(columns, *wavelength, i, table.fields_line);
-        bands = bands_in(columns, table.fields_line);
-    }
-
-    Measurement sheet;
-    sheet.patches.resize(table.row_lines.size());
-    for (std::size_t row = 0; row < sheet.patches.size(); ++row) {
-        if (!pairs.empty()) {
-            columns = pair_columns(table, pairs, row);
-            bands = bands_in(columns, table.row_lines[row]);
+    std::string_view unit;
+    for (std::size_t i = 0; i < fields.size(); ++i)
+        if (begins_pair(fields, i) && (unit.empty() || equal_ignoring_case(unit, fields[i + 1]))) {
+            unit = fields[i + 1];
+            at_nm.push_back(i);
+            values.push_back(i + 1);
         }
-        if (row == 0)
-            sheet.source = source_of(columns);
-        for (std::size_t i = 0; i < bands.size(); ++i)
-            sheet.patches[row].refl[i] = value_at(table, row, bands[i]);
-    }
-    read_names(table, sheet.patches);
-    read_device_values(table, sheet.patches);
+    pairs = !values.empty();
+    if (pairs)
+        sheet.set_full_scale(equal_ignoring_case(unit, "SPECTRAL_DEC") ? 1 : 100, upper(unit),
+                             line);
 
-    const double factor = percent_factor(table, pairs, sheet.patches);
-    sheet.source.scaled = factor != 1;
-    if (sheet.source.scaled)
-        for (std::size_t row = 0; row < sheet.patches.size(); ++row)
-            for (double &value : sheet.patches[row].refl) {
-                value *= factor;
-                if (!std::isfinite(value))
-                    throw InputError{table.row_lines[row], "a value is too large in percent"};
-            }
-    return sheet;
+    std::vector<std::string> keys;
+    for (std::size_t i = 0; i < fields.size(); ++i) {
+        keys.push_back(letters(fields[i]));
+        if (const auto wavelength = pairs ? std::nullopt : wavelength_of(fields[i])) {
+            wavelengths.push_back(*wavelength);
+            values.push_back(i);
+        }
+    }
+    refl.resize(values.size());
+    if (!pairs)
+        sheet.bands_at(wavelengths, line);
+
+    id = column_of(keys, {"SAMPLEID", "ID", "PATCHID", "SAMPLENO", "PATCHNO", "NUMBER", "NO"});
+    name = column_of(keys, {"SAMPLENAME", "NAME", "PATCHNAME", "PATCH", "SAMPLE", "LABEL"});
+    condition = column_of(keys, {"MEASUREMENTCONDITION", "CONDITION", "MEASUREMENTMODE", "MODE"});
+    ink = column_of(keys, {"INK", "INKNAME", "COLORANT", "COLOURANT"});
+    tint = column_of(keys, {"TINT", "TINTPCT", "TINT%", "TINTVALUE", "TONEVALUE", "NOMINAL"});
+    bool initials = true;
+    for (const char *initial : {"C", "M", "Y", "K"})
+        initials = initials && column_of(keys, {initial}) != none;
+    for (std::size_t i = 0; i < fields.size(); ++i) {
+        const bool standard = is_standard_device_field(fields[i]);
+        std::string device = standard ? upper(fields[i]) : ink_of(keys[i], initials);
+        if (device.empty())
+            continue;
+        free_names = free_names || !standard;
+        devices.push_back({i, cut(printable(device), longest_ink_name)});
+    }
+    free_names = free_names || tint != none;
+    if (tint == none) {
+        name = name == none ? ink : name;
+        ink = none;
+    }
+}
+
+double Table::value_at(const Row &row, std::size_t column, std::size_t line) const
+{
+    const auto value = number_in(row[column]);
+    if (!value)
+        throw InputError{line, fmt::format("{} is {}, not a number", printable(fields[column]),
+                                           in_quotes(trimmed(row[column])))};
+    return *value;
+}
+
+std::string Table::text_at(const Row &row, std::size_t column) const
+{
+    return column == none ? "" : printable(trimmed(row[column]));
+}
+
+const Bands &Table::bands(const Row &row, std::size_t line)
+{
+    if (pairs) {
+        wavelengths.clear();
+        for (const std::size_t column : at_nm) {
+            const double wavelength = value_at(row, column, line);
+            if (wavelength < 100 || wavelength > 5000)
+                throw InputError{line,
+                                 fmt::format("{:g} nm is no wavelength of light", wavelength)};
+            wavelengths.push_back(wavelength);
+        }
+    }
+    return sheet.bands_at(wavelengths, line);
+}
+
+// None where all of these columns are blank; among others a blank is 0.
+std::vector<std::pair<std::string, double>> Table::device_values(const Row &row, std::size_t line)
+{
+    std::vector<std::pair<std::string, double>> out;
+    const auto blank = [&](std::size_t column) { return trimmed(row[column]).empty(); };
+    if (tint != none && !blank(tint)) {
+        std::string of = cut(text_at(row, ink), longest_ink_name);
+        out.emplace_back(of.empty() ? "TINT" : std::move(of), value_at(row, tint, line));
+    } else if (std::any_of(devices.begin(), devices.end(),
+                           [&](const Device &device) { return !blank(device.column); })) {
+        for (const Device &device : devices)
+            out.emplace_back(device.name,
+                             blank(device.column) ? 0 : value_at(row, device.column, line));
+    }
+    return out;
+}
+
+void Table::add(const Row &row, Condition given, std::size_t line)
+{
+    const Bands &at = bands(row, line);
+    for (const std::size_t value : at.used())
+        refl[value] = value_at(row, values[value], line);
+
+    if (sheet.patches.empty() && id == none && name == none && ink == none)
+        for (std::size_t i = 0; i < fields.size() && name == none; ++i)
+            if (!trimmed(row[i]).empty() && !number_in(row[i])) // the first column of words
+                name = i;
+    Patch patch{
+        .id = text_at(row, id), .name = text_at(row, name), .refl = at.of(refl), .device = {}};
+    if (patch.id.empty())
+        patch.id = std::to_string(sheet.patches.size() + 1);
+    if (patch.name.empty() && ink == none)
+        patch.name = patch.id;
+    patch.device = device_values(row, line);
+    const Condition own = condition == none ? std::nullopt : condition_in(row[condition]);
+    sheet.add(std::move(patch), own ? own : given, line);
+}
+
+void Table::finish()
+{
+    std::vector<Patch> &patches = sheet.patches;
+    double largest = 0;
+    for (const Patch &patch : patches)
+        for (const auto &[field, value] : patch.device)
+            largest = std::max(largest, value);
+    if (free_names && largest <= 1)
+        for (Patch &patch : patches)
+            for (auto &[field, value] : patch.device)
+                value = std::round(value * 1e8) / 1e6; // 0.07 is 7 %
+    if (ink == none)
+        return;
+    // where it has no name, a tint is named by its ink and percentage; the bare paper is a tint of
+    // any ink
+    const auto printed = std::find_if(patches.begin(), patches.end(), [](const Patch &patch) {
+        return !patch.device.empty() && patch.device[0].second > 0;
+    });
+    for (Patch &patch : patches) {
+        if (!patch.device.empty()) {
+            auto &[of, percent] = patch.device[0];
+            if (patch.name.empty())
+                patch.name = percent > 0 ? fmt::format("{} {:g}", of, percent) : of;
+            if (percent == 0 && printed != patches.end())
+                of = printed->device[0].first;
+        }
+        if (patch.name.empty())
+            patch.name = patch.id;
+    }
 }

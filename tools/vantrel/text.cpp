@@ -103,11 +103,31 @@ std::string printable(std::string_view text)
     std::string out;
     while (!text.empty()) {
         const CodePoint next = first_code_point(text);
-        if (next.value == '\t')
+        if (next.value == '\t' || next.value == '\n' || next.value == '\r')
             out += ' ';
         else
             append_utf8(out, unprintable(next.value) ? U'\uFFFD' : next.value);
         text.remove_prefix(next.bytes);
+    }
+    return out;
+}
+
+std::string utf8_of_utf16(std::string_view bytes)
+{
+    const std::size_t high = bytes[0] == '\xFE' ? 0 : 1; // which byte of a pair
+    const auto unit = [&](std::size_t i) -> char32_t {
+        return static_cast<unsigned char>(bytes[i + high]) * 256u +
+               static_cast<unsigned char>(bytes[i + 1 - high]);
+    };
+    std::string out;
+    for (std::size_t i = 2; i + 1 < bytes.size(); i += 2) {
+        char32_t value = unit(i);
+        if (value >= 0xD800 && value < 0xDC00 && i + 3 < bytes.size() &&
+            (unit(i + 2) & 0xFC00) == 0xDC00) {
+            i += 2;
+            value = 0x10000 + ((value & 0x3FF) << 10) + (unit(i) & 0x3FF);
+        }
+        append_utf8(out, value >= 0xD800 && value < 0xE000 ? U'\uFFFD' : value);
     }
     return out;
 }

@@ -15,8 +15,12 @@ std::string_view trimmed(std::string_view text); // without spaces and tabs at b
 std::optional<double> number_in(std::string_view text);
 
 // Text of any origin as UTF-8 that is safe to print: bytes that are not UTF-8 are taken as Latin-1,
-// a tab becomes a space, other control characters and those of text direction become U+FFFD.
+// a tab or the end of a line becomes a space, other control characters and those of text direction
+// become U+FFFD.
 std::string printable(std::string_view text);
+
+// Text in UTF-16 that begins with a byte-order mark.
+std::string utf8_of_utf16(std::string_view bytes);
 
 // UTF-8 text cut to a number of characters, with an ellipsis after the cut.
 std::string cut(const std::string &text, std::size_t most);
