@@ -17,7 +17,7 @@ namespace {
 // any white space does.
 Row split(std::string_view text, bool tabs, std::size_t most, std::size_t line)
 {
-    const std::string_view separators = tabs ? "\t" : " \t";
+    const auto ends = [&](char c) { return c == '\t' || (c == ' ' && !tabs); };
     Row values;
     while (values.size() <= most) {
         text.remove_prefix(std::min(text.find_first_not_of(tabs ? " " : " \t"), text.size()));
@@ -30,7 +30,7 @@ Row split(std::string_view text, bool tabs, std::size_t most, std::size_t line)
                 throw InputError{line, "a quoted text is not closed"};
             value = std::move(*quoted);
         }
-        const std::string_view rest = text.substr(0, text.find_first_of(separators));
+        const std::string_view rest = before(text, ends);
         text.remove_prefix(rest.size());
         value += trimmed(rest);
         values.push_back(std::move(value));

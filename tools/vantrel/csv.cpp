@@ -15,8 +15,8 @@ namespace {
 // quoted value may go over several. Nothing where a quoted value is not closed.
 std::optional<Row> next_record(std::string_view &text, char separator, std::size_t &line)
 {
-    const std::string ends = std::string("\r\n") + separator;
-    const std::string blanks = separator == '\t' ? " " : " \t";
+    const auto ends = [&](char c) { return c == separator || c == '\n' || c == '\r'; };
+    const std::string_view blanks = separator == '\t' ? " " : " \t";
     Row values;
     for (;;) {
         std::string value;
@@ -29,7 +29,7 @@ std::optional<Row> next_record(std::string_view &text, char separator, std::size
             line += static_cast<std::size_t>(std::count(quoted->begin(), quoted->end(), '\n'));
             value = std::move(*quoted);
         }
-        const std::string_view rest = text.substr(0, text.find_first_of(ends));
+        const std::string_view rest = before(text, ends);
         text.remove_prefix(rest.size());
         value += trimmed(rest);
         values.push_back(std::move(value));

@@ -2,12 +2,9 @@
 
 std::string_view next_line(std::string_view &text)
 {
-    const auto end = text.find_first_of("\r\n");
-    const std::string_view line = text.substr(0, end);
-    if (end == std::string_view::npos)
-        text = {};
-    else
-        text.remove_prefix(end + (text.substr(end, 2) == "\r\n" ? 2 : 1));
+    const std::string_view line = before(text, [](char c) { return c == '\n' || c == '\r'; });
+    text.remove_prefix(line.size());
+    text.remove_prefix(text.starts_with("\r\n") ? 2 : std::min<std::size_t>(text.size(), 1));
     return line;
 }
 

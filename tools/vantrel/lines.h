@@ -2,9 +2,17 @@
 #ifndef VANTREL_TOOL_LINES_H
 #define VANTREL_TOOL_LINES_H
 
+#include <algorithm>
 #include <optional>
 #include <string>
 #include <string_view>
+
+// The text up to the first character that ends it, or all of it.
+template <typename Ends> std::string_view before(std::string_view text, Ends ends)
+{
+    const auto end = std::find_if(text.begin(), text.end(), ends);
+    return text.substr(0, static_cast<std::size_t>(end - text.begin()));
+}
 
 // Takes the next line off the text; a line ends with LF, CRLF or CR.
 std::string_view next_line(std::string_view &text);
