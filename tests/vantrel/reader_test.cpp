@@ -385,7 +385,16 @@ TEST(Reader, StandsWhatIsMeantToBreakIt)
     EXPECT_EQ(complaint_of(cxf(values(0, " "), "Increment=\"10\"",
                                replaced(deep, "x", "<x>") + replaced(deep, "x", "</x>"))),
               "read 1");
-    EXPECT_EQ(complaint_of(std::string(16'000'001, '<')), "0: more elements than a sheet can have");
+    std::string open;
+    open.resize(16'000'001, '<');
+    EXPECT_EQ(complaint_of(open), "0: more elements than a sheet can have");
+
+    const std::string again = replaced(std::string(20'000, 'x'), "x", "BEGIN_DATA\nEND_DATA\n");
+    std::string wide;
+    for (int i = 0; i < 20'000; ++i)
+        wide += fmt::format(" C{}", i);
+    sheet = read_measurement(cgats(fields("{:g}", " ") + wide, values(0, " ") + wide) + again, {});
+    EXPECT_EQ(sheet.patches.size(), 1u);
 
     const std::string columns = replaced(std::string(1'000'000, 'x'), "x", ",C"),
                       empty(1'000'000, ',');

@@ -94,6 +94,7 @@ private:
     std::vector<std::string> fields; // of the table that is being read
     std::size_t fields_line = 0;
     bool tabs = false;   // tabs separate their names
+    bool fresh = false;  // and not looked at yet
     bool wanted = false; // this table holds patches
     bool left_out = false;
     std::size_t rows = 0;
@@ -118,6 +119,7 @@ void Reader::header(std::string_view text)
     if (keyword == "BEGIN_DATA_FORMAT") {
         place = Place::fields;
         fields.clear();
+        fresh = true;
         fields_line = line + 1;
         tabs = false;
     } else if (keyword == "BEGIN_DATA") {
@@ -157,6 +159,8 @@ void Reader::begin_rows()
     rows = 0;
     if (fields.empty())
         throw InputError{line, "BEGIN_DATA without named fields before it"};
+    if (!std::exchange(fresh, false)) // the same fields again
+        return;
     wanted = has_spectra(fields);
     if (!wanted)
         return;

@@ -70,13 +70,10 @@ struct Specification {
     std::optional<double> first_nm, step_nm;
 };
 
-// The condition that one element of a MeasurementSpec tells: a polarisation filter, the light, or
-// a text that is named for it.
+// The condition that one element below a ColorSpecification tells.
 Condition condition_of(const Node &node)
 {
     const std::string_view name = local_name(node.name());
-    if (name == "DevicePolarization" && trimmed(node.child_value()) == "true")
-        return 3;
     if (contains(name, "ILLUMINATION") || contains(name, "CONDITION") || name == "MeasurementMode")
         return condition_in(node.child_value());
     if (contains(attribute(node, "Name"), "CONDITION")) {
@@ -202,8 +199,9 @@ Devices Reader::device_values(const Node &object)
     for (const Node &colour : child(object, "DeviceColorValues").children()) {
         for (const Node &part : colour.children()) {
             const std::string_view name = local_name(part.name());
-            const auto ink = std::find_if(std::begin(process), std::end(process),
-                                          [&](const auto &row) { return row.first == name; });
+            const auto *const ink =
+                std::find_if(std::begin(process), std::end(process),
+                             [&](const auto &row) { return row.first == name; });
             if (ink != std::end(process)) {
                 inks.emplace_back(ink->second, number(part, part.child_value()));
             } else if (name == "SpotColor") {

@@ -8,6 +8,8 @@
 
 namespace {
 
+constexpr std::size_t most_warnings = 20;
+
 bool is_word(char c)
 {
     return (c >= '0' && c <= '9') || (c >= 'A' && c <= 'Z') || (c >= 'a' && c <= 'z');
@@ -22,7 +24,7 @@ std::string names_of(const std::set<Condition> &conditions)
 {
     std::string out;
     for (const Condition &condition : conditions)
-        out += (out.empty() ? "" : ", ") + name_of(condition);
+        out += fmt::format("{}{}", out.empty() ? "" : ", ", name_of(condition));
     return out;
 }
 
@@ -72,7 +74,10 @@ void Sheet::set_full_scale(double value, std::string_view keyword, std::size_t l
 
 void Sheet::warn(std::size_t line, const std::string &text)
 {
-    warnings.push_back(line ? fmt::format("{}: {}", line, text) : ' ' + text);
+    if (warnings.size() < most_warnings)
+        warnings.push_back(fmt::format("{} {}", line ? fmt::format("{}:", line) : "", text));
+    else if (warnings.size() == most_warnings)
+        warnings.emplace_back(" more warnings are left out");
 }
 
 // Of several conditions one is kept: the one asked for, or else M1, which the standards of printing

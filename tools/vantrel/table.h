@@ -22,11 +22,11 @@ using Row = std::vector<std::string>; // as many values as there are fields
 class Table {
 public:
     // The line names the fields. Throws InputError.
-    Table(Sheet &sheet, std::vector<std::string> fields, std::size_t line);
+    Table(Sheet &sheet, std::vector<std::string> names, std::size_t line);
 
-    // A condition in a column of the row itself goes before the one that is handed in. Throws
+    // A condition in a column of the row itself goes before the one given. Throws
     // InputError.
-    void add(const Row &row, Condition condition, std::size_t line);
+    void add(const Row &row, Condition given, std::size_t line);
 
     // Settles what only all rows together tell: whether tints are fractions, which inks there are.
     void finish();
