@@ -57,7 +57,7 @@ std::string ink_of(std::string key, bool initials)
     bool percent = false;
     for (const std::string_view unit : {"PERCENT", "PCT", "%"})
         if (key.ends_with(unit)) {
-            key.resize(key.size() - unit.size());
+            key.erase(key.size() - unit.size());
             percent = true;
             break;
         }
