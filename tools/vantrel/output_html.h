@@ -1,11 +1,12 @@
-// A result as a page.
+// A command's result as a page to look at.
 #ifndef VANTREL_TOOL_OUTPUT_HTML_H
 #define VANTREL_TOOL_OUTPUT_HTML_H
 
 #include <string>
 #include <string_view>
 
-// One self-contained file around the JSON of a command; throws RequestError.
+// One self-contained file that shows a JSON document of this program; the document is in it. Throws
+// RequestError where the program was built without the page.
 std::string as_html(std::string_view json);
 
 #endif

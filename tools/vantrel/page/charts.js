@@ -1,0 +1,152 @@
+// The pictures: SVG by Observable Plot, drawn again when their width changes.
+
+import * as Plot from '@observablehq/plot';
+import { h, named, swatch } from './dom.js';
+
+export const mostPoints = 2000;
+const bands = Array.from({ length: 31 }, (_, i) => 400 + 10 * i);
+const printWidth = 330; // half of a sheet of paper
+const drawn = new Set();
+const self = (field) => ({ value: field, scale: null }); // colours that are the data's own
+
+addEventListener('beforeprint', () => drawn.forEach((draw) => draw(printWidth)));
+addEventListener('afterprint', () => drawn.forEach((draw) => draw()));
+
+// A picture with its title, what it says in words, and further elements. `plot(width)` gives Plot's
+// options, `label()` the words.
+export function picture(title, plot, label, ...more) {
+  const frame = h('div', { class: 'plot' });
+  const words = h('span', { class: 'says' });
+  let shown = 0;
+  function draw(width = frame.clientWidth) {
+    if (!width) return;
+    shown = width;
+    const svg = Plot.plot({
+      width, marginTop: 28, marginRight: 16, marginBottom: 36,
+      style: { fontSize: width === printWidth ? '9px' : '12px', fontFamily: 'inherit', background: 'none', overflow: 'visible' },
+      ...plot(width),
+    });
+    svg.setAttribute('role', 'img');
+    svg.setAttribute('aria-label', `${title}. ${label()}`);
+    frame.replaceChildren(svg);
+    words.textContent = label();
+  }
+  drawn.add(draw);
+  new ResizeObserver(() => {
+    if (Math.abs(frame.clientWidth - shown) > 4) draw();
+  }).observe(frame);
+  const element = h('figure', {}, h('figcaption', {}, h('strong', {}, title), ' ', words), frame,
+    ...more);
+  return { element, draw: () => draw() };
+}
+
+export function legend(series) {
+  return h('ul', { class: 'legend' }, series.map((one) =>
+    h('li', { class: one.dashed ? 'dashed' : null }, swatch(one.rgb), named(one.name))));
+}
+
+// A line in its own colour on an edge that sets it off from any ground.
+const edged = (data, options, dashed) => [
+  Plot.line(data, { ...options, stroke: 'currentColor', strokeWidth: 4, strokeOpacity: 0.45 }),
+  Plot.line(data, { ...options, stroke: self('rgb'), strokeWidth: 2.5,
+    strokeDasharray: dashed ? '5 3' : null }),
+];
+
+// series: [{ name, rgb, refl, dashed }, …]
+export function spectraPlot(series) {
+  const points = series.flatMap((one, z) => one.refl.map((refl, i) =>
+    ({ z, name: one.name, rgb: one.rgb, dashed: one.dashed, nm: bands[i], refl })));
+  const top = Math.max(100, ...points.map((point) => point.refl));
+  const way = { x: 'nm', y: 'refl', z: 'z' };
+  return (width) => ({
+    height: Math.min(380, Math.max(260, width * 0.6)),
+    x: { label: 'Wavelength (nm)', domain: [400, 700], tickFormat: 'd', ticks: width < 420 ? 4 : 7 },
+    y: { label: 'Reflectance (%)', domain: [0, top], nice: true, grid: true },
+    marks: [
+      edged(points.filter((point) => !point.dashed), way, false),
+      edged(points.filter((point) => point.dashed), way, true),
+      Plot.tip(points, Plot.pointer({ ...way,
+        title: (point) => `${point.name}\n${point.nm} nm: ${point.refl.toFixed(2)} %` })),
+    ],
+  });
+}
+
+// curves: [{ name, rgb, points: [{ nominal, area, gain }, …] }, …]; what: 'area' or 'gain'
+export function tonePlot(curves, what) {
+  const points = curves.flatMap((curve, z) =>
+    curve.points.map((point) => ({ ...point, z, name: curve.name, rgb: curve.rgb })));
+  const top = what === 'area' ? 100 : 10;
+  const way = { x: 'nominal', y: what, z: 'z' };
+  return (width) => ({
+    height: Math.min(340, Math.max(240, width * 0.6)),
+    x: { label: 'Nominal tone value (%)', domain: [0, 100], ticks: 5 },
+    y: { label: what === 'area' ? 'Dot area (%)' : 'Gain (points)', grid: true, nice: true,
+      domain: [Math.min(0, ...points.map((point) => point[what])),
+        Math.max(top, ...points.map((point) => point[what]))] },
+    marks: [
+      what === 'area'
+        ? Plot.line([[0, 0], [100, 100]], { strokeDasharray: '3 3', strokeOpacity: 0.6 }) : null,
+      edged(points, way),
+      Plot.dot(points, { ...way, r: 3, fill: self('rgb'), stroke: 'currentColor',
+        strokeOpacity: 0.6 }),
+      Plot.tip(points, Plot.pointer({ ...way, title: (point) =>
+        `${point.name} ${point.nominal} %\nArea ${point.area.toFixed(2)} %, ` +
+        `gain ${point.gain.toFixed(2)}` })),
+    ],
+  });
+}
+
+// points: [{ name, rgb, lab, reference, chosen }, …], `reference` another L*a*b* or nothing
+export function planePlot(points, paper) {
+  const place = (lab, point) => ({ a: lab[1], b: lab[2], name: point.name, rgb: point.rgb, lab });
+  const measured = points.map((point) => ({ ...place(point.lab, point), chosen: point.chosen }));
+  const aims = points.filter((point) => point.reference).map((point) => ({
+    ...place(point.reference, point), to: point.lab }));
+  const whites = paper ? [place(paper, { name: 'Paper' })] : [];
+  const all = [...measured, ...aims, ...whites, { a: 0, b: 0 }];
+  const range = (axis) => all.reduce(([low, high], point) =>
+    [Math.min(low, point[axis]), Math.max(high, point[axis])], [0, 0]);
+  const [a, b] = [range('a'), range('b')];
+  const half = Math.max(a[1] - a[0], b[1] - b[0], 20) / 2 * 1.1;
+  const around = ([low, high]) => [(low + high) / 2 - half, (low + high) / 2 + half];
+  const many = points.length > 300;
+  return (width) => {
+    const side = Math.min(width, 480);
+    return {
+      width: side, height: side, marginLeft: 44, marginRight: 12,
+      x: { label: 'a*', domain: around(a), grid: true, ticks: 6 },
+      y: { label: 'b*', domain: around(b), grid: true, ticks: 6 },
+      marks: [
+        Plot.ruleX([0], { strokeOpacity: 0.5 }),
+        Plot.ruleY([0], { strokeOpacity: 0.5 }),
+        Plot.link(aims, { x1: 'a', y1: 'b', x2: (d) => d.to[1], y2: (d) => d.to[2],
+          strokeOpacity: 0.6 }),
+        Plot.dot(aims, { x: 'a', y: 'b', r: many ? 3 : 5, strokeWidth: 1.25 }),
+        Plot.dot(measured, { x: 'a', y: 'b', r: many ? 2 : 4, fill: self('rgb'),
+          stroke: 'currentColor', strokeWidth: 0.75, strokeOpacity: 0.6 }),
+        Plot.dot(measured.filter((d) => d.chosen), { x: 'a', y: 'b', r: 8, strokeWidth: 2 }),
+        Plot.dot(whites, { x: 'a', y: 'b', r: 6, symbol: 'diamond', strokeWidth: 1.5 }),
+        Plot.tip([...measured, ...whites], Plot.pointer({ x: 'a', y: 'b', title: (d) =>
+          `${d.name}\nL* ${d.lab[0].toFixed(2)}  a* ${d.a.toFixed(2)}  b* ${d.b.toFixed(2)}` })),
+      ],
+    };
+  };
+}
+
+export function histogramPlot(values, label, limit) {
+  const marked = limit === null || limit === undefined ? [] : [limit];
+  return (width) => ({
+    height: Math.min(340, Math.max(240, width * 0.6)),
+    x: { label, zero: true, nice: true },
+    y: { label: 'Patches', grid: true, ticks: 5, tickSize: 0,
+      tickFormat: (value) => (Number.isInteger(value) ? value.toLocaleString('en') : '') },
+    marks: [
+      Plot.rectY(values, Plot.binX({ y: 'count' }, { x: (value) => value, thresholds: 20,
+        fill: 'currentColor', fillOpacity: 0.55, tip: true })),
+      Plot.ruleY([0]),
+      Plot.ruleX(marked, { stroke: 'var(--fail)', strokeWidth: 2 }),
+      Plot.text(marked, { x: (value) => value, frameAnchor: 'top', dy: -12, fill: 'var(--fail)',
+        text: (value) => `Tolerance ${value}` }),
+    ],
+  });
+}

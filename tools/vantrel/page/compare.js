@@ -1,0 +1,122 @@
+// vantrel compare: the verdict, and the pairs that it rests on.
+
+import { histogramPlot, mostPoints, picture, planePlot } from './charts.js';
+import { count, figures, fixed, h, named, smallTable, spread, swatch } from './dom.js';
+import { spectraPicture, swatches } from './report.js';
+import { searchTable } from './table.js';
+
+export const formulaNames = { de2000: 'ΔE00', cmc: 'ΔE CMC', de94: 'ΔE94', de76: 'ΔE*ab' };
+const labelOf = (formula) => formulaNames[formula] ?? formula;
+const labText = (lab) => lab.map((value) => fixed(value)).join(' ');
+
+function verdict(result) {
+  const [formula] = result.formulas;
+  const { max, max_patch: patch } = result.statistics[formula];
+  const worst = [`The largest ${labelOf(formula)} is ${fixed(max)}, at `, named(patch)];
+  if (result.passed === null || result.tolerance === null)
+    return h('div', { class: 'verdict' }, h('p', { class: 'word' }, 'No tolerance given'),
+      h('p', {}, worst, '.'));
+  return h('div', { class: `verdict ${result.passed ? 'passed' : 'failed'}` },
+    h('p', { class: 'word' }, result.passed ? 'Passed' : 'Failed'),
+    h('p', {}, worst, `; the tolerance is ${result.tolerance}.`));
+}
+
+function unpaired(result) {
+  const side = (title, names) => names.length
+    ? h('p', { class: 'note' }, `${count(names.length, 'patch')} of the ${title} alone: `,
+      names.slice(0, 20).flatMap((name, i) => [i ? ', ' : '', named(name)]),
+      names.length > 20 ? ' …' : '') : null;
+  return [side('reference', result.unpaired.reference), side('sample', result.unpaired.sample)];
+}
+
+function pairColumns(result) {
+  const lab = (side, short) => ['L*', 'a*', 'b*'].map((label, i) =>
+    ({ id: `${side}-${label}`, label: `${label} ${short}`, decimals: 2, title: `${label}, ${side}`,
+      value: (pair) => pair[side].lab[i] }));
+  return [
+    { id: 'name', label: 'Patch', value: (pair) => pair.name },
+    ...result.formulas.map((formula) =>
+      ({ id: formula, label: labelOf(formula), decimals: 2, value: (pair) => pair[formula] })),
+    { id: 'verbal', label: 'Difference', value: (pair) => pair.verbal },
+    { id: 'metamerism', label: 'Metam.', decimals: 2, value: (pair) => pair.metamerism,
+      title: `Metamerism between ${result.illuminant} and ${result.second_illuminant}` },
+    ...lab('reference', 'ref.'), ...lab('sample', 'sample'),
+  ];
+}
+
+const spectraOf = (pair) => [
+  { name: `${pair.name}, reference`, rgb: pair.reference.rgb, refl: pair.reference.refl,
+    dashed: true },
+  { name: `${pair.name}, sample`, rgb: pair.sample.rgb, refl: pair.sample.refl },
+];
+
+const bothColours = ({ reference, sample }) =>
+  `linear-gradient(to bottom right, ${reference.rgb} 50%, ${sample.rgb} 50%)`;
+
+const overview = (result) => h('header', {},
+  h('h1', {}, named(result.sample.file), ' against ', named(result.reference.file)),
+  h('p', { class: 'about' }, [count(result.pairs.length, 'patch'),
+    `paired by ${result.paired_by}`, result.illuminant].join(' · ')));
+
+const statisticsTable = ({ formulas, statistics }) => smallTable('Differences', [
+  { label: 'Formula', text: labelOf },
+  { label: 'Mean', number: true, text: (name) => fixed(statistics[name].mean) },
+  { label: '95th percentile', number: true, text: (name) => fixed(statistics[name].p95) },
+  { label: 'Largest', number: true, text: (name) => fixed(statistics[name].max) },
+  { label: 'At', text: (name) => named(statistics[name].max_patch) },
+], formulas);
+
+export function comparePage(result) {
+  const { formulas, pairs, statistics } = result;
+  if (!pairs.length) return [overview(result), h('p', {}, 'No patch has a partner.'),
+    unpaired(result)];
+  const [formula] = formulas;
+  const worst = result.worst.map((i) => pairs[i]);
+  let chosen = new Set();
+  const always = new Set(worst);
+  const thinned = [...always, ...spread(pairs.filter((pair) => !always.has(pair)), mostPoints)];
+  const points = () => [...thinned.filter((pair) => !chosen.has(pair)), ...chosen].map((pair) =>
+    ({ name: pair.name, rgb: pair.sample.rgb, lab: pair.sample.lab, reference: pair.reference.lab,
+      chosen: chosen.has(pair) }));
+  const plane = picture('a*b* plane', (width) => planePlot(points(), null)(width), () =>
+    (thinned.length < pairs.length ? `${count(thinned.length, 'patch')} of ` +
+      `${pairs.length.toLocaleString('en')}, evenly spread. ` : '') +
+    'Rings are the reference, filled points the sample.');
+  const spectra = spectraPicture(spectraOf(worst[0]), () =>
+    'Reference (broken line) and sample of the worst patch; choose more in the table.');
+  const { mean, p95, max } = statistics[formula];
+  const histogram = picture(`${labelOf(formula)} of all patches`,
+    histogramPlot(pairs.map((pair) => pair[formula]), labelOf(formula), result.tolerance),
+    () => `Mean ${fixed(mean)}, 95th percentile ${fixed(p95)}, largest ${fixed(max)}.`);
+  return [
+    overview(result),
+    verdict(result),
+    formulas.length === 1 ? figures([
+      [`${labelOf(formula)} mean`, fixed(mean)],
+      ['95th percentile', fixed(p95)],
+      ['Largest', fixed(max), named(statistics[formula].max_patch)],
+    ]) : statisticsTable(result),
+    unpaired(result),
+    h('div', { class: 'tables' }, smallTable(`The worst ${worst.length} by ${labelOf(formula)}`, [
+      { label: 'Patch', text: (pair) => [swatch(pair.reference.rgb), swatch(pair.sample.rgb),
+        named(pair.name)] },
+      ...formulas.map((name) => ({ label: labelOf(name), number: true,
+        text: (pair) => fixed(pair[name]) })),
+      { label: 'Difference', text: (pair) => pair.verbal ?? '–' },
+      { label: 'Reference L*a*b*', number: true, text: (pair) => labText(pair.reference.lab) },
+      { label: 'Sample L*a*b*', number: true, text: (pair) => labText(pair.sample.lab) },
+    ], worst)),
+    h('div', { class: 'pictures' }, histogram.element, plane.element, spectra.element,
+      swatches(pairs.map((pair) => ({ name: pair.name, rgb: bothColours(pair) })),
+        'The reference upper left, the sample lower right, as a screen can show them.')),
+    searchTable({
+      caption: 'All patches', noun: 'patch', columns: pairColumns(result), rows: pairs,
+      rgb: (pair) => pair.sample.rgb, text: (pair) => `${pair.name} ${pair.verbal ?? ''}`,
+      onChoose(all) {
+        chosen = new Set([...all].slice(-4));
+        spectra.add([...chosen].filter((pair) => pair !== worst[0]).flatMap(spectraOf));
+        plane.draw();
+      },
+    }),
+  ];
+}

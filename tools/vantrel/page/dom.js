@@ -1,0 +1,51 @@
+// Elements and numbers as text. Nothing here parses HTML: names from files can only become text.
+
+// h('a', { href: '#x', class: 'link', onclick: … }, 'text', element, …)
+export function h(tag, attributes = {}, ...children) {
+  const element = document.createElement(tag);
+  for (const [name, value] of Object.entries(attributes)) {
+    if (value === null || value === undefined || value === false) continue;
+    if (name.startsWith('on')) element.addEventListener(name.slice(2), value);
+    else if (name === 'colour') element.style.setProperty('--colour', value);
+    else element.setAttribute(name, value === true ? '' : value);
+  }
+  element.append(...children.flat(Infinity).filter((child) => (child ?? '') !== ''));
+  return element;
+}
+
+// Text of a file, which may run from right to left.
+export const named = (text) => h('bdi', {}, text);
+
+export const swatch = (rgb) => h('span', { class: 'swatch', colour: rgb, 'aria-hidden': 'true' });
+
+const missing = '–';
+export const fixed = (value, decimals = 2) =>
+  value === null || value === undefined ? missing : value.toFixed(decimals);
+export const triple = (values, decimals = 2) =>
+  values.map((value) => fixed(value, decimals)).join('  ');
+export const count = (number, noun) =>
+  `${number.toLocaleString('en')} ${noun}${number === 1 ? '' : noun.endsWith('h') ? 'es' : 's'}`;
+
+// [[term, text or element, what it means], …] as a row of figures.
+export function figures(entries) {
+  return h('dl', { class: 'figures' }, entries.map(([term, value, remark]) =>
+    h('div', {}, h('dt', {}, term), h('dd', {}, value),
+      remark ? h('dd', { class: 'remark' }, remark) : null)));
+}
+
+// A small table that needs no sorting: columns [{ label, text: (row) => …, number: true }, …].
+export function smallTable(caption, columns, rows) {
+  const cell = (tag, column, content) =>
+    h(tag, { class: column.number ? 'number' : null, scope: tag === 'th' ? 'col' : null }, content);
+  return h('div', { class: 'scroll' }, h('table', {},
+    h('caption', {}, caption),
+    h('thead', {}, h('tr', {}, columns.map((column) => cell('th', column, column.label)))),
+    h('tbody', {}, rows.map((row) =>
+      h('tr', {}, columns.map((column) => cell('td', column, column.text(row))))))));
+}
+
+// At most `most` of the items, evenly spread over all of them.
+export function spread(items, most) {
+  if (items.length <= most) return items;
+  return Array.from({ length: most }, (_, i) => items[Math.floor(i * items.length / most)]);
+}

@@ -1,0 +1,245 @@
+// vantrel report: each sheet with its key figures, pictures and patches.
+
+import { histogramPlot, legend, mostPoints, picture, planePlot, spectraPlot, tonePlot }
+  from './charts.js';
+import { count, figures, fixed, h, named, smallTable, spread, swatch, triple } from './dom.js';
+import { searchTable } from './table.js';
+
+const mostSwatches = 2000;
+const mostCards = 60;
+const mostChosen = 8;
+
+const largest = (patches, field) => patches.reduce((best, patch) =>
+  (patch[field] !== null && !(best && best[field] >= patch[field]) ? patch : best), null);
+
+// The inks of a patch, [[field, percent], …]; nothing where its device values are no inks.
+function tintsOf(sheet, patch) {
+  if (!sheet.inks.length) return null;
+  const tints = sheet.inks.map((ink) => [ink, patch.device[ink]]);
+  return tints.every(([, percent]) => percent >= 0 && percent <= 100)
+    ? tints.filter(([, percent]) => percent > 0) : null;
+}
+
+function solidsOf(sheet) {
+  const solids = new Map();
+  for (const patch of sheet.patches) {
+    const tints = tintsOf(sheet, patch);
+    if (tints?.length === 1 && tints[0][1] === 100 && !solids.has(tints[0][0]))
+      solids.set(tints[0][0], patch);
+  }
+  return solids;
+}
+
+// One curve an ink, from paper to solid.
+function toneCurves(sheet, solids) {
+  const curves = [];
+  for (const [ink, solid] of solids) {
+    const tints = new Map();
+    for (const patch of sheet.patches) {
+      const inks = tintsOf(sheet, patch);
+      if (patch.dot_area !== null && inks?.length === 1 && inks[0][0] === ink &&
+          !tints.has(inks[0][1]))
+        tints.set(inks[0][1], patch);
+    }
+    if (tints.size)
+      curves.push({ name: solid.name, rgb: solid.rgb, points: [
+        { nominal: 0, area: 0, gain: 0 },
+        ...[...tints].sort(([a], [b]) => a - b).map(([nominal, patch]) =>
+          ({ nominal, area: patch.dot_area, gain: patch.dot_gain })),
+        { nominal: 100, area: 100, gain: 0 }] });
+  }
+  return curves;
+}
+
+function keyFigures(sheet, solids) {
+  const { paper } = sheet;
+  const gain = largest(sheet.patches, 'dot_gain');
+  const contrast = largest(sheet.patches, 'print_contrast');
+  return figures([
+    ['Paper L*a*b*', triple(paper.lab), named(paper.name)],
+    ['Brightness', fixed(paper.brightness), 'percent'],
+    ['Whiteness', fixed(paper.whiteness), paper.whiteness === null ? paper.no_whiteness : 'ASTM E313'],
+    paper.metamerism && ['Metamerism', fixed(paper.metamerism.sum),
+      ['to ', named(paper.metamerism.paper), ` under ${paper.metamerism.illuminant}; DIN 6172 ` +
+        fixed(paper.metamerism.din6172)]],
+    ...[...solids.values()].slice(0, 8).map((solid) =>
+      [['Density ', swatch(solid.rgb)], fixed(solid.density, 3),
+        [named(solid.name), solid.response ? `, ${solid.response}` : '']]),
+    gain && ['Largest gain', fixed(gain.dot_gain), named(gain.name)],
+    contrast && ['Largest contrast', fixed(contrast.print_contrast), named(contrast.name)],
+  ].filter(Boolean));
+}
+
+export function swatches(patches, note) {
+  const shown = spread(patches, mostSwatches);
+  const cards = patches.length <= mostCards;
+  const thinned = shown.length < patches.length
+    ? `${count(shown.length, 'swatch')} of ${patches.length.toLocaleString('en')}, evenly spread. `
+    : '';
+  return h('figure', { class: 'wide' },
+    h('figcaption', {}, h('strong', {}, 'Swatches'), ' ', h('span', { class: 'says' },
+      thinned + note)),
+    cards
+      ? h('ul', { class: 'cards' }, shown.map((patch) =>
+        h('li', {}, swatch(patch.rgb), named(patch.name))))
+      : h('div', { class: 'mosaic', role: 'img', 'aria-label':
+          `${thinned}Swatches of the patches in the order of the file; the table names them.` },
+      shown.map((patch) => h('span', { class: 'swatch', colour: patch.rgb, title: patch.name }))));
+}
+
+const spectrumTable = (series) => h('details', {}, h('summary', {}, 'Numbers'),
+  smallTable('Reflectance in percent', [
+    { label: 'nm', number: true, text: (i) => String(400 + 10 * i) },
+    ...series.map((one) => ({ label: named(one.name), number: true,
+      text: (i) => fixed(one.refl[i]) })),
+  ], series[0].refl.map((_, i) => i)));
+
+const toneTable = (curves) => h('details', {}, h('summary', {}, 'Numbers'),
+  smallTable('Dot area and gain', [
+    { label: 'Ink', text: ([curve]) => named(curve.name) },
+    { label: 'Nominal %', number: true, text: ([, point]) => String(point.nominal) },
+    { label: 'Area %', number: true, text: ([, point]) => fixed(point.area) },
+    { label: 'Gain', number: true, text: ([, point]) => fixed(point.gain) },
+  ], curves.flatMap((curve) => curve.points.slice(1, -1).map((point) => [curve, point]))));
+
+// The spectra, to which chosen patches are added, and what follows the choice.
+export function spectraPicture(fixedSeries, says) {
+  let series = fixedSeries;
+  const keys = h('div');
+  const numbers = h('div');
+  const refresh = () => {
+    keys.replaceChildren(legend(series));
+    numbers.replaceChildren(series.length ? spectrumTable(series) : '');
+  };
+  refresh();
+  const spectra = picture('Spectra', (width) => spectraPlot(series)(width), says, keys, numbers);
+  return { element: spectra.element, add(more) {
+    series = [...fixedSeries, ...more];
+    refresh();
+    spectra.draw();
+  } };
+}
+
+function tonePictures(curves) {
+  const most = curves.map((curve) => {
+    const point = curve.points.reduce((a, b) => (b.gain > a.gain ? b : a));
+    return `${curve.name} gains at most ${fixed(point.gain)} at ${point.nominal} %`;
+  }).join('; ');
+  return [
+    picture('Tone values', tonePlot(curves, 'area'),
+      () => `Measured dot area over the nominal tone value; the broken line is no gain.`,
+      legend(curves), toneTable(curves)).element,
+    picture('Gain', tonePlot(curves, 'gain'), () => `${most}.`, legend(curves)).element,
+  ];
+}
+
+function attributeTables(sheet) {
+  const having = (field) => sheet.patches.filter((patch) => patch[field] !== null).slice(0, 200);
+  const name = { label: 'Patch', text: (patch) => [swatch(patch.rgb), named(patch.name)] };
+  const number = (label, field, decimals = 2) =>
+    ({ label, number: true, text: (patch) => fixed(patch[field], decimals) });
+  const blocks = [
+    ['Solids', 'hue_error', [number('Density', 'density', 3), number('Hue error', 'hue_error'),
+      number('Grayness', 'grayness')]],
+    ['Overprints', 'trap', [number('Density', 'density', 3), number('Trap', 'trap')]],
+    ['Shadows', 'print_contrast', [number('Gain', 'dot_gain'),
+      number('Contrast', 'print_contrast')]],
+  ];
+  const tables = blocks.map(([title, field, columns]) => {
+    const rows = having(field);
+    return rows.length ? smallTable(title, [name, ...columns], rows) : null;
+  }).filter(Boolean);
+  return tables.length ? h('div', { class: 'tables' }, tables) : null;
+}
+
+function columnsOf(sheet) {
+  const number = (label, field, decimals, title) =>
+    ({ id: field, label, decimals, title, value: (patch) => patch[field] });
+  const part = (label, id, field, i) =>
+    ({ id, label, decimals: 2, value: (patch) => patch[field][i] });
+  const devices = Object.keys(sheet.patches[0].device);
+  return [
+    { id: 'name', label: 'Patch', value: (patch) => patch.name },
+    { id: 'id', label: 'Id', value: (patch) => patch.id },
+    ...devices.map((field) => ({ id: field, label: field.replace(/^CMYK_/, ''), decimals: 0,
+      title: `${field}, percent`, value: (patch) => patch.device[field] })),
+    part('L*', 'L', 'lab', 0), part('a*', 'a', 'lab', 1), part('b*', 'b', 'lab', 2),
+    part('C*', 'C', 'lch', 1), part('h', 'h', 'lch', 2),
+    number('ΔE00', 'de00_to_paper', 2, 'Colour difference to the paper, CIEDE2000'),
+    { id: 'response', label: 'Resp.', title: 'Response that reads the patch',
+      value: (patch) => patch.response },
+    number('D', 'density', 3, 'Density over the paper'),
+    number('Area', 'dot_area', 2, 'Dot area, percent'),
+    number('Gain', 'dot_gain', 2, 'Dot gain, percentage points'),
+    number('Contrast', 'print_contrast', 2, 'Print contrast, percent'),
+    number('Hue err.', 'hue_error', 2, 'Hue error, percent'),
+    number('Grayness', 'grayness', 2, 'Grayness, percent'),
+    number('Trap', 'trap', 2, 'Trap (Preucil), percent'),
+  ];
+}
+
+function sheetSection(sheet, id) {
+  const solids = solidsOf(sheet);
+  const curves = toneCurves(sheet, solids);
+  const paperPatch = sheet.patches.find((patch) => patch.name === sheet.paper.name);
+  const always = new Set([paperPatch, ...solids.values()].filter(Boolean));
+  const thinned = [...always, ...spread(sheet.patches.filter((patch) => !always.has(patch)),
+    mostPoints)];
+  let chosen = new Set();
+  const points = () => [...thinned.filter((patch) => !chosen.has(patch)), ...chosen].map((patch) =>
+    ({ ...patch, chosen: chosen.has(patch) }));
+  const farthest = largest(sheet.patches, 'de00_to_paper');
+  const series = [
+    ...(paperPatch ? [{ ...paperPatch, dashed: true }] : []),
+    ...[...solids.values()].slice(0, 12),
+  ];
+  const spectra = spectraPicture(series, () => 'The paper (broken line)' +
+    `${solids.size ? ` and ${count(solids.size, 'solid')}` : ''}; choose patches in the table ` +
+    'to see theirs.');
+  const plane = picture('a*b* plane', (width) => planePlot(points(), sheet.paper.lab)(width),
+    () => (thinned.length < sheet.patches.length
+      ? `${count(thinned.length, 'patch')} of ${sheet.patches.length.toLocaleString('en')}, ` +
+        'evenly spread. ' : '') +
+      `The diamond is the paper, a* ${fixed(sheet.paper.lab[1])}, b* ${fixed(sheet.paper.lab[2])}.`);
+  const distances = picture('ΔE00 to the paper',
+    histogramPlot(sheet.patches.map((patch) => patch.de00_to_paper), 'ΔE00'),
+    () => `Largest ${fixed(farthest.de00_to_paper)}, ${farthest.name}.`);
+  const { source } = sheet;
+  return h('section', { class: 'sheet', id },
+    h('header', {},
+      h('h2', {}, named(sheet.file)),
+      h('p', { class: 'about' }, [
+        count(sheet.patches.length, 'patch'),
+        sheet.inks.length ? count(sheet.inks.length, 'ink') : null,
+        sheet.illuminant, sheet.status, sheet.n_factor !== 1 ? `n = ${sheet.n_factor}` : null,
+        `measured at ${source.first_nm}–${source.last_nm} nm in ${count(source.bands, 'band')}`,
+      ].filter(Boolean).join(' · '))),
+    keyFigures(sheet, solids),
+    swatches(sheet.patches, 'In the order of the file, as a screen can show them.'),
+    h('div', { class: 'pictures' }, spectra.element, ...(curves.length ? tonePictures(curves) : []),
+      plane.element, distances.element, attributeTables(sheet)),
+    searchTable({
+      caption: 'All patches', noun: 'patch', columns: columnsOf(sheet), rows: sheet.patches,
+      rgb: (patch) => patch.rgb, text: (patch) => `${patch.name} ${patch.id}`,
+      onChoose(all) {
+        chosen = new Set([...all].slice(-mostChosen));
+        spectra.add([...chosen].filter((patch) => !always.has(patch)));
+        plane.draw();
+      },
+    }));
+}
+
+export function reportPage({ sheets }) {
+  const overview = sheets.length < 2 ? null : h('section', {},
+    smallTable('Sheets', [
+      { label: 'Sheet', text: ([sheet, i]) => h('a', { href: `#sheet-${i}` }, named(sheet.file)) },
+      { label: 'Patches', number: true, text: ([sheet]) => sheet.patches.length.toLocaleString('en') },
+      { label: 'Paper L*a*b*', number: true, text: ([sheet]) => triple(sheet.paper.lab) },
+      { label: 'Largest gain', number: true,
+        text: ([sheet]) => fixed(largest(sheet.patches, 'dot_gain')?.dot_gain) },
+    ], sheets.map((sheet, i) => [sheet, i])));
+  return [
+    h('h1', {}, sheets.length > 1 ? `${sheets.length} press sheets` : 'Press sheet'),
+    overview, sheets.map((sheet, i) => sheetSection(sheet, `sheet-${i}`)),
+  ];
+}
