@@ -5,7 +5,12 @@ cd "$(dirname "${BASH_SOURCE[0]}")/.."
 build_packages=(cmake ninja-build g++ pkg-config
     libcli11-dev libfmt-dev nlohmann-json3-dev libpugixml-dev)
 fuzz_packages=(clang libclang-rt-14-dev)
-test_packages=(libgtest-dev clang clang-tidy clang-format doxygen binutils)
+page_packages=(npm)
+test_packages=(chromium libgtest-dev clang clang-tidy clang-format doxygen binutils)
+
+# npm may have come with a node that is not Debian's, which Debian's npm would drive out. Debian's is
+# some 400 small packages.
+command -v npm >/dev/null && command -v node >/dev/null && page_packages=()
 
 # Installs those of the packages that the system does not have. Stops where it may not.
 install_packages() {

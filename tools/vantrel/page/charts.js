@@ -135,18 +135,19 @@ export function planePlot(points, paper) {
 
 export function histogramPlot(values, label, limit) {
   const marked = limit === null || limit === undefined ? [] : [limit];
+  const top = [...marked, ...values].reduce((a, b) => Math.max(a, b), 0.1);
   return (width) => ({
     height: Math.min(340, Math.max(240, width * 0.6)),
     x: { label, zero: true, nice: true },
     y: { label: 'Patches', grid: true, ticks: 5, tickSize: 0,
       tickFormat: (value) => (Number.isInteger(value) ? value.toLocaleString('en') : '') },
     marks: [
-      Plot.rectY(values, Plot.binX({ y: 'count' }, { x: (value) => value, thresholds: 20,
-        fill: 'currentColor', fillOpacity: 0.55, tip: true })),
+      Plot.rectY(values, Plot.binX({ y: 'count' }, { x: (value) => value, domain: [0, top],
+        thresholds: 20, fill: 'currentColor', fillOpacity: 0.55, tip: true })),
       Plot.ruleY([0]),
       Plot.ruleX(marked, { stroke: 'var(--fail)', strokeWidth: 2 }),
       Plot.text(marked, { x: (value) => value, frameAnchor: 'top', dy: -12, fill: 'var(--fail)',
-        text: (value) => `Tolerance ${value}` }),
+        textAnchor: limit > top / 2 ? 'end' : 'start', text: (value) => `Tolerance ${value}` }),
     ],
   });
 }

@@ -5,12 +5,18 @@ import { count, figures, fixed, h, named, smallTable, spread, swatch } from './d
 import { spectraPicture, swatches } from './report.js';
 import { searchTable } from './table.js';
 
-export const formulaNames = { de2000: 'ΔE00', cmc: 'ΔE CMC', de94: 'ΔE94', de76: 'ΔE*ab' };
-const labelOf = (formula) => formulaNames[formula] ?? formula;
+const formulaNames = { de2000: 'ΔE00', cmc: 'ΔEcmc', de94: 'ΔE94', de76: 'ΔE*ab' };
+// With its weights, l:c or kL:kC, where they are not one.
+function labeller({ weights }) {
+  const weighted = (formula) => (weights?.[formula]?.some((weight) => weight !== 1)
+    ? `(${weights[formula].join(':')})` : '');
+  return (formula) => `${formulaNames[formula] ?? formula}${weighted(formula)}`;
+}
 const labText = (lab) => lab.map((value) => fixed(value)).join(' ');
 
 function verdict(result) {
   const [formula] = result.formulas;
+  const labelOf = labeller(result);
   const { max, max_patch: patch } = result.statistics[formula];
   const worst = [`The largest ${labelOf(formula)} is ${fixed(max)}, at `, named(patch)];
   if (result.passed === null || result.tolerance === null)
@@ -30,6 +36,7 @@ function unpaired(result) {
 }
 
 function pairColumns(result) {
+  const labelOf = labeller(result);
   const lab = (side, short) => ['L*', 'a*', 'b*'].map((label, i) =>
     ({ id: `${side}-${label}`, label: `${label} ${short}`, decimals: 2, title: `${label}, ${side}`,
       value: (pair) => pair[side].lab[i] }));
@@ -41,6 +48,12 @@ function pairColumns(result) {
     { id: 'metamerism', label: 'Metam.', decimals: 2, value: (pair) => pair.metamerism,
       title: `Metamerism between ${result.illuminant} and ${result.second_illuminant}` },
     ...lab('reference', 'ref.'), ...lab('sample', 'sample'),
+    { id: 'response', label: 'Resp.', title: 'Response that reads the reference',
+      value: (pair) => pair.response },
+    { id: 'density', label: 'D ref.', decimals: 3, title: 'Density over the paper, reference',
+      value: (pair) => pair.reference.density },
+    { id: 'density_difference', label: 'ΔD', decimals: 3, title: 'Density, sample less reference',
+      value: (pair) => pair.density_difference },
   ];
 }
 
@@ -56,32 +69,33 @@ const bothColours = ({ reference, sample }) =>
 const overview = (result) => h('header', {},
   h('h1', {}, named(result.sample.file), ' against ', named(result.reference.file)),
   h('p', { class: 'about' }, [count(result.pairs.length, 'patch'),
-    `paired by ${result.paired_by}`, result.illuminant].join(' · ')));
+    `paired by ${result.paired_by}`, result.illuminant, result.status].join(' · ')));
 
-const statisticsTable = ({ formulas, statistics }) => smallTable('Differences', [
-  { label: 'Formula', text: labelOf },
-  { label: 'Mean', number: true, text: (name) => fixed(statistics[name].mean) },
-  { label: '95th percentile', number: true, text: (name) => fixed(statistics[name].p95) },
-  { label: 'Largest', number: true, text: (name) => fixed(statistics[name].max) },
-  { label: 'At', text: (name) => named(statistics[name].max_patch) },
-], formulas);
+const statisticsTable = (result) => smallTable('Differences', [
+  { label: 'Formula', text: labeller(result) },
+  ...[['Mean', 'mean'], ['95th percentile', 'p95'], ['Largest', 'max']].map(([label, field]) =>
+    ({ label, number: true, text: (name) => fixed(result.statistics[name][field]) })),
+  { label: 'At', text: (name) => named(result.statistics[name].max_patch) },
+], result.formulas);
 
 export function comparePage(result) {
   const { formulas, pairs, statistics } = result;
+  const labelOf = labeller(result);
   if (!pairs.length) return [overview(result), h('p', {}, 'No patch has a partner.'),
     unpaired(result)];
   const [formula] = formulas;
   const worst = result.worst.map((i) => pairs[i]);
+  const paper = pairs.find((pair) => pair.sample.name === result.sample.paper);
   let chosen = new Set();
   const always = new Set(worst);
   const thinned = [...always, ...spread(pairs.filter((pair) => !always.has(pair)), mostPoints)];
   const points = () => [...thinned.filter((pair) => !chosen.has(pair)), ...chosen].map((pair) =>
     ({ name: pair.name, rgb: pair.sample.rgb, lab: pair.sample.lab, reference: pair.reference.lab,
       chosen: chosen.has(pair) }));
-  const plane = picture('a*b* plane', (width) => planePlot(points(), null)(width), () =>
+  const plane = picture('a*b* plane', (width) => planePlot(points(), paper?.sample.lab)(width), () =>
     (thinned.length < pairs.length ? `${count(thinned.length, 'patch')} of ` +
       `${pairs.length.toLocaleString('en')}, evenly spread. ` : '') +
-    'Rings are the reference, filled points the sample.');
+    'Rings are the reference, filled points the sample' + (paper ? ', the diamond its paper.' : '.'));
   const spectra = spectraPicture(spectraOf(worst[0]), () =>
     'Reference (broken line) and sample of the worst patch; choose more in the table.');
   const { mean, p95, max } = statistics[formula];
@@ -111,7 +125,7 @@ export function comparePage(result) {
         'The reference upper left, the sample lower right, as a screen can show them.')),
     searchTable({
       caption: 'All patches', noun: 'patch', columns: pairColumns(result), rows: pairs,
-      rgb: (pair) => pair.sample.rgb, text: (pair) => `${pair.name} ${pair.verbal ?? ''}`,
+      rgb: (pair) => pair.sample.rgb, text: (pair) => `${pair.name} ${pair.sample.name} ${pair.verbal}`,
       onChoose(all) {
         chosen = new Set([...all].slice(-4));
         spectra.add([...chosen].filter((pair) => pair !== worst[0]).flatMap(spectraOf));

@@ -19,8 +19,8 @@ export const named = (text) => h('bdi', {}, text);
 export const swatch = (rgb) => h('span', { class: 'swatch', colour: rgb, 'aria-hidden': 'true' });
 
 const missing = '–';
-export const fixed = (value, decimals = 2) =>
-  value === null || value === undefined ? missing : value.toFixed(decimals);
+export const fixed = (value, decimals = 2) => (value === null || value === undefined ? missing
+  : value.toFixed(decimals).replace(/^-(0\.?0*)$/, '$1'));
 export const triple = (values, decimals = 2) =>
   values.map((value) => fixed(value, decimals)).join('  ');
 export const count = (number, noun) =>

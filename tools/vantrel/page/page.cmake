@@ -30,7 +30,6 @@ endif()
 if(page_missing)
   message(STATUS "The program is built without --format html: ${page_missing}")
   target_sources(vantrel PRIVATE page/no_page.cpp)
-  set(VANTREL_HAS_PAGE OFF PARENT_SCOPE)
   return()
 endif()
 
@@ -42,4 +41,3 @@ add_custom_command(OUTPUT ${page_build}/page.cpp
   COMMENT "Bundling the page" VERBATIM)
 target_sources(vantrel PRIVATE ${page_build}/page.cpp)
 set_source_files_properties(${page_build}/page.cpp PROPERTIES INCLUDE_DIRECTORIES ${page_dir})
-set(VANTREL_HAS_PAGE ON PARENT_SCOPE)
