@@ -71,6 +71,24 @@ export function spectraPlot(series) {
   });
 }
 
+// curves: [{ name, rgb, weights }, …], signed, the largest 100
+export function weightsPlot(curves) {
+  const points = curves.flatMap(({ name, rgb, weights }) =>
+    weights.map((weight, i) => ({ name, rgb, weight, nm: bands[i] })));
+  const way = { x: 'nm', y: 'weight', z: 'name' };
+  return (width) => ({
+    height: Math.min(380, Math.max(260, width * 0.6)),
+    x: { label: 'Wavelength (nm)', domain: [400, 700], tickFormat: 'd', ticks: width < 420 ? 4 : 7 },
+    y: { label: 'Weight', domain: [-100, 100], grid: true },
+    marks: [
+      Plot.ruleY([0]),
+      edged(points, way),
+      Plot.tip(points, Plot.pointer({ ...way,
+        title: (point) => `${point.name}\n${point.nm} nm: ${point.weight.toFixed(2)}` })),
+    ],
+  });
+}
+
 // curves: [{ name, rgb, points: [{ nominal, area, gain }, …] }, …]; what: 'area' or 'gain'
 export function tonePlot(curves, what) {
   const points = curves.flatMap((curve, z) =>

@@ -2,7 +2,8 @@
 
 import { comparePage } from './compare.js';
 import { h } from './dom.js';
-import { plainPage } from './plain.js';
+import { inkPage } from './ink.js';
+import { listPage } from './list.js';
 import { predictPage } from './predict.js';
 import { reportPage } from './report.js';
 
@@ -14,11 +15,11 @@ const pages = {
   report: [reportPage, () => result.sheets.map((sheet) => sheet.file).join(', ')],
   compare: [comparePage, () => `${result.sample.file} against ${result.reference.file}`],
   predict: [predictPage, () => `${result.file}, predicted`],
-  ink: [plainPage, () => result.patch?.name ?? result.name ?? 'Patch'],
-  list: [plainPage, () => 'Vantrel tables'],
+  ink: [inkPage, () => `${result.patch.name}, ${result.file}`],
+  list: [listPage, () => result.list],
 };
-const [show, title] = pages[result.command] ?? [plainPage, () => result.command];
+const [show, title] = pages[result.command];
 document.title = title();
 document.getElementById('page').append(
-  ...[show(result, title())].flat(Infinity).filter(Boolean),
+  ...[show(result)].flat(Infinity).filter(Boolean),
   h('footer', {}, 'Made by Vantrel. All numbers are in this file; it asks nothing of any network.'));

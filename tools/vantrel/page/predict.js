@@ -7,10 +7,12 @@ const nameOf = (prediction) => prediction.measured?.name ??
   prediction.inks.map((ink) => `${ink.name} ${ink.percent} %`).join(' + ');
 
 export function predictPage(result) {
-  const lab = (side, title) => ['L*', 'a*', 'b*'].map((label, i) => ({ id: `${side}-${label}`,
-    label: `${label} ${title}`, decimals: 2, value: (row) => row[side]?.lab[i] }));
-  const difference = (side, title) => ({ id: `${side}-de`, label: `ΔE00 ${title}`, decimals: 2,
-    value: (row) => row[side].de00_to_measured });
+  const lab = (side) => ['L*', 'a*', 'b*'].map((label, i) => ({ id: `${side}-${label}`,
+    label: `${label} ${side}`, decimals: 2, value: (row) => row[side]?.lab[i] }));
+  const density = (side) => ({ id: `${side}-density`, label: `D ${side}`, decimals: 3,
+    title: `Density over the paper, ${side}`, value: (row) => row[side]?.density });
+  const difference = (side) => ({ id: `${side}-de`, label: `ΔE00 ${side}`, decimals: 2,
+    title: 'CIEDE2000 to the measurement', value: (row) => row[side].de00_to_measured });
   return [
     h('h1', {}, 'Predicted overprints'),
     h('p', { class: 'about' }, named(result.file), ` · ${result.illuminant} · on `,
@@ -22,8 +24,8 @@ export function predictPage(result) {
       noun: 'combination',
       columns: [
         { id: 'name', label: 'Combination', value: nameOf },
-        ...lab('halftone', 'halftone'), difference('halftone', 'halftone'),
-        ...lab('film', 'film'), difference('film', 'film'), ...lab('measured', 'measured'),
+        ...['halftone', 'film', 'measured'].flatMap((side) => [...lab(side), density(side),
+          ...(side === 'measured' ? [] : [difference(side)])]),
       ],
       rows: result.predictions,
       rgb: (row) => (row.measured ?? row.halftone).rgb,

@@ -157,7 +157,7 @@ function columnsOf(sheet) {
     ({ id: field, label, decimals, title, value: (patch) => patch[field] });
   const part = (label, id, field, i) =>
     ({ id, label, decimals: 2, value: (patch) => patch[field][i] });
-  const devices = Object.keys(sheet.patches[0].device);
+  const devices = [...new Set(sheet.patches.flatMap((patch) => Object.keys(patch.device)))];
   return [
     { id: 'name', label: 'Patch', value: (patch) => patch.name },
     { id: 'id', label: 'Id', value: (patch) => patch.id },
@@ -212,7 +212,10 @@ function sheetSection(sheet, id) {
         count(sheet.patches.length, 'patch'),
         sheet.inks.length ? count(sheet.inks.length, 'ink') : null,
         sheet.illuminant, sheet.status, sheet.n_factor !== 1 ? `n = ${sheet.n_factor}` : null,
+        source.condition,
         `measured at ${source.first_nm}–${source.last_nm} nm in ${count(source.bands, 'band')}`,
+        source.averaged ? 'averaged to 10 nm' : null,
+        source.scaled_to_percent ? 'brought to percent' : null,
       ].filter(Boolean).join(' · '))),
     keyFigures(sheet, solids),
     swatches(sheet.patches, 'In the order of the file, as a screen can show them.'),

@@ -1,0 +1,75 @@
+// vantrel ink: one patch, under every status and illuminant, and beside another one.
+
+import { legend, picture, weightsPlot } from './charts.js';
+import { figures, fixed, h, named, smallTable, swatch, triple } from './dom.js';
+import { spectraPicture } from './report.js';
+
+const number = (label, value, decimals = 2) =>
+  ({ label, number: true, text: (row) => fixed(value(row), decimals) });
+
+function keyFigures({ patch, against, illuminant, ...result }) {
+  const optional = [['Dot area', 'dot_area'], ['Gain', 'dot_gain'], ['Contrast', 'print_contrast'],
+    ['Hue error', 'hue_error'], ['Grayness', 'grayness'], ['Trap', 'trap']];
+  return figures([
+    ['L*a*b*', triple(patch.lab), illuminant],
+    ['C* and h', `${fixed(patch.lch[1])}  ${fixed(patch.lch[2])}°`],
+    ['ΔE00 to the paper', fixed(patch.de00_to_paper), named(result.paper)],
+    ['Density', fixed(patch.density, 3), `${patch.response ?? ''}, ${result.status}`],
+    ...optional.filter(([, field]) => patch[field] !== null)
+      .map(([label, field]) => [label, fixed(patch[field])]),
+    ['Brightness', fixed(result.brightness), 'percent'],
+    ['Whiteness', fixed(result.whiteness), result.no_whiteness ?? 'ASTM E313'],
+    ...(against ? [['ΔE00', fixed(against.de00), ['to ', named(against.name)]]] : []),
+  ]);
+}
+
+function densityTable({ statuses }) {
+  const responses = [...new Set(statuses.flatMap((status) => Object.keys(status.densities)))];
+  return smallTable('Densities over the paper', [
+    { label: 'Status', text: (row) => row.status },
+    { label: 'Read by', text: (row) => row.response ?? '–' },
+    number('Density', (row) => row.density, 3),
+    ...responses.map((name) => number(name, (row) => row.densities[name], 3)),
+  ], statuses);
+}
+
+const colourTable = ({ illuminants, against }) => smallTable('Colours', [
+  { label: 'Illuminant', text: (row) => [swatch(row.rgb), row.illuminant] },
+  ...['L*', 'a*', 'b*'].map((label, i) => number(label, (row) => row.lab[i])),
+  number('C*', (row) => row.lch[1]), number('h', (row) => row.lch[2]),
+  ...(!against ? [] : [
+    number('ΔE00', (row) => row.de00), number('Metamerism', (row) => row.metamerism),
+    number('DIN 6172', (row) => row.din6172)]),
+], illuminants);
+
+function weightsPicture(against) {
+  const curves = [{ name: 'along a*', rgb: '#c8385e', weights: against.a_weights },
+    { name: 'along b*', rgb: '#3f7fd0', weights: against.b_weights }];
+  const peak = ({ name, weights }) => {
+    const most = weights.reduce((best, one, i) =>
+      (Math.abs(one) > Math.abs(weights[best]) ? i : best), 0);
+    return `${name} most at ${400 + 10 * most} nm`;
+  };
+  return picture('Where the difference lies', weightsPlot(curves),
+    () => `Share of each band in the difference from ${against.name}: ` +
+      `${curves.map(peak).join(', ')}.`, legend(curves)).element;
+}
+
+export function inkPage(result) {
+  const { patch, against } = result;
+  const series = [{ name: patch.name, rgb: patch.rgb, refl: patch.refl },
+    ...(against ? [{ name: against.name, rgb: against.rgb, refl: against.refl, dashed: true }] : [])];
+  return [
+    h('header', {},
+      h('h1', {}, swatch(patch.rgb), named(patch.name)),
+      h('p', { class: 'about' }, named(result.file), ` · id `, named(patch.id), ' · ',
+        Object.entries(patch.device).map(([ink, percent]) => `${ink} ${percent}`).join(' '))),
+    keyFigures(result),
+    h('div', { class: 'pictures' },
+      spectraPicture(series, () => `${fixed(patch.refl[0])} % at 400 nm, ${fixed(patch.refl[30])} ` +
+        `% at 700 nm${against ? `; broken line ${against.name}` : ''}.`).element,
+      against ? weightsPicture(against) : null),
+    densityTable(result),
+    colourTable(result),
+  ];
+}
