@@ -29,6 +29,8 @@ const commands = {
   sheets: ['report', example, press],
   compare: ['compare', example, press, '--tolerance', '2', '--formula', 'de2000,cmc'],
   predict: ['predict', example],
+  ink: ['ink', example, '--patch', 'Magenta 100', '--against', 'Magenta 90'],
+  list: ['list', 'illuminants'],
   strange: ['report', strange],
 };
 
@@ -113,6 +115,21 @@ test('predictions show both models and the measurement', async () => {
     assert.equal(rows[i]['ΔE00 film'], shown(one.film.de00_to_measured));
     assert.equal(rows[i]['b* measured'], shown(one.measured.lab[2]));
   });
+  await page.close();
+});
+
+test('one patch is shown under every status and illuminant', async () => {
+  const page = await open(commands.ink);
+  const { patch, against, statuses, illuminants } = json(commands.ink);
+  const tables = await page.$$eval('main > .scroll', (all) => all.map((one) =>
+    [...one.querySelectorAll('tbody tr')].map((row) => [...row.cells].map((c) => c.textContent))));
+  assert.deepEqual(tables[0].map((row) => row.slice(0, 3)),
+    statuses.map((one) => [one.status, one.response, shown(one.density, 3)]));
+  assert.deepEqual(tables[1].map((row) => row.slice(0, 4).concat(row[6])), illuminants.map((one) =>
+    [one.illuminant, ...one.lab.map((v) => shown(v)), shown(one.de00)]));
+  const figures = await figuresOf(page);
+  assert.ok(figures.includes(`ΔE00 ${shown(against.de00)} to ${against.name}`), figures);
+  assert.ok(figures[0].startsWith(`L*a*b* ${patch.lab.map((v) => shown(v)).join(' ')} `), figures);
   await page.close();
 });
 
