@@ -4,10 +4,10 @@ import { execFileSync } from 'node:child_process';
 import { mkdtempSync, rmSync, writeFileSync } from 'node:fs';
 import { createRequire } from 'node:module';
 import { tmpdir } from 'node:os';
-import { join } from 'node:path';
+import { join, resolve } from 'node:path';
 
 const { MODULES, VANTREL } = process.env; // node_modules and the program
-const { chromium } = createRequire(join(MODULES, 'any.js'))('playwright-core');
+const { chromium } = createRequire(resolve(MODULES, 'any.js'))('playwright-core');
 export const example = process.env.EXAMPLE;
 export const folder = mkdtempSync(join(tmpdir(), 'vantrel_page_'));
 const browser = await chromium.launch({ executablePath: process.env.CHROMIUM ?? '/usr/bin/chromium' });

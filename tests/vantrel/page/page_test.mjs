@@ -77,9 +77,11 @@ test('the numbers of a report are those of its JSON', async () => {
   assert.ok(figures.includes(`Whiteness ${shown(paper.whiteness)} ASTM E313`), figures);
   assert.ok(figures.some((one) => one.startsWith(`Largest gain ${shown(gain)} `)), figures);
 
-  // Every band of the spectra, in the table behind the picture.
-  const spectra = await page.$$eval('figure details', ([details]) =>
-    [...details.querySelectorAll('tbody tr')].map((row) => row.innerText || row.textContent));
+  // Every band of the spectra and every tone value, in the tables behind the pictures.
+  const [spectra, tones] = await page.$$eval('figure details', (all) => all.map((details) =>
+    [...details.querySelectorAll('tbody tr')].map((row) => row.textContent)));
+  assert.deepEqual(tones, sheet.tone_values.flatMap(({ solid, values }) => values.map((value) =>
+    `${solid}${value.nominal}${shown(value.dot_area)}${shown(value.dot_gain)}`)));
   const solid = sheet.patches.find((patch) => patch.name === 'Yellow 100');
   spectra.forEach((row, i) => assert.equal(row,
     `${400 + 10 * i}${[sheet.patches[0], sheet.patches[10], solid].map((p) => shown(p.refl[i])).join('')}`));

@@ -31,25 +31,12 @@ function solidsOf(sheet) {
 }
 
 // One curve an ink, from paper to solid.
-function toneCurves(sheet, solids) {
-  const curves = [];
-  for (const [ink, solid] of solids) {
-    const tints = new Map();
-    for (const patch of sheet.patches) {
-      const inks = tintsOf(sheet, patch);
-      if (patch.dot_area !== null && inks?.length === 1 && inks[0][0] === ink &&
-          !tints.has(inks[0][1]))
-        tints.set(inks[0][1], patch);
-    }
-    if (tints.size)
-      curves.push({ name: solid.name, rgb: solid.rgb, points: [
-        { nominal: 0, area: 0, gain: 0 },
-        ...[...tints].sort(([a], [b]) => a - b).map(([nominal, patch]) =>
-          ({ nominal, area: patch.dot_area, gain: patch.dot_gain })),
-        { nominal: 100, area: 100, gain: 0 }] });
-  }
-  return curves;
-}
+const toneCurves = (sheet, solids) => sheet.tone_values.map(({ ink, solid, values }) =>
+  ({ name: solid, rgb: solids.get(ink)?.rgb ?? 'gray', points: [
+    { nominal: 0, area: 0, gain: 0 },
+    ...values.map((value) =>
+      ({ nominal: value.nominal, area: value.dot_area, gain: value.dot_gain })),
+    { nominal: 100, area: 100, gain: 0 }] }));
 
 function keyFigures(sheet, solids) {
   const { paper } = sheet;
@@ -178,7 +165,7 @@ function columnsOf(sheet) {
   ];
 }
 
-function sheetSection(sheet, id) {
+function sheetSection(sheet, id, heading) {
   const solids = solidsOf(sheet);
   const curves = toneCurves(sheet, solids);
   const paperPatch = sheet.patches.find((patch) => patch.name === sheet.paper.name);
@@ -207,7 +194,7 @@ function sheetSection(sheet, id) {
   const { source } = sheet;
   return h('section', { class: 'sheet', id },
     h('header', {},
-      h('h2', {}, named(sheet.file)),
+      h(heading, {}, named(sheet.file)),
       h('p', { class: 'about' }, [
         count(sheet.patches.length, 'patch'),
         sheet.inks.length ? count(sheet.inks.length, 'ink') : null,
@@ -234,6 +221,7 @@ function sheetSection(sheet, id) {
 
 export function reportPage({ sheets }) {
   const overview = sheets.length < 2 ? null : h('section', {},
+    h('h1', {}, `${sheets.length} press sheets`),
     smallTable('Sheets', [
       { label: 'Sheet', text: ([sheet, i]) => h('a', { href: `#sheet-${i}` }, named(sheet.file)) },
       { label: 'Patches', number: true, text: ([sheet]) => sheet.patches.length.toLocaleString('en') },
@@ -242,7 +230,7 @@ export function reportPage({ sheets }) {
         text: ([sheet]) => fixed(largest(sheet.patches, 'dot_gain')?.dot_gain) },
     ], sheets.map((sheet, i) => [sheet, i])));
   return [
-    h('h1', {}, sheets.length > 1 ? `${sheets.length} press sheets` : 'Press sheet'),
-    overview, sheets.map((sheet, i) => sheetSection(sheet, `sheet-${i}`)),
+    overview,
+    sheets.map((sheet, i) => sheetSection(sheet, `sheet-${i}`, overview ? 'h2' : 'h1')),
   ];
 }

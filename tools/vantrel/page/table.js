@@ -54,7 +54,7 @@ export function searchTable({ caption, noun, columns, rows, rgb, text, onChoose 
   column.label)));
   const body = h('tbody');
   const status = h('p', { class: 'count', role: 'status' });
-  const search = h('input', { type: 'search', placeholder: 'Search names',
+  const search = h('input', { type: 'search', placeholder: 'Search',
     'aria-label': `Search: ${caption}`, oninput: () => {
       table.setGlobalFilter(search.value.trim().toLowerCase());
       table.firstPage();
