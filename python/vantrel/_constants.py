@@ -1,0 +1,103 @@
+"""What can be set, in this process, for all threads: do not set it while others compute."""
+
+import numpy as np
+
+from . import _ufuncs
+from ._ufuncs import get_num_illuminant_observers, get_num_responses, get_num_statuses  # noqa: F401
+
+den_weight = _ufuncs.den_weight
+
+
+def _doubles(value, size, name):
+    if value is None:
+        return None
+    array = np.ascontiguousarray(value, dtype=np.float64)
+    if array.shape != (size,):
+        raise ValueError(f"{name}: {size} values are needed, not the shape {array.shape}")
+    return array
+
+
+def _read(getter, *sizes):
+    arrays = [np.empty(size) for size in sizes]
+    getter(*arrays)
+    return tuple(arrays)
+
+
+def set_hifi_constants(wavelengths, shape1=None, shape2=None, shape3=None):
+    """Places the three HiFi bands and rebuilds their rows of `den_weight`.
+
+    `wavelengths`: three centres in nm, cut to their band; one outside 430 to below 680, or NaN,
+    leaves its band as it was. `shape1` to `shape3`: seven relative weights around each centre in
+    steps of 10 nm; None moves the centre alone.
+    """
+    if wavelengths is None:
+        raise ValueError("wavelengths: None is not accepted")
+    shapes = zip((shape1, shape2, shape3), ("shape1", "shape2", "shape3"))
+    _ufuncs.set_hifi_constants(
+        _doubles(wavelengths, 3, "wavelengths"), *[_doubles(s, 7, name) for s, name in shapes]
+    )
+
+
+def get_hifi_constants():
+    """The HiFi bands: (wavelengths in nm, shape1, shape2, shape3), shapes scaled to 1 in the centre."""
+    return _read(_ufuncs.get_hifi_constants, 3, 7, 7, 7)
+
+
+def set_hexachrome_constants(wavelengths, shape1=None, shape2=None):
+    """Places the two Hexachrome bands; as set_hifi_constants()."""
+    if wavelengths is None:
+        raise ValueError("wavelengths: None is not accepted")
+    _ufuncs.set_hexachrome_constants(
+        _doubles(wavelengths, 2, "wavelengths"),
+        _doubles(shape1, 7, "shape1"),
+        _doubles(shape2, 7, "shape2"),
+    )
+
+
+def get_hexachrome_constants():
+    """The Hexachrome bands: (wavelengths in nm, shape1, shape2)."""
+    return _read(_ufuncs.get_hexachrome_constants, 2, 7, 7)
+
+
+def _numbers(getter, count):
+    return tuple(float(array[0]) for array in _read(getter, *[1] * count))
+
+
+def _set(setter, getter, values, reason):
+    """Sets single numbers; the library refuses them all or none, which shows when they are read."""
+    if any(value is None for value in values):
+        raise ValueError("None is not accepted")
+    values = tuple(float(value) for value in values)
+    setter(*[np.array([value]) for value in values])
+    if getter() != values:
+        raise ValueError(reason)
+
+
+def set_spectralx_constants(tolerance, reserved, centre, inner, outer):
+    """Sets the SpectralX constants: tolerance of a peak, a reserved number, weights of the window."""
+    _set(
+        _ufuncs.set_spectralx_constants,
+        get_spectralx_constants,
+        (tolerance, reserved, centre, inner, outer),
+        "the weight of the centre must be 1, and no constant NaN",
+    )
+
+
+def get_spectralx_constants():
+    """The SpectralX constants: (tolerance, reserved, centre, inner, outer)."""
+    return _numbers(_ufuncs.get_spectralx_constants, 5)
+
+
+def set_achromatic_constants(L1, L2, C1, C2):
+    """Sets the line above which a colour is chromatic, through (L1, C1) and (L2, C2)."""
+    _set(
+        _ufuncs.set_achromatic_constants,
+        get_achromatic_constants,
+        (L1, L2, C1, C2),
+        "no finite line goes through these points",
+    )
+
+
+def get_achromatic_constants():
+    """The line of is_chromatic(): (L1, L2, C1, C2)."""
+    return _numbers(_ufuncs.get_achromatic_constants, 4)

@@ -1,0 +1,144 @@
+"""Densities under ten statuses, sets of them, and the response that reads an ink.
+
+ISO 5-3 and ISO 5-4: D = -log10 of the filter-weighted reflectance factor, at most 5. Where a paper
+is given, its own density is subtracted; None measures absolutely.
+"""
+
+from ._function import function
+
+
+@function("number")
+def get_num_status_responses(status: "StatusName"):
+    """How many responses a status measures; 0 for the two spectral statuses."""
+
+
+@function("weights", "first", "peak", "last")
+def get_normalized_density_weights(status: "StatusName", response: "ResponseName"):
+    """A filter scaled to a peak of 100: (weights, first, peak, last).
+
+    The last three are wavelengths in nm of the first weight that is not zero, of the largest and of
+    the last. A filter without a positive weight is refused.
+    """
+
+
+@function("density")
+def refl_to_density(
+    spectra: "Spectra", paper: "OptionalSpectra", status: "StatusName", response: "Reading"
+):
+    """Density (ISO 5-3, ISO 5-4) of spectra in percent, over a paper or absolute (None).
+
+    The response is 0 to 8; for SPECTRAL_STATUS a wavelength of 391 to 709 nm (the paper plays no
+    part); for SPECTRALX_STATUS a request of 0 to 30 as in calculate_spectralx_density().
+    """
+
+
+@function("refl")
+def refl_to_refl_density(spectra: "Spectra", status: "StatusName", response: "ResponseName"):
+    """Filter-weighted reflectance in percent, not below 0.001."""
+
+
+@function("densities")
+def refl_to_densities(spectra: "Spectra", paper: "OptionalSpectra", status: "StatusName"):
+    """Density sets: nine densities in the order of Response, 0 where the status has none.
+
+    The two spectral statuses give nine times the same density.
+    """
+
+
+@function("densities")
+def refl_to_densities_no_paper(spectra: "Spectra", status: "StatusName"):
+    """Density sets without a paper; as refl_to_densities()."""
+
+
+@function("response")
+def determine_density_response(
+    spectra: "Spectra", status: "StatusName", paper: "OptionalSpectra" = None
+):
+    """Which response reads these inks: the visual one for neutrals, else that of most density.
+
+    For SPECTRAL_STATUS a wavelength (420, 440, ... 700 nm), for SPECTRALX_STATUS a band (2 to 28;
+    0 for a neutral); 9 where the density set cannot be computed. Note the order of the arguments.
+    """
+
+
+@function("density")
+def calculate_spectral_density(refl: "Numbers"):
+    """Density -log10 of single reflectances in percent, at most 7."""
+
+
+@function("refl")
+def adjust_for_paper_refls(spectra: "Spectra", paper: "Spectra"):
+    """Spectra with their contrast against the paper exaggerated.
+
+    In every band the density above the paper is tripled, or doubled where it is more than 0.5.
+    """
+
+
+@function("density", "response")
+def find_density_max(densities: "Numbers", include_visual: "Integers"):
+    """The largest density above 0 of sets of nine, and its response: (density, response).
+
+    The lowest response on a tie; 0 and -1 where there is none. The visual density counts when
+    `include_visual` is not 0.
+    """
+
+
+@function("density", "response")
+def find_density_min(densities: "Numbers", include_visual: "Integers"):
+    """The smallest density below 100 of sets of nine that is not 0, and its response.
+
+    100 and -1 where there is none; otherwise as find_density_max().
+    """
+
+
+@function("densities")
+def calculate_ccr_densities(spectra: "Spectra", paper: "OptionalSpectra", status: "CCRStatus"):
+    """Density sets corrected for the overlap of the filters, under CCR1_STATUS or CCR2_STATUS.
+
+    Nine values: visual, red, green, blue and five zeros.
+    """
+
+
+@function("density", "band")
+def calculate_spectralx_density(
+    spectra: "Spectra", paper: "OptionalSpectra", request: "Integers"
+):
+    """Density of a five-band window: (density, band).
+
+    Request 2 to 28: at that band; 0: the visual density of Status T (band -1); any other: at the
+    absorption peak that borders the brightest stretch of the spectrum.
+    """
+
+
+@function("densities", "bands", "count")
+def find_max_density_points(spectra: "Spectra"):
+    """Absorption peaks in order of wavelength: (densities, bands, count).
+
+    Beyond the count, densities are NaN and bands -1. Band b lies at 400 + 10 b nm.
+    """
+
+
+@function("index")
+def choose_bp_wavelen(spectra: "Spectra", bands: "Integers", count: "Integers"):
+    """Index of the peak that borders the brightest stretch, on the side nearer to its crest.
+
+    Takes `bands` and `count` of find_max_density_points(); 0 for a band outside 0 to 30.
+    """
+
+
+@function("density")
+def calculate_special_density(spectra: "Spectra", centre: "Integers", weights: "Numbers"):
+    """Density of any window: `weights`, its middle one at band `centre`.
+
+    5 where the windowed sum is 0 or less; 0 for a window that reaches outside the spectrum.
+    """
+
+
+@function("chromatic")
+def is_chromatic(spectra: "Spectra", illum_obs: "Illuminant" = "D65_10DEG"):
+    """1 where spectra are chromatic, C* above a line over L* (get_achromatic_constants()), else 0."""
+
+
+@function("chromatic")
+def is_chromatic_lch(lch: "Colours"):
+    """1 where L*C*h are chromatic, else 0; as is_chromatic()."""

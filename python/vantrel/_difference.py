@@ -1,0 +1,139 @@
+"""Colour differences, and what a paper looks like."""
+
+from ._function import function
+
+
+@function("delta_e")
+def lab_to_de_lab(lab1: "Colours", lab2: "Colours"):
+    """CIE 1976 colour difference of two L*a*b* (CIE 15)."""
+
+
+@function("delta_h")
+def lab_to_dh(lab1: "Colours", lab2: "Colours"):
+    """Signed CIE 1976 hue difference (CIE 15).
+
+    Positive when the second hue lies from 0 up to and including 180 degrees counter-clockwise of
+    the first; chroma and hue are those of cielab_to_cielch().
+    """
+
+
+@function("delta_e")
+def lab_to_de94(sample: "Colours", reference: "Colours", kL: "Numbers" = 1, kC: "Numbers" = 1):
+    """CIE94 (CIE 116), kH = 1; the weights follow the chroma of the reference alone."""
+
+
+@function("delta_e")
+def cielch_to_de94(sample: "Colours", reference: "Colours", kL: "Numbers" = 1, kC: "Numbers" = 1):
+    """CIE94 of two L*C*h; as lab_to_de94() of their L*a*b*."""
+
+
+@function("delta_e")
+def lab_to_de2000(lab1: "Colours", lab2: "Colours", kL: "Numbers" = 1, kC: "Numbers" = 1):
+    """CIEDE2000 (CIE 142, ISO/CIE 11664-6) with kH = 1."""
+
+
+@function("delta_e")
+def lab_to_de2000_ex(
+    lab1: "Colours",
+    lab2: "Colours",
+    kL: "Numbers" = 1,
+    kC: "Numbers" = 1,
+    kH: "Numbers" = 1,
+):
+    """CIEDE2000 (CIE 142, ISO/CIE 11664-6) with all three parametric factors."""
+
+
+@function("delta_e")
+def lab_to_de_cmc(sample: "Colours", reference: "Colours", l: "Numbers" = 2, c: "Numbers" = 1):
+    """CMC(l:c) (ISO 105-J03); every weight follows the reference alone.
+
+    2:1 is for acceptability, 1:1 for perceptibility. A weight of 0 is refused.
+    """
+
+
+@function("index")
+def refl_to_din6172(
+    spectra1: "Spectra",
+    spectra2: "Spectra",
+    illum_obs1: "Illuminant",
+    illum_obs2: "Illuminant",
+):
+    """DIN 6172 metamerism index: how far the L*a*b* difference of a pair moves with the light."""
+
+
+@function("lightness", "colour1", "colour2")
+def verbal_color_difference(
+    standard: "Spectra",
+    sample: "Spectra",
+    illum_obs: "Illuminant" = "D50_2DEG",
+    selector: "Integers" = 0,
+):
+    """How samples differ from their standard, in words: (lightness, colour1, colour2).
+
+    Arrays of str, or str for a single pair. A coordinate that differs by no more than 0.5 is "On
+    Target"; the lightness is "Too Dark" or "Too Light". Selector 0 words a* and b* ("Too Green",
+    "Too Red"; "Too Blue", "Too Yellow"), 1 chroma and hue ("Too Dull", "Too Bright"; the hue that
+    the sample leans to); any other words the lightness alone and leaves the colours "".
+    """
+
+
+@function("delta_e")
+def ciede2000_calculate(
+    lab1: "Colours", lab2: "Colours", kL: "Numbers" = 1, kC: "Numbers" = 1, kH: "Numbers" = 1
+):
+    """lab_to_de2000_ex() in other words."""
+
+
+@function("zero")
+def ciede2000_is_zero(value: "Numbers", tolerance: "Numbers"):
+    """1 where the magnitude is at most the tolerance, else 0; NaN counts as zero."""
+
+
+@function("degrees")
+def ciede2000_convert_to_degrees(radians: "Numbers"):
+    """Angles in radians as degrees, negative ones counted from 360 downward."""
+
+
+@function("radians")
+def ciede2000_convert_to_radians(degrees: "Numbers"):
+    """Angles in degrees as radians."""
+
+
+class CIEDE2000:
+    """The CIEDE2000 formula and its helpers (CIE 142), under the names of the C++ class."""
+
+    calculate = staticmethod(ciede2000_calculate)
+    is_zero = staticmethod(ciede2000_is_zero)
+    convert_to_degrees = staticmethod(ciede2000_convert_to_degrees)
+    convert_to_radians = staticmethod(ciede2000_convert_to_radians)
+
+
+@function("brightness")
+def refl_to_brightness(spectra: "Spectra"):
+    """Blue-weighted brightness in percent, 400 to 520 nm, in the manner of the R457 of ISO 2470."""
+
+
+@function("metamerism")
+def metamerism(
+    standard: "Spectra",
+    sample: "Spectra",
+    illum_obs1: "Illuminant",
+    illum_obs2: "Illuminant",
+):
+    """The CIE 1976 difference of a pair under one illuminant plus that under another.
+
+    refl_to_din6172() tells how far the difference moves.
+    """
+
+
+@function("whiteness")
+def refl_to_white_e313_98(spectra: "Spectra", illum_obs: "WhitenessIlluminant" = "D50_2DEG"):
+    """Whiteness index of ASTM E313-98, for illuminants C, D50 and D65.
+
+    Refused: a whiteness W outside 40 < W < 5 Y - 280, which describes no white, and black.
+    """
+
+
+@function("whiteness")
+def cie_yxy_to_white_e313_98(Yxy: "Colours", illum_obs: "WhitenessIlluminant" = "D50_2DEG"):
+    """Whiteness of Y, x, y as refl_to_cie_yxy() gives them; as refl_to_white_e313_98()."""

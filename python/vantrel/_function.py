@@ -1,0 +1,189 @@
+"""Makes a function of the package from its declaration: arguments, documentation, dispatch."""
+
+import functools
+import inspect
+
+import numpy as np
+
+from . import _ufuncs
+from ._arguments import check_core, check_reading, convert, is_from, is_lazy
+
+WORDS = {"verbal_color_difference": np.array(_ufuncs.difference_words)}
+
+_OUT = """
+    `out`: array, or tuple of arrays, that takes the result (not for Dask and xarray)."""
+_OK = """
+    `ok`: with `ok=True` a last output tells which rows the library accepted; a refused row is NaN
+    (-1 in integers) either way."""
+
+
+class Declared:
+    """One function: its ufuncs, and the names of its outputs."""
+
+    def __init__(self, declaration, outputs):
+        self.name = declaration.__name__
+        self.outputs = outputs
+        self.parameters = list(inspect.signature(declaration).parameters.values())
+        self.ufunc = getattr(_ufuncs, self.name)
+        self.flagged = getattr(_ufuncs, self.name + "_ok", None)
+        self.signature = _signature(self.ufunc)
+        inputs, _, results = self.signature.partition("->")
+        self.cores = _cores(inputs)
+        self.result_cores = _cores(results)
+        self.names = [p.name for p in self.parameters]
+        self.kinds = [p.annotation for p in self.parameters]
+        self.defaults = {p.name: p.default for p in self.parameters if p.default is not p.empty}
+
+    def bind(self, args, kwargs):
+        """The arguments in order, defaults filled in."""
+        if len(args) > len(self.names):
+            raise TypeError(f"{self.name}() takes {len(self.names)} arguments, not {len(args)}")
+        values = list(args)
+        for name in self.names[len(args):]:
+            if name in kwargs:
+                values.append(kwargs.pop(name))
+            elif name in self.defaults:
+                values.append(self.defaults[name])
+            else:
+                raise TypeError(f"{self.name}() needs the argument {name!r}")
+        if kwargs:
+            wrong = next(iter(kwargs))
+            given = "twice" if wrong in self.names else "an unknown argument"
+            raise TypeError(f"{self.name}() was given {wrong!r}: {given}")
+        return values
+
+    def prepare(self, values):
+        values = [convert(*three) for three in zip(self.kinds, values, self.names)]
+        for value, core, kind, name in zip(values, self.cores, self.kinds, self.names):
+            if core:
+                check_core(value, core, kind, name)
+        if "Reading" in self.kinds:
+            reading = self.kinds.index("Reading")
+            status = values[self.names.index("status")]
+            if not is_lazy(status) and not is_lazy(values[reading]):
+                check_reading(status, values[reading], self.names[reading])
+        return values
+
+
+def _signature(ufunc):
+    """NumPy forgets the signature of a ufunc without a core."""
+    nothing = ",".join(["()"] * ufunc.nin) + "->" + ",".join(["()"] * ufunc.nout)
+    return ufunc.signature or nothing
+
+
+def _cores(signature):
+    """The core dimensions of "(n,31),()" as [["n", "31"], []]."""
+    return [[d for d in core.split(",") if d] for core in signature[1:-1].split("),(")]
+
+
+_DECLARED = {}
+
+
+def evaluate(name, ok, *values, out=None, missing=()):
+    """Runs the ufunc of a function on NumPy arrays; `missing` are spectra that were not handed on."""
+    declared = _DECLARED[name]
+    for index in missing:
+        values = values[:index] + (np.empty(0),) + values[index:]
+    ufunc = declared.flagged if ok else declared.ufunc
+    if out is None:
+        results = ufunc(*values)
+    else:
+        outs = out if isinstance(out, tuple) else (out,)
+        results = ufunc(*values, out=outs + (None,) * (ufunc.nout - len(outs)))
+    words = WORDS.get(name)
+    if words is None:
+        return results
+    texts = tuple(words[np.maximum(r, 0)] for r in results[:3])
+    return tuple(t if np.ndim(t) else str(t) for t in texts) + results[3:]
+
+
+def _result_types(declared, ok):
+    """(names of the core dimensions, type) of each output."""
+    types = (declared.flagged if ok else declared.ufunc).types[0].partition("->")[2]
+    dtypes = [np.dtype(t) for t in types]
+    if declared.name in WORDS:
+        dtypes[:3] = [WORDS[declared.name].dtype] * 3
+    cores = declared.result_cores + ([[]] if ok else [])
+    return cores, dtypes
+
+
+def _on_dask(declared, values, ok):
+    import dask.array as da
+
+    cores, dtypes = _result_types(declared, ok)
+    # Dask knows no core of no values
+    missing = tuple(i for i, value in enumerate(values) if np.shape(value) == (0,))
+    given = [i for i in range(len(values)) if i not in missing]
+
+    def group(cores):
+        return ",".join("(" + ",".join(f"core{d}" for d in core) + ")" for core in cores)
+
+    return da.apply_gufunc(
+        functools.partial(evaluate, declared.name, ok, missing=missing),
+        group([declared.cores[i] for i in given]) + "->" + group(cores),
+        *[values[i] for i in given],
+        output_dtypes=dtypes if len(dtypes) > 1 else dtypes[0],
+        output_sizes={f"core{d}": int(d) for core in cores for d in core},
+        allow_rechunk=True,
+    )
+
+
+def _on_xarray(declared, values, ok):
+    import xarray as xr
+
+    cores_in, spectral = [], "band"
+    for value, core in zip(values, declared.cores):
+        dims = core
+        if core and is_from("xarray", value):
+            dims = list(value.dims[-len(core):])
+            spectral = dims[-1] if core[-1] == "31" else spectral
+        cores_in.append(dims)
+
+    def dims_out(core, name):
+        return [spectral if size == "31" else name for size in core]
+
+    cores, _ = _result_types(declared, ok)
+    cores_out = [dims_out(*pair) for pair in zip(cores, declared.outputs + ["ok"])]
+    return xr.apply_ufunc(
+        functools.partial(_dispatch, declared, ok=ok),
+        *values,
+        input_core_dims=cores_in,
+        output_core_dims=cores_out,
+        dask="allowed",
+    )
+
+
+def _dispatch(declared, *values, ok=False, out=None):
+    for library, run in ("xarray", _on_xarray), ("dask", _on_dask):
+        if any(is_from(library, value) for value in values):
+            if out is not None:
+                raise TypeError(f"{declared.name}(): out= is for NumPy arrays, not {library}")
+            return run(declared, values, ok)
+    return evaluate(declared.name, ok, *values, out=out)
+
+
+def function(*outputs):
+    """Makes the function that a declaration (name, parameters, documentation) describes."""
+
+    def make(declaration):
+        declared = _DECLARED[declaration.__name__] = Declared(declaration, list(outputs))
+
+        @functools.wraps(declaration)
+        def call(*args, out=None, ok=False, **kwargs):
+            if ok and declared.flagged is None:
+                raise TypeError(f"{declared.name}() refuses no row and has no ok=")
+            values = declared.prepare(declared.bind(args, kwargs))
+            return _dispatch(declared, *values, ok=bool(ok), out=out)
+
+        text = inspect.cleandoc(declaration.__doc__)
+        shapes = f"Shapes: {declared.signature}, broadcast as NumPy does."
+        source = f"C function: {_ufuncs.c_names[declared.name]}."
+        more = inspect.cleandoc(_OUT + (_OK if declared.flagged else ""))
+        call.__doc__ = f"{text}\n\n{shapes} {source}\n\n{more}"
+        extra = [inspect.Parameter("out", inspect.Parameter.KEYWORD_ONLY, default=None)]
+        if declared.flagged:
+            extra.append(inspect.Parameter("ok", inspect.Parameter.KEYWORD_ONLY, default=False))
+        call.__signature__ = inspect.Signature(declared.parameters + extra)
+        return call
+
+    return make
