@@ -151,6 +151,14 @@ double calculate_special_density(const double *refl, int centre, Count width, co
     return CalculateSpecialDensity(refl, centre, window, width.n);
 }
 
+bool is_chromatic(const double *refl, int illum_obs)
+{
+    return IsChromatic(refl, static_cast<uint8_t>(illum_obs < 0
+                                                      ? NUM_ILLUM_OBS
+                                                      : std::min<int>(illum_obs, NUM_ILLUM_OBS)));
+}
+bool is_chromatic_lch(const double *lch) { return IsChromaticLCH(lch); }
+
 constexpr Row kRows[] = {
     RESULT(GetNumStatusResponses, "get_num_status_responses", "()->()"),
     ROW(GetNormalizedDensityWeights, "get_normalized_density_weights", "(),()->(31),(),(),()"),
@@ -174,8 +182,8 @@ constexpr Row kRows[] = {
                                             "(31),(n),()->()"),
     row<calculate_special_density, Returns::result>("CalculateSpecialDensity",
                                                     "calculate_special_density", "(31),(),(n)->()"),
-    RESULT(IsChromatic, "is_chromatic", "(31),()->()"),
-    RESULT(IsChromaticLCH, "is_chromatic_lch", "(3)->()"),
+    row<is_chromatic, Returns::result>("IsChromatic", "is_chromatic", "(31),()->()"),
+    row<is_chromatic_lch, Returns::result>("IsChromaticLCH", "is_chromatic_lch", "(3)->()"),
     ROW(DensityToDotArea, "density_to_dot_area", "(),(),()->()"),
     ROW(DensityFromDotArea, "density_from_dot_area", "(),(),()->()"),
     row<refl_to_dot_area>("ReflToDotArea", "refl_to_dot_area", "(31),(31),(p),(),(),()->()"),

@@ -45,9 +45,12 @@ template <int (*function)()> PyObject *number(PyObject *, PyObject *)
 }
 
 PyMethodDef methods[] = {
-    {"get_num_illuminant_observers", number<GetNumIlluminantObservers>, METH_NOARGS, nullptr},
-    {"get_num_statuses", number<GetNumStatuses>, METH_NOARGS, nullptr},
-    {"get_num_responses", number<GetNumResponses>, METH_NOARGS, nullptr},
+    {"get_num_illuminant_observers", number<GetNumIlluminantObservers>, METH_NOARGS,
+     "get_num_illuminant_observers()\n--\n\nThe number of illuminant/observer combinations, 18."},
+    {"get_num_statuses", number<GetNumStatuses>, METH_NOARGS,
+     "get_num_statuses()\n--\n\nThe number of density statuses, 10."},
+    {"get_num_responses", number<GetNumResponses>, METH_NOARGS,
+     "get_num_responses()\n--\n\nThe number of density responses, 9."},
     {"set_hifi_constants", Constants<SetHiFiConstants>::method, METH_VARARGS, nullptr},
     {"get_hifi_constants", Constants<GetHiFiConstants>::method, METH_VARARGS, nullptr},
     {"set_hexachrome_constants", Constants<SetHexachromeConstants>::method, METH_VARARGS, nullptr},

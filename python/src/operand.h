@@ -56,10 +56,10 @@ template <class Element> constexpr char type_number()
         return NPY_DOUBLE;
     else if constexpr (std::is_same_v<Element, float>)
         return NPY_FLOAT;
-    else if constexpr (std::is_same_v<Element, long long>)
-        return NPY_INT64;
     else if constexpr (std::is_same_v<Element, int>)
         return NPY_INT;
+    else if constexpr (std::is_same_v<Element, bool>)
+        return NPY_BOOL;
     else {
         static_assert(std::is_same_v<Element, unsigned>);
         return NPY_UINT;
@@ -94,9 +94,6 @@ template <class P> struct Argument : Operand {
     {
         if constexpr (std::is_floating_point_v<P>)
             return *reinterpret_cast<const double *>(row);
-        else if constexpr (std::is_same_v<P, uint8_t>)
-            return static_cast<P>(std::clamp(*reinterpret_cast<npy_int64 *>(row), //
-                                             npy_int64{-1}, npy_int64{NUM_ILLUM_OBS}));
         else
             return static_cast<P>(saturated(*reinterpret_cast<const npy_int64 *>(row)));
     }

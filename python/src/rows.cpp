@@ -35,7 +35,7 @@ double ciede2000(const CIELABCOORD *first, const CIELABCOORD *second, double kL,
 {
     return CIEDE2000().Calculate(*first, *second, kL, kC, kH);
 }
-int ciede2000_is_zero(double value, double tolerance)
+bool ciede2000_is_zero(double value, double tolerance)
 {
     return CIEDE2000().IsZero(value, tolerance);
 }

@@ -49,19 +49,9 @@ def find(c_name):
 
 def exported_names():
     for symbol in (REPOSITORY / "src/exports.txt").read_text().split():
-        parts = re.findall(r"\d+([A-Za-z][A-Za-z0-9]*?)(?=\d|E|[CD][12]E|P|R|d|i|b|v)", symbol)
-        if symbol.startswith("_ZN9CIEDE2000"):
-            rest = symbol.removeprefix("_ZN9CIEDE2000")
-            length = re.match(r"\d+", rest)
-            yield "CIEDE2000::" + (
-                rest[length.end():][: int(length[0])] if length else rest[:2]
-            )
-        elif symbol.startswith("_Z"):
-            length = re.match(r"\d+", symbol[2:])
-            yield symbol[2 + length.end():][: int(length[0])]
-        else:
-            assert not parts or symbol.isidentifier()
-            yield symbol
+        scope, length, rest = re.match(r"(?:_Z(N9CIEDE2000)?(\d*))?(.*)", symbol).groups()
+        name = rest[: int(length)] if length else rest.removesuffix("Ev")
+        yield f"CIEDE2000::{name}" if scope else name
 
 
 def values(literal, names):

@@ -21,18 +21,19 @@ def is_lazy(value):
 
 
 def as_array(value, name):
-    """Anything that NumPy does not take as it is, a list say, as an array."""
-    if hasattr(value, "__array_ufunc__") or isinstance(value, (int, float)):
+    """An array of numbers; a list, say, becomes one of NumPy."""
+    if isinstance(value, (int, float)):
         return value
-    array = np.asarray(value)
-    if array.dtype == object:
-        raise ValueError(f"{name}: numbers are needed, not {type(value).__name__}")
-    return array
+    if not hasattr(value, "__array_ufunc__"):
+        value = np.asarray(value)
+    if value.dtype.kind not in "fiub":
+        raise ValueError(f"{name}: numbers are needed, not {value.dtype}")
+    return value
 
 
 def as_integers(value, name):
     value = as_array(value, name)
-    kind = np.asarray(value).dtype.kind if not hasattr(value, "dtype") else value.dtype.kind
+    kind = value.dtype.kind if hasattr(value, "dtype") else np.asarray(value).dtype.kind
     if kind in "iub":
         return value
     if kind != "f" or not (is_lazy(value) or np.all(np.trunc(value) == value)):

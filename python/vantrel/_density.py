@@ -136,9 +136,9 @@ def calculate_special_density(spectra: "Spectra", centre: "Integers", weights: "
 
 @function("chromatic")
 def is_chromatic(spectra: "Spectra", illum_obs: "Illuminant" = "D65_10DEG"):
-    """1 where spectra are chromatic, C* above a line over L* (get_achromatic_constants()), else 0."""
+    """Whether spectra are chromatic: C* above a line over L*, get_achromatic_constants()."""
 
 
 @function("chromatic")
 def is_chromatic_lch(lch: "Colours"):
-    """1 where L*C*h are chromatic, else 0; as is_chromatic()."""
+    """Whether L*C*h are chromatic; as is_chromatic()."""

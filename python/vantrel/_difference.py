@@ -86,7 +86,7 @@ def ciede2000_calculate(
 
 @function("zero")
 def ciede2000_is_zero(value: "Numbers", tolerance: "Numbers"):
-    """1 where the magnitude is at most the tolerance, else 0; NaN counts as zero."""
+    """Whether the magnitude is at most the tolerance; NaN counts as zero."""
 
 
 @function("degrees")

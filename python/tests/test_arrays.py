@@ -1,0 +1,165 @@
+"""What NumPy users expect of the functions: any shape, layout and type, and clear refusals."""
+
+import warnings
+from concurrent.futures import ThreadPoolExecutor
+
+import numpy as np
+import pytest
+
+import vantrel
+
+RANDOM = np.random.default_rng(7)
+SPECTRA = RANDOM.uniform(1, 99, (6, 5, 31))
+PAPER = np.linspace(80, 90, 31)
+
+
+def row_by_row(function, array):
+    return np.array([[function(row) for row in rows] for rows in array])
+
+
+@pytest.mark.parametrize(
+    "lay_out",
+    [
+        np.asfortranarray,
+        lambda a: np.repeat(a, 3, axis=2)[..., ::3],
+        lambda a: a[::-1, :, ::-1].copy()[::-1, :, ::-1],
+        lambda a: np.moveaxis(np.moveaxis(a, 2, 0).copy(), 0, 2),
+        lambda a: a.astype(">f8"),
+        lambda a: np.frombuffer(b"\0" + a.tobytes(), "u1")[1:].view("f8").reshape(a.shape),
+    ],
+    ids=["fortran", "every third", "backwards", "bands first", "big-endian", "unaligned"],
+)
+def test_memory_layout_changes_no_bit(lay_out):
+    laid_out = lay_out(SPECTRA)
+    expected = row_by_row(vantrel.refl_to_cielab, SPECTRA)
+    assert np.array_equal(vantrel.refl_to_cielab(laid_out), expected)
+    out = np.full((5, 3, 6), np.nan).transpose(2, 0, 1)
+    assert vantrel.refl_to_cielab(laid_out, out=out) is out
+    assert np.array_equal(out, expected)
+    weights = np.asfortranarray(RANDOM.uniform(1, 2, (4, 31)))
+    targets = np.broadcast_to([1.0, 2.0, 3.0, 4.0], (6, 5, 4))
+    assert np.array_equal(
+        vantrel.pol_refl_auto_adjust(laid_out, targets, weights),
+        vantrel.pol_refl_auto_adjust(SPECTRA, targets.copy(), weights.copy(order="C")),
+    )
+
+
+def test_everything_broadcasts():
+    statuses = [["E"], ["T"]]
+    densities = vantrel.refl_to_density(SPECTRA[0, 0], PAPER, statuses, ["RED", "BLUE", "VISUAL"])
+    assert densities.shape == (2, 3)
+    assert densities[1, 1] == vantrel.refl_to_density(
+        SPECTRA[0, 0], PAPER, vantrel.Status.T_STATUS, vantrel.Response.BLUE_RESPONSE
+    )
+    lab = vantrel.refl_to_cielab(SPECTRA, np.arange(5))
+    assert np.array_equal(lab[:, 3], vantrel.refl_to_cielab(SPECTRA[:, 3], "C_10DEG"))
+    delta_e = vantrel.lab_to_de2000(lab[:, None], lab[None, :], kL=[1, 1, 2, 2, 3])
+    assert delta_e.shape == (6, 6, 5) and np.all(np.diagonal(delta_e) == 0)
+    inks, percent = SPECTRA[0, :2], [[[100, 0]], [[50, 50]]]
+    assert vantrel.estimate_refls(inks, percent, SPECTRA[0]).shape == (2, 5, 31)
+    assert vantrel.find_max_density_points(SPECTRA)[2].shape == (6, 5)
+    assert vantrel.refl_to_xyz(np.empty((0, 31))).shape == (0, 3)
+    assert vantrel.refl_to_density(SPECTRA[:, :0], None, "E", 1).shape == (6, 0)
+
+
+def test_single_precision_is_a_cast_on_the_way_in_and_out():
+    single = SPECTRA.astype(np.float32)
+    exact = vantrel.refl_to_density(single.astype(np.float64), PAPER, "E", "GREEN")
+    assert np.array_equal(vantrel.refl_to_density(single, PAPER, "E", "GREEN"), exact)
+    out = np.empty(exact.shape, np.float32)
+    vantrel.refl_to_density(single, PAPER, "E", "GREEN", out=out)
+    assert np.array_equal(out, exact.astype(np.float32))
+    assert np.array_equal(vantrel.refl_to_xyz([50] * 31), vantrel.refl_to_xyz([50.0] * 31))
+
+
+def test_out_may_be_an_input_and_a_tuple():
+    lab = vantrel.refl_to_cielab(SPECTRA)
+    there_and_back = lab.copy()
+    vantrel.cielab_to_cielch_ex(there_and_back, 0, out=there_and_back)
+    assert np.array_equal(there_and_back, vantrel.cielab_to_cielch_ex(lab, 0))
+    grayness, hue_error = np.empty((2, 6, 5))
+    vantrel.refl_to_hue_gray(SPECTRA, PAPER, "E", out=(grayness, hue_error))
+    assert np.array_equal((grayness, hue_error), vantrel.refl_to_hue_gray(SPECTRA, PAPER, "E"))
+
+
+def test_a_refused_row_is_nan_without_a_warning():
+    rows = SPECTRA[0].copy()
+    rows[2] = 0
+    with warnings.catch_warnings(), np.errstate(all="raise"):
+        warnings.simplefilter("error")
+        Yxy, ok = vantrel.refl_to_cie_yxy(rows, ok=True)
+        vantrel.refl_to_density(rows * 1e300, PAPER * np.nan, "E", 1)
+        vantrel.density_to_dot_area(rows[:, 0], np.inf, [1, 0, -0.0, np.nan, 1e-300])
+    assert ok.tolist() == [True, True, False, True, True]
+    assert np.isnan(Yxy).all(axis=-1).tolist() == [False, False, True, False, False]
+    out = np.zeros_like(Yxy)
+    result, ok = vantrel.refl_to_cie_yxy(rows, out=out, ok=True)
+    assert result is out and np.isnan(out[2]).all() and ok.dtype == bool
+    refl, first, peak, last = vantrel.get_normalized_density_weights("A", ["RED", "HIFI1"])
+    assert np.isnan(refl[1]).all() and not np.isnan(peak[0])
+
+
+@pytest.mark.parametrize(
+    "call, reason",
+    [
+        (lambda: vantrel.refl_to_xyz(SPECTRA[..., :30]), "spectra.* 31 bands .* not 30"),
+        (lambda: vantrel.refl_to_xyz(50.0), "spectra: 1 dimensions"),
+        (lambda: vantrel.refl_to_xyz(SPECTRA, "D51_2DEG"), "illum_obs: .*D51_2DEG.*D50_2DEG"),
+        (lambda: vantrel.refl_to_xyz(SPECTRA, [4, 18, 4, 4, 4]), "illum_obs: 18 is not one of"),
+        (lambda: vantrel.refl_to_xyz(SPECTRA, 4.5), "whole numbers"),
+        (lambda: vantrel.refl_to_xyz(None), "spectra: None"),
+        (lambda: vantrel.refl_to_xyz(["a"] * 31), "spectra: numbers"),
+        (lambda: vantrel.refl_to_density(SPECTRA, PAPER[1:], "E", 1), "paper.* 31"),
+        (lambda: vantrel.refl_to_density(SPECTRA, None, "SPECTRAL", 390), "390 .* 391 to 709"),
+        (lambda: vantrel.refl_to_density(SPECTRA, None, ["E", "T"], 9), "shape|9 is not from 0"),
+        (lambda: vantrel.refl_to_density(SPECTRA, None, -1, 1), "status: -1"),
+        (lambda: vantrel.refl_to_hue_gray(SPECTRA, None, "SPECTRALX"), "status: 5 is not"),
+        (lambda: vantrel.refl_to_white_e313_98(SPECTRA, "A_2DEG"), "illum_obs: 0 is not"),
+        (lambda: vantrel.estimate_refls(SPECTRA[0], [1] * 5, PAPER), "inks: one to three"),
+        (lambda: vantrel.estimate_refls(SPECTRA[0, :2], [50, 5.5], PAPER), "percent: whole"),
+        (lambda: vantrel.lab_to_de_lab(SPECTRA[..., :3], np.ones((4, 3))), "broadcast"),
+        (lambda: vantrel.set_spectralx_constants(2, 84, 1.5, 0.5, 0.1), "centre must be 1"),
+        (lambda: vantrel.set_achromatic_constants(50, 50, 3, 11), "no finite line"),
+        (lambda: vantrel.set_hifi_constants([500, 510]), "wavelengths: 3 values"),
+    ],
+)
+def test_a_wrong_call_says_why(call, reason):
+    with pytest.raises(ValueError, match=reason):
+        call()
+
+
+def test_threads_run_side_by_side_and_agree():
+    spectra = RANDOM.uniform(1, 99, (20_000, 31))
+    expected = vantrel.refl_to_cielab(spectra)
+    with ThreadPoolExecutor(8) as pool:
+        for result in pool.map(vantrel.refl_to_cielab, [spectra] * 16):
+            assert np.array_equal(result, expected)
+
+
+def test_den_weight_is_the_table_that_densities_read():
+    row = vantrel.den_weight[vantrel.Status.I_STATUS, vantrel.Response.RED_RESPONSE]
+    kept = row.copy()
+    before = vantrel.refl_to_density(SPECTRA, None, "I", "RED")
+    try:
+        row[:] = vantrel.den_weight[vantrel.Status.E_STATUS, vantrel.Response.RED_RESPONSE]
+        after = vantrel.refl_to_density(SPECTRA, None, "I", "RED")
+    finally:
+        row[:] = kept
+    assert np.array_equal(after, vantrel.refl_to_density(SPECTRA, None, "E", "RED"))
+    assert not np.array_equal(before, after)
+
+
+def test_words_are_strings():
+    words = vantrel.verbal_color_difference(PAPER, PAPER * 0.9)
+    assert words == ("Too Dark", "On Target", "On Target") and type(words[0]) is str
+    lightness, colour1, colour2, ok = vantrel.verbal_color_difference(PAPER, SPECTRA, 4, 2, ok=True)
+    assert lightness.shape == (6, 5) and lightness.dtype.kind == "U" and ok.all()
+    assert set(colour1.flat) == {""} == set(colour2.flat)
+
+
+def test_every_function_documents_itself():
+    functions = {name: getattr(vantrel, name) for name in dir(vantrel) if name[0].islower()}
+    for name, function in functions.items():
+        if callable(function):
+            assert len(function.__doc__) > 40, name
+    assert "(31),()->(3)" in vantrel.refl_to_xyz.__doc__
