@@ -12,8 +12,6 @@ where a chromaticity is asked for, is NaN, and `ok=True` adds an output that tel
 accepted.
 """
 
-from importlib.metadata import version as _version
-
 from . import _ufuncs as ufuncs
 from ._enums import IllumObs, Response, Status
 from ._colour import (
@@ -135,4 +133,4 @@ from ._constants import (
     set_spectralx_constants,
 )
 
-__version__ = _version("vantrel")
+__version__ = ufuncs.version
