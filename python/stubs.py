@@ -2,6 +2,7 @@
 
 import enum
 import inspect
+import textwrap
 from pathlib import Path
 
 import vantrel
@@ -43,9 +44,7 @@ def declaration(name, function):
     elif name.startswith("set_"):
         result = "None"
     line = f"def {name}({', '.join(parameters)}) -> {result}: ..."
-    if len(line) > 100:
-        line = f"def {name}(\n" + "".join(f"    {p},\n" for p in parameters) + f") -> {result}: ..."
-    return line
+    return textwrap.fill(line, 96, subsequent_indent="    ", break_long_words=False)
 
 
 def stubs():
