@@ -7,6 +7,7 @@ build_packages=(cmake ninja-build g++ pkg-config
 fuzz_packages=(clang libclang-rt-14-dev)
 page_packages=(npm)
 test_packages=(chromium libgtest-dev clang clang-tidy clang-format doxygen binutils)
+python_packages=(cmake ninja-build g++ python3-dev python3-venv)
 
 # npm may have come with a node that is not Debian's, which Debian's npm would drive out. Debian's is
 # some 400 small packages.
@@ -43,4 +44,14 @@ build() {
     shift
     cmake --preset "$preset"
     cmake --build --preset "$preset" "$@"
+}
+
+# Makes a Python environment in a folder, and installs packages into it. The package of this
+# repository is built in the same folder, where what is up to date is not built again.
+python_environment() {
+    local folder=$1
+    shift
+    [[ -x $folder/bin/python ]] || python3 -m venv "$folder"
+    "$folder/bin/pip" install --quiet --disable-pip-version-check \
+        --config-settings=build-dir="$PWD/$folder/cmake" "$@"
 }
