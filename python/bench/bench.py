@@ -1,0 +1,215 @@
+"""Measures the package beside other packages and beside C, in one run. scripts/bench-python runs it.
+
+Every row takes turns with its rival; what is compared are the medians of the turns, per row of the
+arrays. Rows run on one processor, save where two are the point.
+"""
+
+import argparse
+import ctypes
+import os
+import platform
+import statistics
+import subprocess
+import sys
+import time
+import warnings
+from concurrent.futures import ThreadPoolExecutor
+from importlib.metadata import version
+
+import numpy as np
+
+import vantrel
+
+with warnings.catch_warnings():
+    warnings.simplefilter("ignore")  # of what it can do without
+    import colour
+from colormath.color_objects import SpectralColor
+from colormath.density import ansi_density
+from colormath.density_standards import ANSI_STATUS_T_GREEN
+
+RANDOM = np.random.default_rng(1)
+PAPER = np.linspace(80, 90, 31)
+ALL_PROCESSORS = os.sched_getaffinity(0)
+
+
+def turns(ours, theirs, rounds):
+    """Medians of the seconds that two calls take, by turns, after one of each to warm up."""
+    times = ([], [])
+    for round in range(rounds + 1):
+        for call, taken in zip((ours, theirs), times):
+            start = time.perf_counter()
+            call()
+            if round:
+                taken.append(time.perf_counter() - start)
+    return [statistics.median(taken) for taken in times]
+
+
+def report(name, rows, ours, beside, theirs, goal, rounds=15, their_rows=None, at_least=False):
+    mine, other = turns(ours, theirs, rounds)
+    mine, other = mine / rows * 1e9, other / (their_rows or rows) * 1e9
+    ratio = other / mine if at_least else mine / other
+    missed = ratio < goal if at_least else ratio > goal
+    sign = "≥" if at_least else "≤"
+    print(
+        f"| {name} | {mine:.1f} | {beside} | {other:.1f} | {ratio:.3g} | {sign} {goal}"
+        f"{' missed' if missed else ''} |",
+        flush=True,
+    )
+
+
+def pointer(array):
+    return array.ctypes.data_as(ctypes.c_void_p)
+
+
+def colorimetry(c):
+    shape = colour.SpectralShape(400, 700, 10)
+    observer = colour.MSDS_CMFS["CIE 1931 2 Degree Standard Observer"].copy().align(shape)
+    d50 = colour.SDS_ILLUMINANTS["D50"].copy().align(shape)
+    for rows in 10_000, 1_000_000:
+        spectra, out = RANDOM.uniform(1, 99, (rows, 31)), np.empty((rows, 3))
+        rounds = 101 if rows < 100_000 else 11
+        name = f"`refl_to_xyz`, {rows:,} spectra"
+        report(
+            name,
+            rows,
+            lambda: vantrel.refl_to_xyz(spectra, "D50_2DEG"),
+            "colour-science, `msds_to_XYZ_integration`",
+            lambda: colour.colorimetry.msds_to_XYZ_integration(
+                spectra, observer, d50, shape=shape
+            ),
+            0.25,
+            rounds,
+        )
+        report(
+            name + ", `out=`",
+            rows,
+            lambda: vantrel.refl_to_xyz(spectra, "D50_2DEG", out=out),
+            "C loop",
+            lambda: c.loop_xyz(pointer(spectra), rows, 4, pointer(out)),
+            1.15,
+            rounds,
+        )
+
+
+def difference(c):
+    rows = 100_000
+    lab1, lab2 = RANDOM.uniform([0, -90, -90], [100, 90, 90], (2, rows, 3))
+    out = np.empty(rows)
+    report(
+        "`lab_to_de2000`, 100,000 pairs",
+        rows,
+        lambda: vantrel.lab_to_de2000(lab1, lab2),
+        "colour-science, `delta_E_CIE2000`",
+        lambda: colour.difference.delta_E_CIE2000(lab1, lab2),
+        0.5,
+    )
+    report(
+        "`lab_to_de2000`, 100,000 pairs, `out=`",
+        rows,
+        lambda: vantrel.lab_to_de2000(lab1, lab2, out=out),
+        "C loop",
+        lambda: c.loop_de2000(pointer(lab1), pointer(lab2), rows, pointer(out)),
+        1.15,
+    )
+
+
+def density(c):
+    rows, few = 100_000, 500
+    spectra, out = RANDOM.uniform(1, 99, (rows, 31)), np.empty(rows)
+    names = [f"spec_{nm}nm" for nm in range(400, 701, 10)]
+
+    def colormath():
+        for row in spectra[:few]:
+            color = SpectralColor(**dict(zip(names, map(str, row / 100))))
+            ansi_density(color, ANSI_STATUS_T_GREEN)
+
+    report(
+        "`refl_to_density`, 100,000 spectra",
+        rows,
+        lambda: vantrel.refl_to_density(spectra, None, "T", "GREEN"),
+        "python-colormath, `ansi_density`, spectrum by spectrum",
+        colormath,
+        0.005,
+        their_rows=few,
+    )
+    report(
+        "`refl_to_density`, over a paper, `out=`",
+        rows,
+        lambda: vantrel.refl_to_density(spectra, PAPER, "T", "GREEN", out=out),
+        "C loop",
+        lambda: c.loop_density(pointer(spectra), pointer(PAPER), rows, 3, 2, pointer(out)),
+        1.15,
+    )
+
+
+def two_processors():
+    """A large image on two threads, and on two workers of Dask, against one thread."""
+    import dask
+    import dask.array as da
+
+    image = RANDOM.uniform(1, 99, (1000, 1000, 31))
+    rows = 1_000_000
+    os.sched_setaffinity(0, ALL_PROCESSORS)
+    with ThreadPoolExecutor(2) as pool:
+        for name, call in (
+            ("`refl_to_xyz`", lambda part: vantrel.refl_to_xyz(part, "D50_2DEG")),
+            ("`refl_to_density`", lambda part: vantrel.refl_to_density(part, PAPER, "E", "GREEN")),
+        ):
+            report(
+                f"{name}, image of 1000 × 1000, two threads",
+                rows,
+                lambda: list(pool.map(call, (image[:500], image[500:]))),
+                "one thread",
+                lambda: list(map(call, (image[:500], image[500:]))),
+                1.8,
+                at_least=True,
+            )
+    with dask.config.set(scheduler="threads", num_workers=2):
+        lazy = vantrel.refl_to_density(da.from_array(image, chunks=(125, -1, -1)), PAPER, "E", 2)
+        report(
+            "`refl_to_density`, the same image, two Dask workers",
+            rows,
+            lazy.compute,
+            "NumPy, one thread",
+            lambda: vantrel.refl_to_density(image, PAPER, "E", 2),
+            1.8,
+            at_least=True,
+        )
+
+
+def import_time():
+    def run(code):
+        start = time.perf_counter()
+        subprocess.run([sys.executable, "-c", code], check=True)
+        return time.perf_counter() - start
+
+    pairs = [(run("import numpy, vantrel"), run("import numpy")) for _ in range(16)][1:]
+    extra = statistics.median(both - numpy for both, numpy in pairs)
+    print(f"\n`import vantrel` takes {extra:.3f} s beyond NumPy's own (goal: at most 0.2 s).")
+
+
+def main():
+    parser = argparse.ArgumentParser(description=__doc__)
+    parser.add_argument("--loops", required=True, help="loop.c as a shared library")
+    c = ctypes.CDLL(parser.parse_args().loops)
+    for function in c.loop_xyz, c.loop_de2000, c.loop_density:
+        function.restype = None
+    c.loop_xyz.argtypes = ctypes.c_void_p, ctypes.c_long, ctypes.c_int, ctypes.c_void_p
+    c.loop_de2000.argtypes = [ctypes.c_void_p] * 2 + [ctypes.c_long, ctypes.c_void_p]
+    c.loop_density.argtypes = (
+        [ctypes.c_void_p] * 2 + [ctypes.c_long, ctypes.c_int, ctypes.c_int, ctypes.c_void_p]
+    )
+
+    packages = ", ".join(f"{p} {version(p)}" for p in ("numpy", "colour-science", "colormath", "dask"))
+    print(f"Python {platform.python_version()}, vantrel {vantrel.__version__}, {packages}\n")
+    print("| | ns | beside | ns | ratio | goal |\n|---|---|---|---|---|---|")
+    os.sched_setaffinity(0, {min(ALL_PROCESSORS)})
+    colorimetry(c)
+    difference(c)
+    density(c)
+    two_processors()
+    import_time()
+
+
+if __name__ == "__main__":
+    main()
