@@ -46,6 +46,16 @@ def test_memory_layout_changes_no_bit(lay_out):
     )
 
 
+@pytest.mark.parametrize("illum_obs", vantrel.IllumObs)
+def test_many_spectra_have_the_bits_of_one(illum_obs):
+    spectra = RANDOM.uniform(-5, 120, (11, 33))[:, 1:32]
+    spectra[1, 3], spectra[2, 30], spectra[4], spectra[5] = np.inf, 1e300, -0.0, 5e-324
+    together = vantrel.refl_to_xyz(spectra, illum_obs)
+    one_by_one = np.array([vantrel.refl_to_xyz(row, illum_obs) for row in spectra])
+    assert together.tobytes() == one_by_one.tobytes()
+    assert np.array_equal(vantrel.refl_to_xyz(spectra[:6], illum_obs), one_by_one[:6])
+
+
 def test_everything_broadcasts():
     statuses = [["E"], ["T"]]
     densities = vantrel.refl_to_density(SPECTRA[0, 0], PAPER, statuses, ["RED", "BLUE", "VISUAL"])

@@ -1,5 +1,6 @@
 // Colours, colour differences, paper and inks.
 #include "rows.h"
+#include "many_xyz.h"
 
 #include <cwchar>
 
@@ -65,8 +66,14 @@ int estimate_refls_ex(int n, const double *first, Optional second, Optional thir
     return estimate(n, first, second.values, third.values, percent, paper, refl);
 }
 
+constexpr Row with_loop(Row row, decltype(Row::loop) loop)
+{
+    row.loop = loop;
+    return row;
+}
+
 constexpr Row kRows[] = {
-    ROW(ReflToXYZ, "refl_to_xyz", "(31),()->(3)"),
+    with_loop(ROW(ReflToXYZ, "refl_to_xyz", "(31),()->(3)"), many_xyz),
     ROW(ReflToXYZs, "refl_to_xyzs", "(31),()->(31),(31),(31)"),
     ROW(ReflToCIELAB, "refl_to_cielab", "(31),()->(3)"),
     ROW(XYZToCIELab, "xyz_to_cielab", "(3),()->(3)"),
