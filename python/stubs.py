@@ -7,8 +7,11 @@ from pathlib import Path
 
 import vantrel
 
-HEADER = '''"""Types of the package, written by stubs.py. Results are arrays of the kind that was handed in, NumPy
-scalars for single rows; with `ok=True` a tuple that ends with the flags."""
+HEADER = '''"""Types of the package, written by stubs.py.
+
+Results are arrays of the kind that was handed in, NumPy scalars for single rows; with `ok=True` a
+tuple that ends with the flags.
+"""
 
 from enum import IntEnum
 from typing import Any, Sequence, Union

@@ -74,9 +74,7 @@ def colorimetry(c):
             rows,
             lambda: vantrel.refl_to_xyz(spectra, "D50_2DEG"),
             "colour-science, `msds_to_XYZ_integration`",
-            lambda: colour.colorimetry.msds_to_XYZ_integration(
-                spectra, observer, d50, shape=shape
-            ),
+            lambda: colour.colorimetry.msds_to_XYZ_integration(spectra, observer, d50, shape=shape),
             0.25,
             rounds,
         )
@@ -196,11 +194,16 @@ def main():
         function.restype = None
     c.loop_xyz.argtypes = ctypes.c_void_p, ctypes.c_long, ctypes.c_int, ctypes.c_void_p
     c.loop_de2000.argtypes = [ctypes.c_void_p] * 2 + [ctypes.c_long, ctypes.c_void_p]
-    c.loop_density.argtypes = (
-        [ctypes.c_void_p] * 2 + [ctypes.c_long, ctypes.c_int, ctypes.c_int, ctypes.c_void_p]
-    )
+    c.loop_density.argtypes = [ctypes.c_void_p] * 2 + [
+        ctypes.c_long,
+        ctypes.c_int,
+        ctypes.c_int,
+        ctypes.c_void_p,
+    ]
 
-    packages = ", ".join(f"{p} {version(p)}" for p in ("numpy", "colour-science", "colormath", "dask"))
+    packages = ", ".join(
+        f"{p} {version(p)}" for p in ("numpy", "colour-science", "colormath", "dask")
+    )
     print(f"Python {platform.python_version()}, vantrel {vantrel.__version__}, {packages}\n")
     print("| | ns | beside | ns | ratio | goal |\n|---|---|---|---|---|---|")
     os.sched_setaffinity(0, {min(ALL_PROCESSORS)})

@@ -127,13 +127,15 @@ def check_line(words, names):
         tolerance = float(words[-1])
         words = words[:-2]
     verb = next(i for i, word in enumerate(words) if word in ("=", "fails", "returns"))
-    c_name, expected = words[0], words[verb + 1:]
+    c_name, expected = words[0], words[verb + 1 :]
     function = find(c_name)
     given = arguments(c_name, words[1:verb], names)
     if "null" in expected and (words[verb] == "fails" or c_name.startswith("Get")):
         return  # the package asks for every output
-    result_wanted = words[verb] == "returns" and getattr(vantrel.ufuncs, PYTHON_NAMES.get(
-        plain(c_name), "") + "_ok", None) is None
+    result_wanted = (
+        words[verb] == "returns"
+        and getattr(vantrel.ufuncs, PYTHON_NAMES.get(plain(c_name), "") + "_ok", None) is None
+    )
     if words[verb] == "=" or result_wanted:
         if c_name.startswith("Set"):
             try:
@@ -156,7 +158,9 @@ def check_line(words, names):
             return
         assert not ok
         for output in outputs:
-            assert np.all(np.isnan(output)) if np.asarray(output).dtype.kind == "f" else output == -1
+            assert (
+                np.all(np.isnan(output)) if np.asarray(output).dtype.kind == "f" else output == -1
+            )
 
 
 def test_every_line():

@@ -119,7 +119,9 @@ int find_density(const DENSITYSTRUCT *densities, int include_visual, double *den
 {
     DENSITYSTRUCT set = *densities;
     *response = -1; // as it was where there is none
-    find(&set, *density, *response, include_visual);
+    double found = 0;
+    find(&set, found, *response, include_visual);
+    *density = found;
     return 1;
 }
 

@@ -89,7 +89,8 @@ struct Loop<function, returns> {
     {
         std::tuple<Argument<P>...> arguments;
         (place(std::get<I>(arguments), layout, Map::operand[I], rows, dimensions, steps), ...);
-        const bool usable = (true & ... & std::get<I>(arguments).usable());
+        bool usable = true; // every argument is asked: it also learns how its rows lie
+        ((usable = std::get<I>(arguments).usable() && usable), ...);
 
         const int last = Map::inputs + Map::outputs;
         char *flag = layout.flags ? rows[last] : nullptr;

@@ -128,7 +128,7 @@ bool add_den_weight(PyObject *module)
 
 } // namespace
 
-PyMODINIT_FUNC PyInit__ufuncs() // NOLINT(bugprone-reserved-identifier)
+PyMODINIT_FUNC PyInit__ufuncs() // NOLINT(bugprone-reserved-identifier,cert-*)
 {
     import_array();
     import_umath();

@@ -1,5 +1,8 @@
-"""Types of the package, written by stubs.py. Results are arrays of the kind that was handed in, NumPy
-scalars for single rows; with `ok=True` a tuple that ends with the flags."""
+"""Types of the package, written by stubs.py.
+
+Results are arrays of the kind that was handed in, NumPy scalars for single rows; with `ok=True` a
+tuple that ends with the flags.
+"""
 
 from enum import IntEnum
 from typing import Any, Sequence, Union

@@ -100,9 +100,7 @@ def calculate_ccr_densities(spectra: "Spectra", paper: "OptionalSpectra", status
 
 
 @function("density", "band")
-def calculate_spectralx_density(
-    spectra: "Spectra", paper: "OptionalSpectra", request: "Integers"
-):
+def calculate_spectralx_density(spectra: "Spectra", paper: "OptionalSpectra", request: "Integers"):
     """Density of a five-band window: (density, band).
 
     Request 2 to 28: at that band; 0: the visual density of Status T (band -1); any other: at the

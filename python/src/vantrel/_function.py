@@ -39,7 +39,7 @@ class Declared:
         if len(args) > len(self.names):
             raise TypeError(f"{self.name}() takes {len(self.names)} arguments, not {len(args)}")
         values = list(args)
-        for name in self.names[len(args):]:
+        for name in self.names[len(args) :]:
             if name in kwargs:
                 values.append(kwargs.pop(name))
             elif name in self.defaults:
@@ -135,7 +135,7 @@ def _on_xarray(declared, values, ok):
     for value, core in zip(values, declared.cores):
         dims = core
         if core and is_from("xarray", value):
-            dims = list(value.dims[-len(core):])
+            dims = list(value.dims[-len(core) :])
             spectral = dims[-1] if core[-1] == "31" else spectral
         cores_in.append(dims)
 

@@ -8,9 +8,7 @@ from ._function import function
 
 
 @function("dot_area")
-def density_to_dot_area(
-    solid_density: "Numbers", tint_density: "Numbers", n_factor: "Numbers" = 1
-):
+def density_to_dot_area(solid_density: "Numbers", tint_density: "Numbers", n_factor: "Numbers" = 1):
     """Dot area of tints in percent (Yule and Nielsen 1951; n = 1: Murray and Davies 1936).
 
     Not clamped; 100 for a solid of density 0. An n-factor of 0 is refused.
@@ -18,9 +16,7 @@ def density_to_dot_area(
 
 
 @function("tint_density")
-def density_from_dot_area(
-    solid_density: "Numbers", dot_area: "Numbers", n_factor: "Numbers" = 1
-):
+def density_from_dot_area(solid_density: "Numbers", dot_area: "Numbers", n_factor: "Numbers" = 1):
     """Density of tints of a dot area in percent: density_to_dot_area() backwards, to 7 digits."""
 
 
@@ -88,9 +84,7 @@ def refl_to_trap(
 
 
 @function("grayness", "hue_error")
-def density_to_hue_gray(
-    red_density: "Numbers", green_density: "Numbers", blue_density: "Numbers"
-):
+def density_to_hue_gray(red_density: "Numbers", green_density: "Numbers", blue_density: "Numbers"):
     """Grayness 100 L / H and hue error 100 (M - L) / (H - L) in percent (GATF colour diagram).
 
     L, M and H are the lowest, middle and highest of the three densities.
@@ -103,9 +97,7 @@ def refl_to_hue_gray(spectra: "Spectra", paper: "OptionalSpectra", status: "HueS
 
 
 @function("refl")
-def density_to_integrated_refl(
-    density: "Numbers", status: "HueStatus", response: "InkResponse"
-):
+def density_to_integrated_refl(density: "Numbers", status: "HueStatus", response: "InkResponse"):
     """Reflectance in percent times bands under the response curve: 10^7 / (peak weight 10^D).
 
     A density of 0 or less is refused; infinite for a response that the status does not have.
@@ -123,9 +115,7 @@ def refl_to_pol_intercept(
 
 
 @function("refl")
-def color_at_equivalent_density(
-    reference: "Spectra", sample: "Spectra", status: "StatusName"
-):
+def color_at_equivalent_density(reference: "Spectra", sample: "Spectra", status: "StatusName"):
     """Spectra of a sample printed at the density of a reference.
 
     K/S divided by density_ratio() in every band (Kubelka and Munk 1931, opaque layer).
