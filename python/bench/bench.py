@@ -1,4 +1,4 @@
-"""Measures the package beside other packages and beside C, in one run. scripts/bench-python runs it.
+"""Measures the package beside other packages and beside C, in one run, for scripts/bench-python.
 
 Every row takes turns with its rival; what is compared are the medians of the turns, per row of the
 arrays. Rows run on one processor, save where two are the point.

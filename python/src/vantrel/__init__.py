@@ -3,13 +3,13 @@
     import vantrel
     lab = vantrel.refl_to_cielab(spectra, "D50_2DEG")    # (..., 31) -> (..., 3)
 
-A spectrum is the last dimension of an array: 31 values, the reflectance at 400, 410, ... 700 nm in
-percent. Functions take anything that broadcasts; each is a NumPy generalized ufunc underneath
+A spectrum is the last dimension of an array: 31 values, the reflectance at 400, 410, ... 700 nm
+in percent. Functions take anything that broadcasts; each is a NumPy generalized ufunc underneath
 (`vantrel.ufuncs`), runs without the interpreter lock, and takes Dask and xarray arrays as well.
 
-An argument that is wrong for the whole call raises ValueError. A row that the library refuses, black
-where a chromaticity is asked for, is NaN, and `ok=True` adds an output that tells which rows were
-accepted.
+An argument that is wrong for the whole call raises ValueError. A row that the library refuses,
+black where a chromaticity is asked for, is NaN, and `ok=True` adds an output that tells which rows
+were accepted.
 """
 
 from . import _ufuncs as ufuncs

@@ -39,7 +39,7 @@ def set_hifi_constants(wavelengths, shape1=None, shape2=None, shape3=None):
 
 
 def get_hifi_constants():
-    """The HiFi bands: (wavelengths in nm, shape1, shape2, shape3), shapes scaled to 1 in the centre."""
+    """The HiFi bands: (wavelengths in nm, shape1, shape2, shape3), shapes with 1 in the centre."""
     return _read(_ufuncs.get_hifi_constants, 3, 7, 7, 7)
 
 
@@ -64,7 +64,7 @@ def _numbers(getter, count):
 
 
 def _set(setter, getter, values, reason):
-    """Sets single numbers; the library refuses them all or none, which shows when they are read."""
+    """Sets single numbers; the library takes all or none, which shows when they are read."""
     if any(value is None for value in values):
         raise ValueError("None is not accepted")
     values = tuple(float(value) for value in values)
@@ -74,7 +74,10 @@ def _set(setter, getter, values, reason):
 
 
 def set_spectralx_constants(tolerance, reserved, centre, inner, outer):
-    """Sets the SpectralX constants: tolerance of a peak, a reserved number, weights of the window."""
+    """Sets the SpectralX constants; the weight of the centre must be 1.
+
+    `tolerance`: how far above the lowest windowed sum, in percent, a band still counts as a peak.
+    """
     _set(
         _ufuncs.set_spectralx_constants,
         get_spectralx_constants,

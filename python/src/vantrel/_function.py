@@ -80,7 +80,7 @@ _DECLARED = {}
 
 
 def evaluate(name, ok, *values, out=None, missing=()):
-    """Runs the ufunc of a function on NumPy arrays; `missing` are spectra that were not handed on."""
+    """Runs the ufunc of a function on NumPy arrays; `missing` spectra were not handed on."""
     declared = _DECLARED[name]
     for index in missing:
         values = values[:index] + (np.empty(0),) + values[index:]
