@@ -67,3 +67,8 @@ def test_none_of_them_is_needed():
         "assert round(vantrel.refl_to_xyz([100] * 31)[1]) == 100"
     )
     subprocess.run([sys.executable, "-c", code], check=True)
+
+
+def test_what_they_cannot_do_is_said():
+    with pytest.raises(TypeError, match="out="):
+        vantrel.refl_to_xyz(da.from_array(IMAGE), out=np.empty((14, 10, 3)))

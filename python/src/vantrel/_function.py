@@ -85,12 +85,14 @@ def evaluate(name, ok, *values, out=None, missing=()):
     for index in missing:
         values = values[:index] + (np.empty(0),) + values[index:]
     ufunc = declared.flagged if ok else declared.ufunc
+    words = WORDS.get(name)
     if out is None:
         results = ufunc(*values)
+    elif words is not None:
+        raise TypeError(f"{name}() makes new arrays of words and has no out=")
     else:
         outs = out if isinstance(out, tuple) else (out,)
         results = ufunc(*values, out=outs + (None,) * (ufunc.nout - len(outs)))
-    words = WORDS.get(name)
     if words is None:
         return results
     texts = tuple(words[np.maximum(r, 0)] for r in results[:3])
@@ -112,7 +114,8 @@ def _on_dask(declared, values, ok):
 
     cores, dtypes = _result_types(declared, ok)
     # Dask knows no core of no values
-    missing = tuple(i for i, value in enumerate(values) if np.shape(value) == (0,))
+    optional = [i for i, kind in enumerate(declared.kinds) if kind == "OptionalSpectra"]
+    missing = tuple(i for i in optional if np.shape(values[i]) == (0,))
     given = [i for i in range(len(values)) if i not in missing]
 
     def group(cores):
