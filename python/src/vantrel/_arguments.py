@@ -11,8 +11,8 @@ from ._enums import IllumObs, Response, Status
 BANDS = 31
 
 
-def is_from(library, value):
-    return type(value).__module__.partition(".")[0] == library
+def library_of(value):
+    return type(value).__module__.partition(".")[0]
 
 
 def is_lazy(value):

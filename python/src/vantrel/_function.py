@@ -6,7 +6,7 @@ import inspect
 import numpy as np
 
 from . import _ufuncs
-from ._arguments import check_core, check_reading, convert, is_from, is_lazy
+from ._arguments import check_core, check_reading, convert, is_lazy, library_of
 
 WORDS = {"verbal_color_difference": np.array(_ufuncs.difference_words)}
 
@@ -137,7 +137,7 @@ def _on_xarray(declared, values, ok):
     cores_in, spectral = [], "band"
     for value, core in zip(values, declared.cores):
         dims = core
-        if core and is_from("xarray", value):
+        if core and library_of(value) == "xarray":
             dims = list(value.dims[-len(core) :])
             spectral = dims[-1] if core[-1] == "31" else spectral
         cores_in.append(dims)
@@ -157,8 +157,9 @@ def _on_xarray(declared, values, ok):
 
 
 def _dispatch(declared, *values, ok=False, out=None):
+    libraries = {library_of(value) for value in values}
     for library, run in ("xarray", _on_xarray), ("dask", _on_dask):
-        if any(is_from(library, value) for value in values):
+        if library in libraries:
             if out is not None:
                 raise TypeError(f"{declared.name}(): out= is for NumPy arrays, not {library}")
             return run(declared, values, ok)
