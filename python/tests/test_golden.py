@@ -100,7 +100,8 @@ def agrees(got, expected, tolerance):
     got, expected = np.atleast_1d(got).astype(float), np.array(expected, dtype=float)
     allowed = 1e-12 * np.maximum(1, np.abs(expected)) if tolerance is None else tolerance
     with np.errstate(invalid="ignore"):
-        close = (np.abs(got - expected) <= allowed) | (got == expected)
+        near = np.isfinite(expected) & (np.abs(got - expected) <= allowed)
+        close = near | (got == expected)
     return bool(np.all(close | (np.isnan(got) & np.isnan(expected))))
 
 

@@ -16,9 +16,9 @@ struct List {
 List list_illuminants();
 List list_tristimulus_weights(ILLUM_OBS illuminant);
 List list_statuses();
-List list_responses(const std::optional<int> &status); // of one status, or of all
+List list_responses(const std::optional<int> &wanted); // of one status, or of all
 // Filters scaled to a peak of 100, all of a status or one; throws RequestError where there is none.
-List list_weights(int status, const std::optional<int> &response);
+List list_weights(int status, const std::optional<int> &wanted);
 
 // The output formats; each gives the whole text.
 std::string as_table(const List &list, bool colour);
