@@ -69,6 +69,33 @@ TEST(Csv, HasTheRowsOfEverySheetUnderOneHeader)
 }
 
 // A spreadsheet must not compute what a file's text says; a number is no formula.
+// As spot inks of CxF come, or tints of several inks in one column.
+TEST(Csv, HasAColumnForEachInkThatAPatchNames)
+{
+    std::string sheet = "name,ink,tint";
+    for (int nm = 400; nm <= 700; nm += 10)
+        sheet += fmt::format(",{}", nm);
+    for (const char *patch : {"Paper,,", "Gold 100,Gold,100", "Silver 50,Silver,50"}) {
+        sheet += '\n' + std::string(patch);
+        for (int band = 0; band < 31; ++band)
+            sheet += fmt::format(",{}", patch[0] == 'P' ? 80 : 20 + band);
+    }
+    const std::string path = scratch("inks.csv");
+    std::ofstream(path) << sheet;
+    const auto inks_of = [](std::map<std::string, std::string> row) {
+        return row["Gold"] + '|' + row["Silver"] + '|' + row["nm400"] + '|' + row["nm700"];
+    };
+    auto rows = csv_rows(vantrel("report --format csv " + path).out);
+    ASSERT_EQ(rows.size(), 3u);
+    EXPECT_EQ(inks_of(rows[0]), "||80|80");
+    EXPECT_EQ(inks_of(rows[1]), "100||20|50");
+    EXPECT_EQ(inks_of(rows[2]), "|50|20|50");
+    rows =
+        csv_rows(vantrel("ink --format csv --patch 'Gold 100' --against 'Silver 50' " + path).out);
+    EXPECT_EQ(inks_of(rows[0]), "100||20|50");
+    EXPECT_EQ(inks_of(rows[1]), "|50|20|50");
+}
+
 TEST(Csv, TakesTheForceFromFormulas)
 {
     const struct {

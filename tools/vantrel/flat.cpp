@@ -151,6 +151,21 @@ std::string cell(const std::optional<double> &value)
 
 std::string exact_cell(double value) { return fmt::format("{}", value); }
 
+void add_device_fields(std::vector<Field> &fields, const std::vector<std::string> &names)
+{
+    for (const std::string &name : names)
+        fields.push_back({name, name});
+}
+
+void add_device_cells(Row &row, const std::vector<std::string> &names, const Device &device)
+{
+    for (const std::string &name : names) {
+        const auto value = std::find_if(device.begin(), device.end(),
+                                        [&](const auto &own) { return own.first == name; });
+        row.push_back(value == device.end() ? "" : exact_cell(value->second));
+    }
+}
+
 void add_colour_fields(std::vector<Field> &fields, const std::string &prefix)
 {
     std::string upper_prefix = upper(prefix);

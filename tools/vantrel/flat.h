@@ -6,6 +6,7 @@
 #include <functional>
 #include <optional>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "colour.h"
@@ -36,6 +37,11 @@ std::string as_cgats(const std::vector<Flat> &tables);
 // Cells: with four decimals, to the last bit, empty where there is no value.
 std::string cell(const std::optional<double> &value);
 std::string exact_cell(double value);
+
+// Columns of device values, in order, and their cells: empty where a patch does not have the value.
+using Device = std::vector<std::pair<std::string, double>>; // as in Patch
+void add_device_fields(std::vector<Field> &fields, const std::vector<std::string> &names);
+void add_device_cells(Row &row, const std::vector<std::string> &names, const Device &device);
 
 // Columns of a colour and its cells.
 void add_colour_fields(std::vector<Field> &fields, const std::string &prefix);

@@ -1,8 +1,12 @@
 // Reports and predictions as rows.
 
+#include <set>
+#include <string_view>
+
 #include <fmt/format.h>
 
 #include "flat.h"
+#include "measurement.h"
 #include "names.h"
 #include "predict.h"
 #include "report.h"
@@ -29,11 +33,28 @@ void add_reading_cells(Row &row, const DensityReading &reading, int status)
     row.push_back(cell(reading.density));
 }
 
-Row row_of(const Report &report, const PatchReport &patch)
+constexpr std::size_t most_cells = 50'000'000; // of device values: bounds what empty ones take
+
+// The names of the device values of all patches.
+std::vector<std::string> device_names(const Report &report)
+{
+    std::set<std::string_view> seen;
+    std::vector<std::string> names;
+    for (const PatchReport &patch : report.patches)
+        for (const auto &[name, value] : patch.device)
+            if (seen.insert(name).second)
+                names.push_back(name);
+    if (names.size() * report.patches.size() > most_cells)
+        throw RequestError{fmt::format("{}: {} inks are too many for a column each; --format json "
+                                       "has them",
+                                       report.file, names.size())};
+    return names;
+}
+
+Row row_of(const Report &report, const std::vector<std::string> &inks, const PatchReport &patch)
 {
     Row row = {report.file, patch.id, patch.name};
-    for (const auto &[ink, percent] : patch.device)
-        row.push_back(exact_cell(percent));
+    add_device_cells(row, inks, patch.device);
     add_colour_cells(row, patch.colour);
     for (const double value : {patch.lch.C, patch.lch.h, patch.to_paper})
         row.push_back(cell(value));
@@ -51,8 +72,8 @@ Flat flat_of(const Report &report)
                                    name_of(report.illuminant), status_name(report.status),
                                    report.paper.name, report.n_factor);
     flat.fields = {{"file", "", true}, {"id", "SAMPLE_ID", true}, {"name", "SAMPLE_NAME", true}};
-    for (const auto &[ink, percent] : report.patches.front().device)
-        flat.fields.push_back({ink, ink});
+    const std::vector<std::string> inks = device_names(report);
+    add_device_fields(flat.fields, inks);
     add_colour_fields(flat.fields, "");
     flat.fields.push_back({"C", "LAB_C"});
     flat.fields.push_back({"h", "LAB_H"});
@@ -63,7 +84,7 @@ Flat flat_of(const Report &report)
     add_spectrum_fields(flat.fields);
     flat.spectra = true;
     flat.rows = report.patches.size();
-    flat.row = [&report](std::size_t i) { return row_of(report, report.patches[i]); };
+    flat.row = [&report, inks](std::size_t i) { return row_of(report, inks, report.patches[i]); };
     return flat;
 }
 

@@ -137,25 +137,36 @@ Json status_json(int status, const StatusReading &row)
     return out;
 }
 
+// The names of the device values of one patch or the other.
+std::vector<std::string> device_names(const PatchStudy &study)
+{
+    std::vector<std::string> names;
+    const PatchReport &other = study.against ? study.against->patch : study.patch;
+    for (const PatchReport *patch : {&study.patch, &other})
+        for (const auto &[name, value] : patch->device)
+            if (std::find(names.begin(), names.end(), name) == names.end())
+                names.push_back(name);
+    return names;
+}
+
 Flat spectra(const PatchStudy &study)
 {
     Flat flat;
     flat.description =
         fmt::format("{} of {}: {}", study.patch.name, study.file, name_of(study.illuminant));
     flat.fields = {{"table", "", true}, {"id", "SAMPLE_ID", true}, {"name", "SAMPLE_NAME", true}};
-    for (const auto &[ink, percent] : study.patch.device)
-        flat.fields.push_back({ink, ink});
+    const std::vector<std::string> inks = device_names(study);
+    add_device_fields(flat.fields, inks);
     add_colour_fields(flat.fields, "");
     flat.fields.push_back({"brightness", "BRIGHTNESS"});
     flat.fields.push_back({"whiteness", "WHITENESS"});
     add_spectrum_fields(flat.fields);
     flat.spectra = true;
     flat.rows = study.against ? 2 : 1;
-    flat.row = [&study](std::size_t i) {
+    flat.row = [&study, inks](std::size_t i) {
         const PatchReport &patch = i == 0 ? study.patch : study.against->patch;
         Row row = {"spectra", patch.id, patch.name};
-        for (const auto &[ink, percent] : patch.device)
-            row.push_back(exact_cell(percent));
+        add_device_cells(row, inks, patch.device);
         add_colour_cells(row, patch.colour);
         row.push_back(i == 0 ? cell(study.as_paper.brightness) : "");
         row.push_back(i == 0 ? cell(study.as_paper.whiteness) : "");
