@@ -121,6 +121,7 @@ TEST(Report, RefusesBadFilesInOneLine)
         {replaced(good, "\"Magenta 10\"", "\"Magenta 10"), ":12: a quoted text is not closed"},
         {replaced(good, "SPECTRAL_NM410", "R_400"), ":7: 400 nm occurs twice in a spectrum"},
         {"SPECTRAL_NORM 1e-320\n" + good, ":12: a value is too large in percent"},
+        {replaced(good, "79.930", "-1e7"), ":12: a value is too large in percent"},
         {replaced(content(data + "pairs_decimal_comma.txt"), "\t700\t", "\t712\t"),
          ":11: the range is too short in spectra of 36 values from 380 to 730 nm; every 10 nm from "
          "400 to 700 is needed, or finer steps"},

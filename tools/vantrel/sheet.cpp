@@ -9,6 +9,7 @@
 namespace {
 
 constexpr std::size_t most_warnings = 20;
+constexpr double largest_percent = 1e6; // beyond it colours overflow, and no instrument measures it
 
 bool is_word(char c)
 {
@@ -124,13 +125,12 @@ void Sheet::bring_to_percent()
     }
     origin.scale_by = scale_by;
     origin.scaled = *full_scale != 100;
-    if (!origin.scaled)
-        return;
     const double factor = 100 / *full_scale;
     for (std::size_t i = 0; i < patches.size(); ++i)
         for (double &value : patches[i].refl) {
-            value *= factor;
-            if (!std::isfinite(value))
+            if (origin.scaled)
+                value *= factor;
+            if (!(std::abs(value) <= largest_percent))
                 throw InputError{lines[i], "a value is too large in percent"};
         }
 }
