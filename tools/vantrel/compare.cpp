@@ -8,6 +8,7 @@
 
 #include <fmt/format.h>
 
+#include "progress.h"
 #include "text.h"
 
 namespace {
@@ -242,8 +243,11 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
                    .worst = {},
                    .only_reference = names_of(reference, pairs.only_reference),
                    .only_sample = names_of(sample, pairs.only_sample)};
-    for (const auto &[first, second] : pairs.matched)
+    Progress progress("Comparing", pairs.matched.size());
+    for (const auto &[first, second] : pairs.matched) {
+        progress.done(out.pairs.size());
         out.pairs.push_back(pair_report(reference.patches[first], sample.patches[second], request));
+    }
     for (std::size_t metric = 0; metric < request.metrics.size(); ++metric)
         out.statistics.push_back(statistics_of(out.pairs, metric));
     out.worst = worst_first(out.pairs, 0);

@@ -6,6 +6,7 @@
 
 #include <fmt/format.h>
 
+#include "progress.h"
 #include "text.h"
 
 namespace {
@@ -78,7 +79,9 @@ void add_csv_rows(std::string &out, const Flat &table, const std::vector<Field> 
     std::map<std::string_view, std::size_t> own;
     for (std::size_t i = 0; i < table.fields.size(); ++i)
         own.emplace(table.fields[i].name, i);
+    Progress progress("Writing", table.rows);
     for (std::size_t i = 0; i < table.rows; ++i) {
+        progress.done(i);
         const Row row = table.row(i);
         for (const Field &field : fields) {
             if (const auto found = own.find(field.name); found != own.end())
@@ -107,7 +110,9 @@ void add_cgats_table(std::string &out, const Flat &table)
         out += identifier(table.fields[column].cgats) + '\t';
     out.back() = '\n';
     out += fmt::format("END_DATA_FORMAT\nNUMBER_OF_SETS\t{}\nBEGIN_DATA\n", table.rows);
+    Progress progress("Writing", table.rows);
     for (std::size_t i = 0; i < table.rows; ++i) {
+        progress.done(i);
         const Row row = table.row(i);
         for (const std::size_t column : columns) {
             const bool quoted = table.fields[column].text || row[column].empty();

@@ -3,6 +3,7 @@
 #include <fmt/format.h>
 
 #include "names.h"
+#include "progress.h"
 
 Json lab_json(const CIELABCOORD &lab) { return {lab.L, lab.a, lab.b}; }
 
@@ -18,7 +19,10 @@ std::string with_array(const Json &object, std::string_view name, std::size_t co
     std::string out = object.dump(2);
     out.erase(out.rfind("\n}"));
     out += fmt::format(",\n  \"{}\": [", name);
-    for (std::size_t i = 0; i < count; ++i)
+    Progress progress("Writing", count);
+    for (std::size_t i = 0; i < count; ++i) {
+        progress.done(i);
         out += (i ? ",\n" : "\n") + element(i).dump();
+    }
     return out + "\n  ]\n}";
 }
