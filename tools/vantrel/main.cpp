@@ -34,6 +34,13 @@ Outcome run(CLI::App &app, int count, char **words)
         std::ostringstream text, unused;
         app.exit(wish, text, unused);
         return {text.str(), "", {}};
+    } catch (const CLI::RequiredError &) {
+        if (!app.get_subcommands().empty()) // one of its own arguments
+            throw;
+        const auto rest = app.remaining();
+        throw RequestError{
+            (rest.empty() ? "a command is required" : "no command " + in_quotes(rest[0])) +
+            "; there are report, compare, predict, ink, list"};
     }
     for (const Command &command : commands)
         if (command.app->parsed())
