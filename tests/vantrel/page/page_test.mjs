@@ -182,6 +182,18 @@ test('a chosen patch joins the spectra', async () => {
   await page.close();
 });
 
+test('each ink of a sheet that names one a patch has its solid and its column', async () => {
+  const bands = Array.from({ length: 31 }, (_, i) => 400 + 10 * i);
+  const row = (ink, tint, refl) => [ink, tint, ...bands.map((nm) => (nm > 550 ? refl : 80))].join();
+  const page = await open(['report', file('spots.csv', [['ink', 'tint', ...bands].join(),
+    row('Paper', 0, 80), row('Gold', 7.1, 70), row('Gold', 100, 20), row('Jade', 100, 9)].join('\n'))]);
+  assert.deepEqual(await page.locator('.legend').first().locator('bdi').allInnerTexts(),
+    ['Paper', 'Gold 100', 'Jade 100']);
+  assert.deepEqual((await rowsOf(page)).map(({ Gold, Jade }) => [Gold, Jade]),
+    [['0.0', '–'], ['7.1', '–'], ['100.0', '–'], ['–', '100']]);
+  await page.close();
+});
+
 test('names from the file are text', async () => {
   const page = await open(commands.strange);
   const names = json(commands.strange).sheets[0].patches.map((patch) => patch.name);

@@ -8,24 +8,20 @@ import { searchTable } from './table.js';
 const mostSwatches = 2000;
 const mostCards = 60;
 const mostChosen = 8;
+const mostDevices = 16;
 
 const largest = (patches, field) => patches.reduce((best, patch) =>
   (patch[field] !== null && !(best && best[field] >= patch[field]) ? patch : best), null);
 
-// The inks of a patch, [[field, percent], …]; nothing where its device values are no inks.
-function tintsOf(sheet, patch) {
-  if (!sheet.inks.length) return null;
-  const tints = sheet.inks.map((ink) => [ink, patch.device[ink]]);
-  return tints.every(([, percent]) => percent >= 0 && percent <= 100)
-    ? tints.filter(([, percent]) => percent > 0) : null;
-}
-
+// The first patch of each ink by itself at 100 %. An ink that a patch does not name is at 0.
 function solidsOf(sheet) {
+  const inks = new Set(sheet.inks);
   const solids = new Map();
   for (const patch of sheet.patches) {
-    const tints = tintsOf(sheet, patch);
-    if (tints?.length === 1 && tints[0][1] === 100 && !solids.has(tints[0][0]))
-      solids.set(tints[0][0], patch);
+    const printed = Object.entries(patch.device).filter(([ink, percent]) =>
+      inks.has(ink) && percent !== 0);
+    if (printed.length === 1 && printed[0][1] === 100 && !solids.has(printed[0][0]))
+      solids.set(printed[0][0], patch);
   }
   return solids;
 }
@@ -145,11 +141,16 @@ function columnsOf(sheet) {
   const part = (label, id, field, i) =>
     ({ id, label, decimals: 2, value: (patch) => patch[field][i] });
   const devices = [...new Set(sheet.patches.flatMap((patch) => Object.keys(patch.device)))];
+  const whole = (field) => sheet.patches.every(({ device }) => Number.isInteger(device[field] ?? 0));
+  const inks = ({ device }) => Object.entries(device).filter(([, percent]) => percent !== 0)
+    .map(([ink, percent]) => `${ink} ${percent}`).join(', ') || null;
   return [
     { id: 'name', label: 'Patch', value: (patch) => patch.name },
     { id: 'id', label: 'Id', value: (patch) => patch.id },
-    ...devices.map((field) => ({ id: field, label: field.replace(/^CMYK_/, ''), decimals: 0,
-      title: `${field}, percent`, value: (patch) => patch.device[field] })),
+    ...devices.length > mostDevices ? [{ id: 'inks', label: 'Inks', value: inks }]
+      : devices.map((field) => ({ id: field, label: field.replace(/^CMYK_/, ''),
+        decimals: whole(field) ? 0 : 1, title: `${field}, percent`,
+        value: (patch) => patch.device[field] })),
     part('L*', 'L', 'lab', 0), part('a*', 'a', 'lab', 1), part('b*', 'b', 'lab', 2),
     part('C*', 'C', 'lch', 1), part('h', 'h', 'lch', 2),
     number('ΔE00', 'de00_to_paper', 2, 'Colour difference to the paper, CIEDE2000'),
