@@ -65,7 +65,7 @@ bool contains(std::string_view text, std::string_view part)
 }
 
 // How a ColorSpecification was measured.
-struct Specification {
+struct Settings {
     Condition condition;
     std::optional<double> first_nm, step_nm;
 };
@@ -83,9 +83,9 @@ Condition condition_of(const Node &node)
     return std::nullopt;
 }
 
-Specification specification_of(const Node &node)
+Settings settings_of(const Node &node)
 {
-    Specification out;
+    Settings out;
     const Node measurement = child(node, "MeasurementSpec");
     const Node range = child(measurement, "WavelengthRange");
     out.first_nm = number_in(attribute(range, "StartWL"));
@@ -118,14 +118,14 @@ private:
     void read_tints(const Node &custom);
     void read_object(const Node &object);
     Devices device_values(const Node &object);
-    std::vector<double> wavelengths(const Node &spectrum, const Specification &specification,
+    std::vector<double> wavelengths(const Node &spectrum, const Settings &settings,
                                     std::size_t count);
     Condition read_spectrum(const Node &spectrum, Patch &patch);
 
     std::string_view text;
     Sheet &sheet;
     pugi::xml_document document;
-    std::map<std::string_view, Specification> specifications;         // by Id
+    std::map<std::string_view, Settings> all_settings;                // by Id
     std::map<std::string_view, std::pair<std::string, double>> tints; // by the object's Id
     bool step_missing = false;
     std::size_t without = 0;           // objects with no spectrum
@@ -224,13 +224,12 @@ Devices Reader::device_values(const Node &object)
     return rgb;
 }
 
-std::vector<double> Reader::wavelengths(const Node &spectrum, const Specification &specification,
+std::vector<double> Reader::wavelengths(const Node &spectrum, const Settings &settings,
                                         std::size_t count)
 {
     const std::string_view stated = attribute(spectrum, "StartWL");
-    const auto first =
-        stated.empty() ? specification.first_nm : std::optional(number(spectrum, stated));
-    auto step = specification.step_nm;
+    const auto first = stated.empty() ? settings.first_nm : std::optional(number(spectrum, stated));
+    auto step = settings.step_nm;
     const double last = first.value_or(0) + 10 * static_cast<double>(count - 1);
     if (first && !step && last >= 700 && last <= 830) {
         step = 10;
@@ -264,12 +263,10 @@ Condition Reader::read_spectrum(const Node &spectrum, Patch &patch)
     }
     if (values.empty())
         throw InputError{line_of(spectrum), "a ReflectanceSpectrum without values"};
-    const Specification &specification = specifications[attribute(spectrum, "ColorSpecification")];
-    patch.refl =
-        sheet.bands_at(wavelengths(spectrum, specification, values.size()), line_of(spectrum))
-            .of(values);
-    return specification.condition ? specification.condition
-                                   : condition_in(attribute(spectrum, "Name"));
+    const Settings &settings = all_settings[attribute(spectrum, "ColorSpecification")];
+    patch.refl = sheet.bands_at(wavelengths(spectrum, settings, values.size()), line_of(spectrum))
+                     .of(values);
+    return settings.condition ? settings.condition : condition_in(attribute(spectrum, "Name"));
 }
 
 void Reader::read_object(const Node &object)
@@ -313,7 +310,7 @@ void Reader::read()
         throw InputError{line_of(root),
                          fmt::format("not CxF3: {} has no Resources", in_quotes(root.name()))};
     for (const Node &node : child(resources, "ColorSpecificationCollection").children())
-        specifications.try_emplace(attribute(node, "Id"), specification_of(node));
+        all_settings.try_emplace(attribute(node, "Id"), settings_of(node));
     read_tints(child(root, "CustomResources"));
 
     Progress progress("Reading", text.size());
