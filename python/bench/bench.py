@@ -163,7 +163,7 @@ def two_processors():
                 at_least=True,
             )
     with dask.config.set(scheduler="threads", num_workers=2):
-        lazy = vantrel.refl_to_density(da.from_array(image, chunks=(125, -1, -1)), PAPER, "E", 2)
+        lazy = vantrel.refl_to_density(da.from_array(image, chunks=(250, -1, -1)), PAPER, "E", 2)
         report(
             "`refl_to_density`, the same image, two Dask workers",
             rows,

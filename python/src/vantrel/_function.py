@@ -2,6 +2,7 @@
 
 import functools
 import inspect
+import operator
 
 import numpy as np
 
@@ -109,26 +110,55 @@ def _result_types(declared, ok):
     return cores, dtypes
 
 
-def _on_dask(declared, values, ok):
-    import dask.array as da
+def _on_block(name, ok, missing, *blocks):
+    """What evaluate() gives for one block, as a tuple; a core arrives in lists of its one piece."""
 
-    cores, dtypes = _result_types(declared, ok)
+    def only(block):
+        return only(block[0]) if isinstance(block, list) else block
+
+    results = evaluate(name, ok, *map(only, blocks), missing=missing)
+    return results if isinstance(results, tuple) else (results,)
+
+
+def _on_dask(declared, values, ok):
+    """Block by block; apply_gufunc() would copy each block to join the one piece of its core."""
+    import dask.array as da
+    from dask.array.core import broadcast_shapes
+
     # Dask knows no core of no values
     optional = [i for i, kind in enumerate(declared.kinds) if kind == "OptionalSpectra"]
     missing = tuple(i for i in optional if np.shape(values[i]) == (0,))
-    given = [i for i in range(len(values)) if i not in missing]
-
-    def group(cores):
-        return ",".join("(" + ",".join(f"core{d}" for d in core) + ")" for core in cores)
-
-    return da.apply_gufunc(
-        functools.partial(evaluate, declared.name, ok, missing=missing),
-        group([declared.cores[i] for i in given]) + "->" + group(cores),
-        *[values[i] for i in given],
-        output_dtypes=dtypes if len(dtypes) > 1 else dtypes[0],
-        output_sizes={f"core{d}": int(d) for core in cores for d in core},
-        allow_rechunk=True,
+    arrays, cores = [], []
+    for i, (value, core) in enumerate(zip(values, declared.cores)):
+        if i not in missing:
+            whole = {axis: -1 for axis in range(-len(core), 0)}
+            arrays.append(da.asarray(value).rechunk(whole))
+            cores.append(core)
+    loops = [array.ndim - len(core) for array, core in zip(arrays, cores)]
+    depth = len(broadcast_shapes(*(a.shape[:loop] for a, loop in zip(arrays, loops))))
+    names = [f"loop{d}" for d in range(depth)]
+    indices = [(*names[depth - loop :], *core) for loop, core in zip(loops, cores)]
+    tuples = da.blockwise(
+        functools.partial(_on_block, declared.name, ok, missing),
+        names,
+        *(part for pair in zip(arrays, indices) for part in pair),
+        concatenate=False,
+        token=declared.name,
+        meta=np.empty((0,) * depth, object),
     )
+    results = tuple(
+        tuples.map_blocks(
+            operator.itemgetter(k),
+            token=f"{declared.name}-{output}",
+            new_axis=list(range(depth, depth + len(core))),
+            chunks=tuples.chunks + tuple((int(d),) for d in core),
+            meta=np.empty((0,) * (depth + len(core)), dtype),
+        )
+        for k, (core, dtype, output) in enumerate(
+            zip(*_result_types(declared, ok), declared.outputs + ["ok"])
+        )
+    )
+    return results if len(results) > 1 else results[0]
 
 
 def _on_xarray(declared, values, ok):
