@@ -1,6 +1,7 @@
 #pragma once
 
 #include <array>
+#include <iterator>
 
 namespace vantrel {
 
@@ -46,9 +47,12 @@ inline constexpr LevelStart kLevelStarts[] = {
 constexpr std::array<unsigned char, kDisplaySteps> display_levels()
 {
     std::array<unsigned char, kDisplaySteps> levels{};
-    for (const LevelStart &start : kLevelStarts)
-        for (int i = start.index; i < kDisplaySteps; ++i)
-            levels[i] = start.level;
+    const LevelStart *start = kLevelStarts;
+    for (int i = 0; i < kDisplaySteps; ++i) {
+        if (start + 1 != std::end(kLevelStarts) && start[1].index == i)
+            ++start;
+        levels[i] = start->level;
+    }
     return levels;
 }
 
