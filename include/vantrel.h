@@ -310,8 +310,8 @@ VANTREL_API int LabToDE2000Ex(const CIELABCOORD *first, const CIELABCOORD *secon
  * CMC(l:c) (ISO 105-J03). Every weight follows `reference` alone; chroma and hue are those of
  * CIELabToCIELCH().
  * @param[in]  sample,reference  L\*a\*b\*
- * @param[in]  l,c               lightness and chroma weight (2, 1 acceptability; 1, 1
- * perceptibility)
+ * @param[in]  l,c               lightness and chroma weight (2, 1 for acceptability; 1, 1 for
+ *                               perceptibility)
  * @param[out] deltaE            ΔE CMC
  * @return 1; 0 for a null pointer; 0 with 999 written when l or c is exactly 0.
  */
@@ -339,7 +339,8 @@ VANTREL_API int ReflToDIN6172(const double *first, const double *second, int ill
  * @param[out] colour1          selector 0: "Too Green", "Too Red"; selector 1: "Too Dull",
  *                              "Too Bright"; or "On Target"
  * @param[out] colour2          selector 0: "Too Blue", "Too Yellow"; selector 1: the hue that the
- *                              sample leans to; or "On Target"
+ *                              sample leans to; or "On Target". Hue angles are subtracted as they
+ *                              are: from 359 to 1 degrees is 358 clockwise, "Too Blue"
  * @return 1; 0 for a null spectrum, an unknown combination, or a null text buffer that the selector
  *         needs. Every buffer holds at least 11 wide characters.
  */
@@ -390,31 +391,35 @@ VANTREL_API int GetNormalizedDensityWeights(int status, int response, double *we
  *  @{ */
 
 /**
- * The density of a spectrum.
+ * The density of a spectrum. Of the corrected densities of CalculateCCRDensities() only those of
+ * #CCR2_STATUS are given here; #CCR1_STATUS is read without the correction.
  * @param[in]  refl      spectrum, 31 values in percent
  * @param[in]  paper     spectrum of the paper, or null
  * @param[in]  status    density status
  * @param[in]  response  0 to 8; for #SPECTRAL_STATUS a wavelength of 391 to 709 nm (cut toward
- *                       400 nm to its band; the paper plays no part); for #SPECTRALX_STATUS a
- * request of 0 to 30 as in CalculateSpectralXDensity(); #CCR2_STATUS takes 9 to 30 as well and
- * answers 0
- * @param[out] density   density; 0 to 5 for the two spectral statuses
+ *                       400 nm to its band; the paper plays no part); for #SPECTRALX_STATUS
+ *                       a request of 0 to 30 as in CalculateSpectralXDensity()
+ * @param[out] density   density; 0 to 5 for the two spectral statuses. A response that the status
+ *                       does not measure has 5, or 0 over a paper; under #CCR2_STATUS, which takes
+ *                       4 to 30 for such, always 0
  * @return 1; 0 for a null `refl` or `density`, an unknown status, a response out of range.
  */
 VANTREL_API int ReflToDensity(const double *refl, const double *paper, int status, int response,
                               double *density);
 
 /**
- * Filter-weighted reflectance in percent, not below 0.001.
+ * Filter-weighted reflectance in percent, at least 0.00099999993. The weights are scaled by 0.00001
+ * in single precision: a perfect white has 99.9999975.
  * @return 1; 0 for a null pointer, an unknown status or a response outside 0 to 8.
  */
 VANTREL_API int ReflToReflDensity(const double *refl, int status, int response,
                                   double *weightedRefl);
 
 /**
- * The density set of a spectrum: every response that the status measures, 0 for the others. The two
- * spectral statuses give nine times the same density, #SPECTRAL_STATUS at the wavelength that
- * DetermineDensityResponse() chooses, #SPECTRALX_STATUS the visual density of Status T.
+ * The density set of a spectrum: every response that the status measures, 0 for the others; for the
+ * CCR statuses that of CalculateCCRDensities(). The two spectral statuses give nine times the same
+ * density, #SPECTRAL_STATUS at the wavelength that DetermineDensityResponse() chooses,
+ * #SPECTRALX_STATUS the visual density of Status T.
  * @return 1; 0 for a null `refl` or `densities` or an unknown status.
  */
 VANTREL_API int ReflToDensities(const double *refl, const double *paper, int status,
@@ -518,7 +523,7 @@ VANTREL_API int ChooseBPWavelen(const double *refl, const DENSITYPOINT *points, 
  * Sets the SpectralX constants, all five or, for a null pointer or a centre weight other than 1,
  * none.
  * @param[in] tolerance  how far above the lowest windowed sum (percent, not normalised) a band
- * still counts as a peak; 2
+ *                       still counts as a peak; 2
  * @param[in] reserved   kept and returned; 84
  * @param[in] centre     weight of the centre, 1
  * @param[in] inner      weight of the two bands next to it; 0.5
@@ -930,7 +935,8 @@ VANTREL_API int ReflToABErrorWeights(const double *first, const double *second, 
 VANTREL_API bool CIELabToCIELCh(CIELABCOORD *lab, CIELCHCOORD *lch, bool round);
 
 /**
- * L\*, a\*, b\*, C\*, h of a spectrum in single precision; C\* and h as ReflToCIELCH().
+ * L\*, a\*, b\*, C\*, h (five floats) of a spectrum in single precision; C\* and h as
+ * ReflToCIELCH().
  * @return 1; 0 for a null pointer or an unknown combination.
  */
 VANTREL_API int CalcLabch(const double *refl, ILLUM_OBS illumObs, float *labch);

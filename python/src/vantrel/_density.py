@@ -28,13 +28,15 @@ def refl_to_density(
     """Density (ISO 5-3, ISO 5-4) of spectra in percent, over a paper or absolute (None).
 
     The response is 0 to 8; for SPECTRAL_STATUS a wavelength of 391 to 709 nm (the paper plays no
-    part); for SPECTRALX_STATUS a request of 0 to 30 as in calculate_spectralx_density().
+    part); for SPECTRALX_STATUS a request of 0 to 30 as in calculate_spectralx_density(). One that
+    the status does not measure gives 5, over a paper or under CCR2_STATUS 0. CCR1_STATUS is read
+    without the correction of calculate_ccr_densities().
     """
 
 
 @function("refl")
 def refl_to_refl_density(spectra: "Spectra", status: "StatusName", response: "ResponseName"):
-    """Filter-weighted reflectance in percent, not below 0.001."""
+    """Filter-weighted reflectance in percent, at least 0.00099999993; 99.9999975 for a white."""
 
 
 @function("densities")

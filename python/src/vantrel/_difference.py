@@ -73,7 +73,8 @@ def verbal_color_difference(
     Arrays of str, or str for a single pair. A coordinate that differs by no more than 0.5 is "On
     Target"; the lightness is "Too Dark" or "Too Light". Selector 0 words a* and b* ("Too Green",
     "Too Red"; "Too Blue", "Too Yellow"), 1 chroma and hue ("Too Dull", "Too Bright"; the hue that
-    the sample leans to); any other words the lightness alone and leaves the colours "".
+    the sample leans to, 359 to 1 degrees being 358 clockwise); any other words the lightness alone
+    and leaves the colours "".
     """
 
 
