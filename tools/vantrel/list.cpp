@@ -79,8 +79,11 @@ List list_statuses()
                             : status == SPECTRALX_STATUS ? "V and bands 2 to 28"
                                                          : "";
         for (int response = 0; response < NUM_RESPONSES; ++response)
-            if (has_response(status, response))
-                codes += (codes.empty() ? "" : " ") + response_code(status, response);
+            if (has_response(status, response)) {
+                if (!codes.empty())
+                    codes += ' ';
+                codes += response_code(status, response);
+            }
         rows.push_back({std::string(status_name(status)), fmt::to_string(status), codes});
     }
     return list_of(
