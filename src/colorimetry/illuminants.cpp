@@ -9,6 +9,8 @@ struct Row {
 };
 
 // White points of ASTM E308; those of F12 are the sums of its weights in tristimulus_weights.cpp.
+// Hunter's constants: 175 and 70 for C_2DEG, for the others about 175 √(Xn / 98.074) and
+// 70 √(Zn / 118.232).
 // clang-format off
 constexpr Row kIlluminants[] = {
     {A_2DEG,    {{109.850, 100.000,  35.585}, 185.21, 38.41}},
