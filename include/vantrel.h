@@ -23,8 +23,8 @@
  *   of threads at once, as long as no thread calls a `Set…Constants` function (or writes
  *   #den_weight) meanwhile.
  *
- * Plain names have C linkage. The C++ section of each group carries the functions that take
- * typed records or references.
+ * Plain names have C linkage, from C99 on; what takes typed records or references stands in the
+ * C++ groups at the end, from C++11 on.
  */
 #ifndef VANTREL_H
 #define VANTREL_H
