@@ -166,6 +166,14 @@ TEST(OutputFile, IsReplacedWholeOrNotAtAll)
     EXPECT_EQ(content(file), report);
     EXPECT_EQ(std::distance(fs::directory_iterator(folder), {}), 2);
 
+    // Nor is a measurement written over.
+    fs::copy_file(example, folder / "sheet.txt");
+    fs::create_symlink("sheet.txt", folder / "other");
+    const std::string sheet = (folder / "sheet.txt").string();
+    expect_refusals("report", {{sheet + " -o " + (folder / "other").string(),
+                                sheet + " is to be read; -o would write over it\n"}});
+    EXPECT_EQ(content(sheet), content(example));
+
     for (const auto &[path, reason] : {std::pair{folder.string(), "Is a directory"},
                                        {file + "/x", "Not a directory"},
                                        {(folder / "no/x").string(), "No such file or directory"},

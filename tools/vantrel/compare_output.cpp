@@ -130,12 +130,15 @@ Json pair_json(const PairReport &pair, const Comparison &comparison)
 
 std::string as_table(const Comparison &comparison, bool colour)
 {
+    std::string paper = cut(comparison.reference_paper, widest_in_text);
+    if (comparison.sample_paper != comparison.reference_paper)
+        paper += ", the sample over " + cut(comparison.sample_paper, widest_in_text);
     Lines lines;
     lines.add(fmt::format("{} against {}: {} pairs by {}", comparison.sample, comparison.reference,
                           comparison.pairs.size(), name_of(comparison.paired_by)));
     lines.add(fmt::format("{}, metamerism with {}; {} over {}", name_of(comparison.illuminant),
                           name_of(comparison.second_illuminant), status_name(comparison.status),
-                          cut(comparison.reference_paper, widest_in_text)));
+                          paper));
     if (comparison.list_all) {
         std::vector<std::size_t> all(comparison.pairs.size());
         std::iota(all.begin(), all.end(), 0u);

@@ -1,7 +1,11 @@
 #include "options.h"
 
+#include <algorithm>
+#include <cmath>
 #include <cstdio>
 #include <cstdlib>
+#include <optional>
+#include <sys/stat.h>
 #include <unistd.h>
 
 #include <fmt/format.h>
@@ -10,6 +14,28 @@
 #include "names.h"
 #include "reader.h"
 #include "text.h"
+
+namespace {
+
+// The ink of a patch, all its percentages; nothing where its device values name no ink.
+std::optional<double> ink_on(const Patch &patch)
+{
+    std::optional<double> sum;
+    for (const auto &[field, percent] : patch.device)
+        if (!field.starts_with("RGB_"))
+            sum = sum.value_or(0) + std::abs(percent);
+    return sum;
+}
+
+bool is_same_file(const std::string &first, const std::string &second)
+{
+    struct stat one {
+    }, other{};
+    return stat(first.c_str(), &one) == 0 && stat(second.c_str(), &other) == 0 &&
+           S_ISREG(one.st_mode) && one.st_dev == other.st_dev && one.st_ino == other.st_ino;
+}
+
+} // namespace
 
 void add_common_options(CLI::App &command, Options &options)
 {
@@ -30,8 +56,10 @@ void add_sheet_options(CLI::App &command, Options &options)
         ->capture_default_str();
     command.add_option("--status", options.status, "Density status: " + status_names())
         ->capture_default_str();
-    command.add_option("--paper", options.paper,
-                       "The paper's patch by name or id (default: the first patch)");
+    command.add_option(
+        "--paper", options.paper,
+        "The paper's patch by name or id (default: the first patch without ink, or else the "
+        "first)");
     command
         .add_option("--scale", options.scale,
                     "Scale of a file's reflectances: auto, percent, or fraction for 0 to 1")
@@ -73,9 +101,20 @@ int status_of(const std::string &name)
     return *status;
 }
 
-const Patch &paper_of(const Measurement &sheet, const Options &options)
+const Patch &paper_of(const Measurement &sheet, Options &options)
 {
-    return options.paper.empty() ? sheet.patches.front() : patch_named(sheet, options.paper);
+    if (!options.paper.empty())
+        return patch_named(sheet, options.paper);
+    const auto bare = std::find_if(sheet.patches.begin(), sheet.patches.end(),
+                                   [](const Patch &patch) { return ink_on(patch) == 0; });
+    if (bare != sheet.patches.end())
+        return *bare;
+    const Patch &first = sheet.patches.front();
+    if (ink_on(first) > 0)
+        options.warnings.push_back(
+            fmt::format("{}: no patch is without ink, {} stands for the paper; --paper chooses",
+                        sheet.file, in_quotes(first.name)));
+    return first;
 }
 
 ILLUM_OBS usual_second(ILLUM_OBS first)
@@ -89,6 +128,8 @@ ILLUM_OBS usual_second(ILLUM_OBS first)
 Measurement sheet_of(const std::string &path, Options &options)
 {
     const std::string file = printable(path);
+    if (!options.output.empty() && is_same_file(path, options.output))
+        throw RequestError{file + " is to be read; -o would write over it"};
     try {
         Reading reading;
         if (options.scale != "auto")

@@ -52,12 +52,15 @@ void add_order_option(CLI::App &command, std::vector<std::string> &order);
 // What the options name; throw RequestError.
 ILLUM_OBS illuminant_of(const std::string &name);
 int status_of(const std::string &name);
-const Patch &paper_of(const Measurement &sheet, const Options &options);
+
+// The patch that the options name, or else the first without ink, as its device values tell, or
+// else the first. Throws RequestError.
+const Patch &paper_of(const Measurement &sheet, Options &options);
 
 // Illuminant A beside daylight and lamps, D65 beside A, with the same observer.
 ILLUM_OBS usual_second(ILLUM_OBS first);
 
-// Reads a file; throws RequestError.
+// Reads a file, which is not the output; throws RequestError.
 Measurement sheet_of(const std::string &path, Options &options);
 
 bool shows_colour(const Options &options);

@@ -169,7 +169,8 @@ function columnsOf(sheet) {
 function sheetSection(sheet, id, heading) {
   const solids = solidsOf(sheet);
   const curves = toneCurves(sheet, solids);
-  const paperPatch = sheet.patches.find((patch) => patch.name === sheet.paper.name);
+  const paperPatch = sheet.patches.find((patch) =>
+    patch.name === sheet.paper.name && patch.de00_to_paper === 0);
   const always = new Set([paperPatch, ...solids.values()].filter(Boolean));
   const thinned = [...always, ...spread(sheet.patches.filter((patch) => !always.has(patch)),
     mostPoints)];
