@@ -109,9 +109,10 @@ std::string complaint_of(const std::string &text, const Reading &reading = {})
 
 TEST(Reader, KnowsEveryNameOfASpectralColumn)
 {
-    for (const char *form : {"SPECTRAL_NM{:g}", "SPECTRAL_NM_{:g}", "SPECTRAL_{:g}", "SPEC_{:g}",
-                             "NM{:g}", "nm{:g}", "NM_{:g}", "SPECTRUM_{:g}", "R_{:g}", "R{:g}",
-                             "{:g}NM", "{:g} nm", "{:g}", "Spectral_nm{:g}"}) {
+    for (const char *form :
+         {"SPECTRAL_NM{:g}", "SPECTRAL_NM_{:g}", "SPECTRAL_{:g}", "SPEC_{:g}", "NM{:g}", "nm{:g}",
+          "NM_{:g}", "SPECTRUM_{:g}", "R_{:g}", "R{:g}", "{:g}NM", "{:g} nm", "{:g}",
+          "Spectral_nm{:g}", "Refl {:g} nm [%]", "Reflectance_{:g}", "{:g}nm (%)"}) {
         const std::string names = fields(form, "\t"), down = fields(form, "\t", 700, 400, 10);
         expect_line(read_measurement(cgats(names, values(0, "\t")), {}), form);
         expect_line(read_measurement(replaced(names, "\t", ",") + "\n" + values(0, ","), {}), form);
@@ -156,6 +157,9 @@ TEST(Reader, ReadsTheDialectsOfCgats)
         {"empty column", cgats("LAB_L\t\t" + named, "-\t\t" + replaced(rows, "\nA2", "\n-\t\tA2"))},
         {"counts", "NUMBER_OF_SETS 7\nNUMBER_OF_FIELDS \"33\"\n" + plain, "First one|2 nd",
          "1: NUMBER_OF_SETS is 7, but 2 follow"},
+        {"inks of another scale",
+         cgats("CMYK_K\t" + named, "0\t" + replaced(rows, "\nA2", "\n255\tA2")), "First one|2 nd",
+         " the largest ink value is 255; they are taken for percentages"},
         {"a table before", cgats("SAMPLE_ID LAB_L", "1 50") + plain},
         {"joined tables", cgats(named, rows.substr(0, rows.find('\n'))) +
                               cgats(named, rows.substr(rows.find('\n') + 1))},

@@ -135,12 +135,26 @@ void Sheet::bring_to_percent()
         }
 }
 
+// On another scale the device values are no tints: nothing is printed at 100 %.
+void Sheet::check_inks()
+{
+    double largest = 0;
+    for (const Patch &patch : patches)
+        for (const auto &[field, percent] : patch.device)
+            if (!field.starts_with("RGB_"))
+                largest = std::max(largest, percent);
+    if (largest > 100 || (largest > 0 && largest <= 1))
+        warn(0,
+             fmt::format("the largest ink value is {:g}; they are taken for percentages", largest));
+}
+
 Measurement Sheet::measurement()
 {
     if (patches.empty())
         throw InputError{0, "no spectra in this file"};
     choose_condition();
     bring_to_percent();
+    check_inks();
     return {.file = {},
             .patches = std::move(patches),
             .source = std::move(origin),

@@ -44,6 +44,7 @@ public:
 private:
     void choose_condition();
     void bring_to_percent();
+    void check_inks();
 
     Reading reading;
     Source origin; // that of the first patch

@@ -91,7 +91,13 @@ std::optional<double> wavelength_of(std::string_view field)
     if (field.find_first_of("0123456789") == std::string_view::npos || field.size() > 32)
         return std::nullopt;
     std::string name = upper(field);
-    for (const std::string_view prefix : {"SPECTRAL_NM", "SPECTRAL", "SPECTRUM", "SPEC", "NM", "R"})
+    for (const std::string_view unit : {"%", "[%]", "(%)"})
+        if (name.ends_with(unit)) {
+            name.resize(name.find_last_not_of(' ', name.size() - unit.size() - 1) + 1);
+            break;
+        }
+    for (const std::string_view prefix :
+         {"SPECTRAL_NM", "SPECTRAL", "SPECTRUM", "SPEC", "NM", "REFLECTANCE", "REFL", "R"})
         if (name.starts_with(prefix)) {
             name.erase(0, prefix.size());
             break;
