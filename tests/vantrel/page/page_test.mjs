@@ -109,6 +109,24 @@ test('a comparison opens with its verdict and shows its pairs', async () => {
   }
 });
 
+test('a histogram counts every patch', async () => {
+  const same = ['compare', example, example];
+  for (const words of [commands.report, commands.compare, same]) {
+    const page = await open(words);
+    const counted = await page.$$eval('.plot svg:has([aria-label=rect])', ([svg]) => {
+      const ticks = [...svg.querySelectorAll('[aria-label="y-axis tick label"] text')]
+        .filter((tick) => tick.textContent);
+      const [low, high] = [ticks[0], ticks.at(-1)].map((tick) =>
+        ({ count: Number(tick.textContent), y: tick.getBoundingClientRect().y }));
+      return [...svg.querySelectorAll('[aria-label=rect] rect')]
+        .reduce((sum, bar) => sum + bar.getBoundingClientRect().height, 0) *
+        (high.count - low.count) / (low.y - high.y);
+    });
+    assert.equal(Math.round(counted), lines.length);
+    await page.close();
+  }
+});
+
 test('predictions show both models and the measurement', async () => {
   const page = await open(commands.predict);
   const rows = await rowsOf(page);

@@ -151,17 +151,25 @@ export function planePlot(points, paper) {
   };
 }
 
+// 1, 2 or 5 times a power of ten.
+function roundStep(least) {
+  const power = 10 ** Math.floor(Math.log10(least));
+  return power * ([1, 2, 5].find((times) => times * power >= least) ?? 10);
+}
+
 export function histogramPlot(values, label, limit) {
   const marked = limit === null || limit === undefined ? [] : [limit];
   const top = [...marked, ...values].reduce((a, b) => Math.max(a, b), 0.1);
+  const step = roundStep(top / 20);
+  const thresholds = Array.from({ length: Math.floor(top / step) + 2 }, (_, i) => i * step);
   return (width) => ({
     height: Math.min(340, Math.max(240, width * 0.6)),
-    x: { label, zero: true, nice: true },
+    x: { label, domain: [0, thresholds.at(-1)], nice: true },
     y: { label: 'Patches', grid: true, ticks: 5, tickSize: 0,
       tickFormat: (value) => (Number.isInteger(value) ? value.toLocaleString('en') : '') },
     marks: [
-      Plot.rectY(values, Plot.binX({ y: 'count' }, { x: (value) => value, domain: [0, top],
-        thresholds: 20, fill: 'currentColor', fillOpacity: 0.55, tip: true })),
+      Plot.rectY(values, Plot.binX({ y: 'count' }, { x: (value) => value, thresholds,
+        fill: 'currentColor', fillOpacity: 0.55, tip: true })),
       Plot.ruleY([0]),
       Plot.ruleX(marked, { stroke: 'var(--fail)', strokeWidth: 2 }),
       Plot.text(marked, { x: (value) => value, frameAnchor: 'top', dy: -12, fill: 'var(--fail)',
