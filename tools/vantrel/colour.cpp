@@ -2,14 +2,25 @@
 
 #include <fmt/format.h>
 
-Colour colour_of(const Spectrum &refl, ILLUM_OBS illuminant)
+CIELABCOORD lab_of(const Spectrum &refl, ILLUM_OBS illuminant)
 {
     double lab[3];
     ReflToCIELAB(refl.data(), illuminant, lab);
+    return {lab[0], lab[1], lab[2]};
+}
+
+Colour colour_of(const Spectrum &refl, ILLUM_OBS illuminant)
+{
+    const bool ten_degrees = illuminant % 2 == 1;
+    return {lab_of(refl, illuminant), preview_of(refl, ten_degrees ? D65_10DEG : D65_2DEG)};
+}
+
+Rgb preview_of(const Spectrum &refl, ILLUM_OBS illuminant)
+{
     unsigned int rgb = 0;
     ReflToRGB(refl.data(), illuminant, &rgb);
     const auto level = [&](int shift) { return static_cast<std::uint8_t>(rgb >> shift & 0xFF); };
-    return {{lab[0], lab[1], lab[2]}, {level(0), level(8), level(16)}};
+    return {level(0), level(8), level(16)};
 }
 
 CIELCHCOORD lch_of(const CIELABCOORD &lab)

@@ -17,7 +17,15 @@ struct Colour {
     Rgb rgb;
 };
 
+CIELABCOORD lab_of(const Spectrum &refl, ILLUM_OBS illuminant);
+
+// The preview is that under D65, the white of displays: under another illuminant white paper would
+// look tinted beside it.
 Colour colour_of(const Spectrum &refl, ILLUM_OBS illuminant);
+
+// As it looks under this illuminant to an eye that is adapted to the display.
+Rgb preview_of(const Spectrum &refl, ILLUM_OBS illuminant);
+
 CIELCHCOORD lch_of(const CIELABCOORD &lab);
 double delta_e00(const CIELABCOORD &first, const CIELABCOORD &second);
 std::string hex(const Rgb &rgb); // #rrggbb

@@ -21,10 +21,10 @@ IlluminantReading under_illuminant(const Spectrum &refl, const Spectrum *other, 
                                    ILLUM_OBS illuminant)
 {
     IlluminantReading out;
-    out.colour = colour_of(refl, illuminant);
+    out.colour = {lab_of(refl, illuminant), preview_of(refl, illuminant)};
     out.lch = lch_of(out.colour.lab);
     if (other) {
-        out.other = colour_of(*other, illuminant);
+        out.other = {lab_of(*other, illuminant), preview_of(*other, illuminant)};
         out.de00 = delta_e00(out.other->lab, out.colour.lab);
         double metamerism = 0, din6172 = 0;
         Metamerism(other->data(), refl.data(), chosen, illuminant, &metamerism);
@@ -40,7 +40,7 @@ IlluminantReading under_illuminant(const Spectrum &refl, const Spectrum *other, 
 PatchStudy study_of(const Measurement &sheet, const Inks &inks, const Request &request,
                     const Patch &patch, const Patch *other)
 {
-    const CIELABCOORD paper = colour_of(request.paper->refl, request.illuminant).lab;
+    const CIELABCOORD paper = lab_of(request.paper->refl, request.illuminant);
     PatchStudy out{.file = sheet.file,
                    .illuminant = request.illuminant,
                    .status = request.status,

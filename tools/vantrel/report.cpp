@@ -73,7 +73,7 @@ PatchReport patch_report(const Patch &patch, const Inks &inks, const Request &re
 PaperReport paper_report(const Patch &paper, ILLUM_OBS illuminant)
 {
     PaperReport out{.name = paper.name,
-                    .lab = colour_of(paper.refl, illuminant).lab,
+                    .lab = lab_of(paper.refl, illuminant),
                     .brightness = 0,
                     .whiteness = {},
                     .no_whiteness = {}};
