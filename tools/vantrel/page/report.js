@@ -26,9 +26,16 @@ function solidsOf(sheet) {
   return solids;
 }
 
+// The patch of a solid, and its ink where the name of the patch, a number say, does not tell it.
+const processInks = { CMYK_C: 'Cyan', CMYK_M: 'Magenta', CMYK_Y: 'Yellow', CMYK_K: 'Black' };
+function solidName(ink, patch) {
+  const called = processInks[ink] ?? ink;
+  return patch.toLowerCase().includes(called.toLowerCase()) ? patch : `${patch} (${called})`;
+}
+
 // One curve an ink, from paper to solid.
 const toneCurves = (sheet, solids) => sheet.tone_values.map(({ ink, solid, values }) =>
-  ({ name: solid, rgb: solids.get(ink)?.rgb ?? 'gray', points: [
+  ({ name: solidName(ink, solid), rgb: solids.get(ink)?.rgb ?? 'gray', points: [
     { nominal: 0, area: 0, gain: 0 },
     ...values.map((value) =>
       ({ nominal: value.nominal, area: value.dot_area, gain: value.dot_gain })),
@@ -45,9 +52,9 @@ function keyFigures(sheet, solids) {
     paper.metamerism && ['Metamerism', fixed(paper.metamerism.sum),
       ['to ', named(paper.metamerism.paper), ` under ${paper.metamerism.illuminant}; DIN 6172 ` +
         fixed(paper.metamerism.din6172)]],
-    ...[...solids.values()].slice(0, 8).map((solid) =>
+    ...[...solids].slice(0, 8).map(([ink, solid]) =>
       [['Density ', swatch(solid.rgb)], fixed(solid.density, 3),
-        [named(solid.name), solid.response ? `, ${solid.response}` : '']]),
+        [named(solidName(ink, solid.name)), solid.response ? `, ${solid.response}` : '']]),
     gain && ['Largest gain', fixed(gain.dot_gain), named(gain.name)],
     contrast && ['Largest contrast', fixed(contrast.print_contrast), named(contrast.name)],
   ].filter(Boolean));
@@ -180,7 +187,8 @@ function sheetSection(sheet, id, heading) {
   const farthest = largest(sheet.patches, 'de00_to_paper');
   const series = [
     ...(paperPatch ? [{ ...paperPatch, dashed: true }] : []),
-    ...[...solids.values()].slice(0, 12),
+    ...[...solids].slice(0, 12).map(([ink, solid]) =>
+      ({ ...solid, name: solidName(ink, solid.name) })),
   ];
   const spectra = spectraPicture(series, () => 'The paper (broken line)' +
     `${solids.size ? ` and ${count(solids.size, 'solid')}` : ''}; choose patches in the table ` +
