@@ -73,6 +73,15 @@ TEST(Compare, PairsByNameOrIdOrPlace)
     const std::string shorter = scratch("shorter");
     std::ofstream(shorter) << strange.substr(0, strange.find("\nA30\t")) << "\nEND_DATA\n";
 
+    // Rows without names or ids have none in common with the ids 1 and 2.
+    const std::string nameless = scratch("nameless");
+    std::string head, row;
+    for (int nm = 400; nm <= 700; nm += 10) {
+        head += fmt::format("{},", nm);
+        row += "50,";
+    }
+    std::ofstream(nameless) << head << '\n' << row << '\n' << row << '\n';
+
     EXPECT_EQ(compared(example)["paired_by"], "name");
     EXPECT_EQ(compared(by_id)["paired_by"], "id");
     EXPECT_EQ(compared(by_order)["paired_by"], "order");
@@ -82,17 +91,19 @@ TEST(Compare, PairsByNameOrIdOrPlace)
     for (const std::string &file : {by_id, by_order})
         EXPECT_EQ(compared(file)["statistics"]["de2000"]["max"], 0.0);
 
-    expect_refusals("compare " + example,
-                    {{shorter, example + " has 31 patches and " + shorter + " has 29, most of"},
-                     {by_order + " --pair name", "no patch of " + example + " has a partner in "},
-                     {example + " --formula de2001", "no formula \"de2001\"; there are de2000"},
-                     {example + " --formula cmc,CMC", "the formula cmc is named twice"},
-                     {example + " --weights cmc=2,1", "--weights of cmc, which --formula does not"},
-                     {example + " --weights de2000=0,1", "--weights takes two numbers above 0"},
-                     {example + " --weights 2,1", "--weights takes FORMULA=LIGHTNESS,CHROMA"},
-                     {example + " --tolerance=-1", "--tolerance takes a number from 0 up"},
-                     {example + " --tolerance nan", "--tolerance takes a number from 0 up"},
-                     {"/nowhere", "/nowhere: No such file or directory"}});
+    expect_refusals(
+        "compare " + example,
+        {{shorter, example + " has 31 patches and " + shorter + " has 29, most without"},
+         {nameless, example + " has 31 patches and " + nameless + " has 2, most"},
+         {by_order + " --pair name", "no patch of " + example + " has a partner in "},
+         {example + " --formula de2001", "no formula \"de2001\"; there are de2000"},
+         {example + " --formula cmc,CMC", "the formula cmc is named twice"},
+         {example + " --weights cmc=2,1", "--weights of cmc, which --formula does not"},
+         {example + " --weights de2000=0,1", "--weights takes two numbers above 0"},
+         {example + " --weights 2,1", "--weights takes FORMULA=LIGHTNESS,CHROMA"},
+         {example + " --tolerance=-1", "--tolerance takes a number from 0 up"},
+         {example + " --tolerance nan", "--tolerance takes a number from 0 up"},
+         {"/nowhere", "/nowhere: No such file or directory"}});
 }
 
 TEST(Compare, TellsByItsExitStatusWhetherTheSheetPasses)

@@ -275,6 +275,7 @@ void Reader::read_object(const Node &object)
                 .name = printable(trimmed(attribute(object, "Name"))),
                 .refl = {},
                 .device = device_values(object)};
+    sheet.named = sheet.named || !patch.id.empty() || !patch.name.empty();
     if (patch.id.empty())
         patch.id = std::to_string(sheet.patches.size() + 1);
     if (patch.name.empty())

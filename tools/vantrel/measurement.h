@@ -44,6 +44,7 @@ struct Reading {
 struct Measurement {
     std::string file;           // its name, safe to print
     std::vector<Patch> patches; // at least one
+    bool named = false;         // the file has names or ids; without any, places stand for them
     Source source;
     std::vector<std::string> warnings; // one line each, without the file name
 };

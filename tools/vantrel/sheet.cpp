@@ -157,6 +157,7 @@ Measurement Sheet::measurement()
     check_inks();
     return {.file = {},
             .patches = std::move(patches),
+            .named = named,
             .source = std::move(origin),
             .warnings = std::move(warnings)};
 }

@@ -37,6 +37,7 @@ public:
     void warn(std::size_t line, const std::string &text);
 
     std::vector<Patch> patches;
+    bool named = false; // any of them, by a name or an id of its own
 
     // Throws InputError.
     Measurement measurement();

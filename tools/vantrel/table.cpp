@@ -230,6 +230,7 @@ void Table::add(const Row &row, Condition given, std::size_t line)
                 name = i;
     Patch patch{
         .id = text_at(row, id), .name = text_at(row, name), .refl = at.of(refl), .device = {}};
+    sheet.named = sheet.named || ink != none || !patch.id.empty() || !patch.name.empty();
     if (patch.id.empty())
         patch.id = std::to_string(sheet.patches.size() + 1);
     if (patch.name.empty() && ink == none)
