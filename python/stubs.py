@@ -47,7 +47,10 @@ def declaration(name, function):
     elif name.startswith("set_"):
         result = "None"
     line = f"def {name}({', '.join(parameters)}) -> {result}: ..."
-    return textwrap.fill(line, 96, subsequent_indent="    ", break_long_words=False)
+    if len(line) <= 96:
+        return line
+    inside = textwrap.fill(", ".join(parameters), 96, initial_indent="    ", subsequent_indent="    ")
+    return f"def {name}(\n{inside}\n) -> {result}: ..."
 
 
 def stubs():

@@ -1,5 +1,7 @@
 """What NumPy users expect of the functions: any shape, layout and type, and clear refusals."""
 
+import ast
+import pydoc
 import runpy
 import warnings
 from concurrent.futures import ThreadPoolExecutor
@@ -44,6 +46,8 @@ def test_memory_layout_changes_no_bit(lay_out):
         vantrel.pol_refl_auto_adjust(laid_out, targets, weights),
         vantrel.pol_refl_auto_adjust(SPECTRA, targets.copy(), weights.copy(order="C")),
     )
+    wide = np.ones((250, 2))[:, 0]  # more than a row has room for
+    assert vantrel.calculate_special_density(PAPER, 15, wide) == 0
 
 
 @pytest.mark.parametrize("illum_obs", vantrel.IllumObs)
@@ -63,7 +67,9 @@ def test_everything_broadcasts():
     assert densities[1, 1] == vantrel.refl_to_density(
         SPECTRA[0, 0], PAPER, vantrel.Status.T_STATUS, vantrel.Response.BLUE_RESPONSE
     )
-    lab = vantrel.refl_to_cielab(SPECTRA, np.arange(5))
+    mixed = ["RED", 3, vantrel.Response.VISUAL_RESPONSE]
+    assert np.array_equal(vantrel.refl_to_density(SPECTRA[0, 0], PAPER, statuses, mixed), densities)
+    lab = vantrel.refl_to_cielab(SPECTRA, np.arange(5, dtype=np.uint64))
     assert np.array_equal(lab[:, 3], vantrel.refl_to_cielab(SPECTRA[:, 3], "C_10DEG"))
     delta_e = vantrel.lab_to_de2000(lab[:, None], lab[None, :], kL=[1, 1, 2, 2, 3])
     assert delta_e.shape == (6, 6, 5) and np.all(np.diagonal(delta_e) == 0)
@@ -119,9 +125,14 @@ def test_a_refused_row_is_nan_without_a_warning():
         (lambda: vantrel.refl_to_xyz(SPECTRA, "D51_2DEG"), "illum_obs: .*D51_2DEG.*D50_2DEG"),
         (lambda: vantrel.refl_to_xyz(SPECTRA, [4, 18, 4, 4, 4]), "illum_obs: 18 is not one of"),
         (lambda: vantrel.refl_to_xyz(SPECTRA, 4.5), "whole numbers"),
+        (lambda: vantrel.refl_to_xyz(SPECTRA, np.inf), "illum_obs: whole numbers"),
+        (lambda: vantrel.refl_to_xyz(SPECTRA, vantrel.Status.E_STATUS), "no <Status.E_STATUS: 1>"),
+        (lambda: vantrel.refl_to_xyz(np.ma.masked_greater(SPECTRA, 90)), "spectra: masked"),
         (lambda: vantrel.refl_to_xyz(None), "spectra: None"),
         (lambda: vantrel.refl_to_xyz(["a"] * 31), "spectra: numbers"),
         (lambda: vantrel.refl_to_density(SPECTRA, PAPER[1:], "E", 1), "paper.* 31"),
+        (lambda: vantrel.refl_to_density(SPECTRA, [], "E", 1), "paper.* 31 bands .* not 0"),
+        (lambda: vantrel.pol_refl_to_densities(PAPER, [1] * 4, PAPER, None, [PAPER] * 4, 1), "targets"),
         (lambda: vantrel.refl_to_density(SPECTRA, None, "SPECTRAL", 390), "390 .* 391 to 709"),
         (lambda: vantrel.refl_to_density(SPECTRA, None, ["E", "T"], 9), "shape|9 is not from 0"),
         (lambda: vantrel.refl_to_density(SPECTRA, None, -1, 1), "status: -1"),
@@ -131,13 +142,16 @@ def test_a_refused_row_is_nan_without_a_warning():
         (lambda: vantrel.estimate_refls(SPECTRA[0, :2], [50, 5.5], PAPER), "percent: whole"),
         (lambda: vantrel.lab_to_de_lab(SPECTRA[..., :3], np.ones((4, 3))), "broadcast"),
         (lambda: vantrel.set_spectralx_constants(2, 84, 1.5, 0.5, 0.1), "centre must be 1"),
+        (lambda: vantrel.set_spectralx_constants(2, 84, 1, np.nan, 0.1), "NaN"),
         (lambda: vantrel.set_achromatic_constants(50, 50, 3, 11), "no finite line"),
         (lambda: vantrel.set_hifi_constants([500, 510]), "wavelengths: 3 values"),
     ],
 )
 def test_a_wrong_call_says_why(call, reason):
+    constants = vantrel.get_spectralx_constants()
     with pytest.raises(ValueError, match=reason):
         call()
+    assert vantrel.get_spectralx_constants() == constants
 
 
 def test_threads_run_side_by_side_and_agree():
@@ -171,5 +185,7 @@ def test_words_are_strings():
 
 def test_the_type_stubs_are_those_of_the_functions():
     folder = Path(__file__).parents[1]
-    namespace = runpy.run_path(folder / "stubs.py")
-    assert namespace["stubs"]() == (folder / "src/vantrel/__init__.pyi").read_text()
+    written = (folder / "src/vantrel/__init__.pyi").read_text()
+    assert runpy.run_path(folder / "stubs.py")["stubs"]() == written
+    ast.parse(written)
+    assert "    refl_to_trap(" in pydoc.render_doc(vantrel, renderer=pydoc.plaintext)

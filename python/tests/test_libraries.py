@@ -59,6 +59,10 @@ def test_xarray_names_its_dimensions():
     assert vantrel.refl_to_cielab(image).dims == ("y", "x", "lab")
     adjusted = vantrel.adjust_for_paper_refls(image, xr.DataArray(PAPER, dims="nm"))
     assert adjusted.dims == ("y", "x", "nm") and np.array_equal(adjusted.nm, image.nm)
+    status, response = xr.DataArray([1, 3], dims="s"), xr.DataArray([1, 2, 3], dims="r")
+    assert set(vantrel.refl_to_density(image, PAPER, status, response).dims) == set("yxsr")
+    with pytest.raises(ValueError, match="3 is not from 391"):
+        vantrel.refl_to_density(image, PAPER, xr.DataArray([1, 4, 4], dims="s"), response + 2)
 
 
 def test_none_of_them_is_needed():
@@ -72,3 +76,5 @@ def test_none_of_them_is_needed():
 def test_what_they_cannot_do_is_said():
     with pytest.raises(TypeError, match="out="):
         vantrel.refl_to_xyz(da.from_array(IMAGE), out=np.empty((14, 10, 3)))
+    with pytest.raises(ValueError, match="integers"):
+        vantrel.refl_to_xyz(IMAGE, da.from_array(np.full(10, 4.5)))

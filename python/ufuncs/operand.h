@@ -27,6 +27,9 @@ struct Optional {
     const double *values;
 };
 
+/// Room for the largest core that is copied: four curves of 31 weights.
+constexpr int kLargestCore = 4 * VANTREL_BANDS;
+
 struct Operand {
     char *row = nullptr;
     npy_intp step = 0;       ///< bytes to the next row
@@ -41,11 +44,12 @@ struct Operand {
                (counts[0] == 1 || strides[0] == counts[1] * width);
     }
 
-    /// Calls visit(i, address) for the values of the core in order.
+    /// Calls visit(i, address) for the values of the core in order. No function looks further than
+    /// the room of a copy, however long its core.
     template <class Visit> void each(Visit visit) const
     {
         for (npy_intp i = 0, value = 0; i < counts[0]; ++i)
-            for (npy_intp j = 0; j < counts[1]; ++j, ++value)
+            for (npy_intp j = 0; j < counts[1] && value < kLargestCore; ++j, ++value)
                 visit(value, row + i * strides[0] + j * strides[1]);
     }
 };
@@ -80,9 +84,6 @@ template <class Element> constexpr Element refused()
         return static_cast<Element>(-1);
 }
 
-/// Room for the largest core that is copied: four curves of 31 weights.
-constexpr int kLargestCore = 4 * VANTREL_BANDS;
-
 /// A number handed over by value. Integers are 64 bits wide in NumPy and saturate.
 template <class P> struct Argument : Operand {
     static_assert(std::is_arithmetic_v<P> || std::is_enum_v<P>);
@@ -109,7 +110,7 @@ template <class P> struct Argument<const P *> : Operand {
     bool usable()
     {
         direct = type == NPY_DOUBLE && side_by_side(sizeof(double));
-        return direct || size() <= kLargestCore;
+        return true;
     }
     const P *get()
     {

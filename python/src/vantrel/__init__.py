@@ -134,3 +134,4 @@ from ._constants import (
 )
 
 __version__ = ufuncs.version
+__all__ = [name for name in dir() if not name.startswith("_")]  # what help() lists

@@ -4,11 +4,14 @@ A declaration names the kind of an argument as its annotation. Arrays of other l
 on as they are; what has not been computed yet is not looked into.
 """
 
+from enum import IntEnum
+
 import numpy as np
 
 from ._enums import IllumObs, Response, Status
 
 BANDS = 31
+MISSING = np.empty(0)  # what a ufunc takes for a spectrum that is not there
 
 
 def library_of(value):
@@ -20,23 +23,37 @@ def is_lazy(value):
     return hasattr(value, "__dask_graph__") and value.__dask_graph__() is not None
 
 
+def as_numpy(value):
+    """A list, say, and a table of pandas as an array of NumPy."""
+    if library_of(value) == "pandas" or not hasattr(value, "__array_ufunc__"):
+        return np.asarray(value)
+    return value
+
+
 def as_array(value, name):
-    """An array of numbers; a list, say, becomes one of NumPy."""
+    """An array of numbers."""
     if isinstance(value, (int, float)):
         return value
-    if not hasattr(value, "__array_ufunc__"):
-        value = np.asarray(value)
-    if value.dtype.kind not in "fiub":
-        raise ValueError(f"{name}: numbers are needed, not {value.dtype}")
-    return value
+    value = as_numpy(value)
+    dtype = getattr(value, "dtype", type(value).__name__)
+    if getattr(dtype, "kind", None) not in tuple("fiub"):
+        raise ValueError(f"{name}: numbers are needed, not {dtype}")
+    if np.ma.is_masked(value):
+        raise ValueError(f"{name}: masked values have no result; fill them first")
+    if isinstance(value, np.ma.MaskedArray):
+        value = value.data
+    return value.astype(np.float64) if dtype.itemsize > 8 else value
 
 
 def as_integers(value, name):
     value = as_array(value, name)
-    kind = value.dtype.kind if hasattr(value, "dtype") else np.asarray(value).dtype.kind
-    if kind in "iub":
+    lazy = is_lazy(value)
+    numbers = value if lazy else np.asarray(value)
+    if np.can_cast(numbers.dtype, np.int64):
         return value
-    if kind != "f" or not (is_lazy(value) or np.all(np.trunc(value) == value)):
+    if lazy:
+        raise ValueError(f"{name}: integers are needed, not {numbers.dtype} yet to be computed")
+    if numbers.dtype.kind == "O" or not np.all((np.trunc(numbers) == numbers) & (abs(numbers) < 2.0**63)):
         raise ValueError(f"{name}: whole numbers are needed")
     return value.astype(np.int64) if hasattr(value, "astype") else int(value)
 
@@ -51,24 +68,24 @@ class Index:
         for name, number in list(self.numbers.items()):
             self.numbers.setdefault(name.removesuffix("_STATUS").removesuffix("_RESPONSE"), number)
 
-    def number(self, text, name):
-        try:
-            return self.numbers[text]
-        except KeyError:
-            known = ", ".join(member.name for member in self.members)
-            raise ValueError(f"{name}: there is no {text!r} among {known}") from None
+    def number(self, item, name):
+        foreign = isinstance(item, IntEnum) and not isinstance(item, self.members)
+        if isinstance(item, str) and item in self.numbers:
+            return self.numbers[item]
+        if isinstance(item, (int, np.integer)) and not foreign:
+            return int(item)
+        known = ", ".join(member.name for member in self.members)
+        raise ValueError(f"{name}: there is no {item!r} among {known}")
 
     def convert(self, value, name):
-        if isinstance(value, str):
+        if isinstance(value, (str, int, np.integer)):
             return self.number(value, name)
-        if isinstance(value, (int, np.integer)):
-            return int(value)
-        if not hasattr(value, "__array_ufunc__"):
-            value = np.asarray(value)
-        if isinstance(value, np.ndarray) and value.dtype.kind in "UO":
-            numbers = [x if isinstance(x, int) else self.number(x, name) for x in value.flat]
-            value = np.array(numbers, dtype=np.int64).reshape(value.shape)
-        return as_integers(value, name)
+        array = as_numpy(value)
+        if isinstance(array, np.ndarray) and array.dtype.kind in "UTO":
+            items = np.asarray(value, dtype=object)  # a list may hold names and numbers
+            numbers = [self.number(item, name) for item in items.flat]
+            array = np.array(numbers, dtype=np.int64).reshape(items.shape)
+        return as_integers(array, name)
 
     def check(self, value, name):
         if isinstance(value, int):
@@ -107,17 +124,17 @@ _READINGS[Status.CCR2_STATUS] = 0, BANDS - 1
 
 def check_reading(status, response, name):
     """The range of a response depends on the status: a filter, a wavelength or a band."""
-    status, response = np.asarray(status), np.asarray(response)
-    low, high = _READINGS[status, 0], _READINGS[status, 1]
-    bad = (response < low) | (response > high)
-    if bad.any():
-        # a bare number says most; pick the first of an array
-        response, low, high, status = np.broadcast_arrays(response, low, high, status)
-        i = tuple(np.argwhere(bad)[0])
-        raise ValueError(
-            f"{name}: {response[i]} is not from {low[i]} to {high[i]}, "
-            f"as {Status(status[i]).name} takes it"
-        )
+    for number in np.unique(status):
+        low, high = _READINGS[number]
+        bad = (status == number) & ((response < low) | (response > high))
+        if np.any(bad):
+            wrong = response
+            if not isinstance(response, int):
+                wrong = np.asarray(0 * bad + response)[np.asarray(bad)].flat[0]
+            raise ValueError(
+                f"{name}: {wrong} is not from {low} to {high}, "
+                f"as {Status(number).name} takes it"
+            )
 
 
 def check_inks(value, name):
@@ -129,7 +146,7 @@ def convert(kind, value, name):
     """An argument as its ufunc takes it."""
     if value is None:
         if kind == "OptionalSpectra":
-            return np.empty(0)  # a core of no values
+            return MISSING
         if kind == "OptionalTargets":
             return np.zeros(4)  # not read without a paper
         raise ValueError(f"{name}: None is not accepted")
@@ -151,9 +168,9 @@ _MEANING = {BANDS: " bands (400 to 700 nm in steps of 10 nm)"}
 
 def check_core(value, core, kind, name):
     """The last dimensions of an array against those of its ufunc."""
-    shape = np.shape(value)
-    if kind == "OptionalSpectra" and shape == (0,):
+    if value is MISSING:
         return
+    shape = np.shape(value)
     sizes = [BANDS if kind == "OptionalSpectra" else int(c) if c.isdigit() else None for c in core]
     if len(shape) < len(sizes):
         raise ValueError(f"{name}: {len(sizes)} dimensions are needed at least, not {len(shape)}")

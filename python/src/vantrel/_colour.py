@@ -1,4 +1,7 @@
-"""From spectra to colours, and from one colour space to another."""
+"""From spectra to colours, and from one colour space to another.
+
+XYZ has Y = 100 for the perfect white; angles are in degrees.
+"""
 
 from ._function import function
 

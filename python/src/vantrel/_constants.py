@@ -68,7 +68,8 @@ def _set(setter, getter, values, reason):
     if any(value is None for value in values):
         raise ValueError("None is not accepted")
     values = tuple(float(value) for value in values)
-    setter(*[np.array([value]) for value in values])
+    if not any(np.isnan(values)):
+        setter(*[np.array([value]) for value in values])
     if getter() != values:
         raise ValueError(reason)
 

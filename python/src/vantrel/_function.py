@@ -15,7 +15,7 @@ _OUT = """
     `out`: array, or tuple of arrays, that takes the result (not for Dask and xarray)."""
 _OK = """
     `ok`: with `ok=True` a last output tells which rows the library accepted; a refused row is NaN
-    (-1 in integers) either way."""
+    (-1 in integers, "" in words) either way."""
 
 
 class Declared:
@@ -54,6 +54,9 @@ class Declared:
         return values
 
     def prepare(self, values):
+        given = dict(zip(self.kinds, values))
+        if given.get("OptionalSpectra") is not None and given.get("OptionalTargets", 0) is None:
+            raise ValueError("paper_targets: a paper needs them")
         values = [convert(*three) for three in zip(self.kinds, values, self.names)]
         for value, core, kind, name in zip(values, self.cores, self.kinds, self.names):
             if core:
@@ -210,13 +213,20 @@ def function(*outputs):
             return _dispatch(declared, *values, ok=bool(ok), out=out)
 
         text = inspect.cleandoc(declaration.__doc__)
+        subject = declaration.__globals__["__doc__"].partition("\n\n")[2].strip()
         shapes = f"Shapes: {declared.signature}, broadcast as NumPy does."
         source = f"C function: {_ufuncs.c_names[declared.name]}."
-        more = inspect.cleandoc(_OUT + (_OK if declared.flagged else ""))
-        call.__doc__ = f"{text}\n\n{shapes} {source}\n\n{more}"
-        extra = [inspect.Parameter("out", inspect.Parameter.KEYWORD_ONLY, default=None)]
-        if declared.flagged:
-            extra.append(inspect.Parameter("ok", inspect.Parameter.KEYWORD_ONLY, default=False))
+        keywords = {"out": (None, _OUT), "ok": (False, _OK)}
+        if declared.name in WORDS:
+            del keywords["out"]
+        if not declared.flagged:
+            del keywords["ok"]
+        more = inspect.cleandoc("".join(note for _, note in keywords.values()))
+        call.__doc__ = "\n\n".join(filter(None, (text, subject, f"{shapes} {source}", more)))
+        extra = [
+            inspect.Parameter(name, inspect.Parameter.KEYWORD_ONLY, default=default)
+            for name, (default, _) in keywords.items()
+        ]
         call.__signature__ = inspect.Signature(declared.parameters + extra)
         return call
 
