@@ -19,11 +19,22 @@ from typing import Any, Sequence, Union
 import numpy as np
 from numpy.typing import ArrayLike, NDArray
 
-Spectra = Colours = Inks = Numbers = Integers = ArrayLike
-OptionalSpectra = OptionalTargets = Union[ArrayLike, None]
-Names = Union[str, Sequence[str], ArrayLike]
-Illuminant = WhitenessIlluminant = StatusName = CCRStatus = HueStatus = Names
-ResponseName = InkResponse = Reading = Names
+_Spectra = ArrayLike
+_Colours = ArrayLike
+_Inks = ArrayLike
+_Numbers = ArrayLike
+_Integers = ArrayLike
+_OptionalSpectra = Union[ArrayLike, None]
+_OptionalTargets = Union[ArrayLike, None]
+_Names = Union[str, Sequence[str], ArrayLike]
+_Illuminant = _Names
+_WhitenessIlluminant = _Names
+_StatusName = _Names
+_CCRStatus = _Names
+_HueStatus = _Names
+_ResponseName = _Names
+_InkResponse = _Names
+_Reading = _Names
 
 __version__: str
 ufuncs: Any
@@ -39,7 +50,8 @@ def declaration(name, function):
         if p.kind is p.KEYWORD_ONLY and not starred:
             parameters.append("*")
             starred = True
-        annotation = keywords.get(p.name, "Any" if p.annotation is p.empty else p.annotation)
+        kind = "Any" if p.annotation is p.empty else f"_{p.annotation}"
+        annotation = keywords.get(p.name, kind)
         parameters.append(f"{p.name}: {annotation}" + ("" if p.default is p.empty else " = ..."))
     result = "Any"
     if name.startswith("get_num") and not parameters:
@@ -54,8 +66,10 @@ def declaration(name, function):
 
 
 def stubs():
-    parts = [HEADER]
-    public = {name: value for name, value in vars(vantrel).items() if not name.startswith("_")}
+    names = ", ".join(f'"{name}"' for name in vantrel.__all__)
+    inside = textwrap.fill(names, 96, initial_indent="    ", subsequent_indent="    ")
+    parts = [HEADER, f"__all__ = [\n{inside}\n]\n"]
+    public = {name: getattr(vantrel, name) for name in vantrel.__all__}
     for name, value in public.items():
         if inspect.isclass(value) and issubclass(value, enum.Enum):
             members = "".join(f"    {m.name} = {int(m)}\n" for m in value)
