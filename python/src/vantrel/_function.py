@@ -150,11 +150,13 @@ def _on_dask(declared, values, ok):
         meta=np.empty((0,) * depth, object),
     )
     results = tuple(
-        tuples.map_blocks(
+        da.blockwise(
             operator.itemgetter(k),
+            [*names, *core],
+            tuples,
+            names,
+            new_axes={d: int(d) for d in core},
             token=f"{declared.name}-{output}",
-            new_axis=list(range(depth, depth + len(core))),
-            chunks=tuples.chunks + tuple((int(d),) for d in core),
             meta=np.empty((0,) * (depth + len(core)), dtype),
         )
         for k, (core, dtype, output) in enumerate(
