@@ -42,6 +42,11 @@ den_weight: NDArray[np.int64]
 '''
 
 
+def inside(items):
+    """What brackets hold, in lines of its own."""
+    return textwrap.fill(", ".join(items), 96, initial_indent="    ", subsequent_indent="    ")
+
+
 def declaration(name, function):
     signature = inspect.signature(function)
     keywords = {"out": "Any", "ok": "bool"}
@@ -61,14 +66,12 @@ def declaration(name, function):
     line = f"def {name}({', '.join(parameters)}) -> {result}: ..."
     if len(line) <= 96:
         return line
-    inside = textwrap.fill(", ".join(parameters), 96, initial_indent="    ", subsequent_indent="    ")
-    return f"def {name}(\n{inside}\n) -> {result}: ..."
+    return f"def {name}(\n{inside(parameters)}\n) -> {result}: ..."
 
 
 def stubs():
-    names = ", ".join(f'"{name}"' for name in vantrel.__all__)
-    inside = textwrap.fill(names, 96, initial_indent="    ", subsequent_indent="    ")
-    parts = [HEADER, f"__all__ = [\n{inside}\n]\n"]
+    names = [f'"{name}"' for name in vantrel.__all__]
+    parts = [HEADER, f"__all__ = [\n{inside(names)}\n]\n"]
     public = {name: getattr(vantrel, name) for name in vantrel.__all__}
     for name, value in public.items():
         if inspect.isclass(value) and issubclass(value, enum.Enum):

@@ -15,6 +15,8 @@ import vantrel
 RANDOM = np.random.default_rng(7)
 SPECTRA = RANDOM.uniform(1, 99, (6, 5, 31))
 PAPER = np.linspace(80, 90, 31)
+CURVES = np.ones((4, 31))
+WHITE = [3100] * 4
 
 
 def row_by_row(function, array):
@@ -132,7 +134,7 @@ def test_a_refused_row_is_nan_without_a_warning():
         (lambda: vantrel.refl_to_xyz(["a"] * 31), "spectra: numbers"),
         (lambda: vantrel.refl_to_density(SPECTRA, PAPER[1:], "E", 1), "paper.* 31"),
         (lambda: vantrel.refl_to_density(SPECTRA, [], "E", 1), "paper.* 31 bands .* not 0"),
-        (lambda: vantrel.pol_refl_to_densities(PAPER, [1] * 4, PAPER, None, [PAPER] * 4, 1), "targets"),
+        (lambda: vantrel.pol_refl_to_densities(PAPER, WHITE, PAPER, None, CURVES, "E"), "targets"),
         (lambda: vantrel.refl_to_density(SPECTRA, None, "SPECTRAL", 390), "390 .* 391 to 709"),
         (lambda: vantrel.refl_to_density(SPECTRA, None, ["E", "T"], 9), "shape|9 is not from 0"),
         (lambda: vantrel.refl_to_density(SPECTRA, None, -1, 1), "status: -1"),

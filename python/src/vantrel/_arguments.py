@@ -38,9 +38,9 @@ def as_array(value, name):
     dtype = getattr(value, "dtype", type(value).__name__)
     if getattr(dtype, "kind", None) not in tuple("fiub"):
         raise ValueError(f"{name}: numbers are needed, not {dtype}")
-    if np.ma.is_masked(value):
-        raise ValueError(f"{name}: masked values have no result; fill them first")
     if isinstance(value, np.ma.MaskedArray):
+        if np.ma.is_masked(value):
+            raise ValueError(f"{name}: masked values have no result; fill them first")
         value = value.data
     return value.astype(np.float64) if dtype.itemsize > 8 else value
 
@@ -53,7 +53,8 @@ def as_integers(value, name):
         return value
     if lazy:
         raise ValueError(f"{name}: integers are needed, not {numbers.dtype} yet to be computed")
-    if numbers.dtype.kind == "O" or not np.all((np.trunc(numbers) == numbers) & (abs(numbers) < 2.0**63)):
+    fits = abs(numbers) < 2.0**63
+    if numbers.dtype.kind == "O" or not np.all(fits & (np.trunc(numbers) == numbers)):
         raise ValueError(f"{name}: whole numbers are needed")
     return value.astype(np.int64) if hasattr(value, "astype") else int(value)
 
@@ -116,7 +117,7 @@ INDICES = {
 }
 
 # What a response may be under each status: [lowest, highest].
-_READINGS = np.array([[0, len(Response) - 1]] * len(Status))
+_READINGS = [(0, len(Response) - 1)] * len(Status)
 _READINGS[Status.SPECTRAL_STATUS] = 391, 709
 _READINGS[Status.SPECTRALX_STATUS] = 0, BANDS - 1
 _READINGS[Status.CCR2_STATUS] = 0, BANDS - 1
@@ -124,8 +125,8 @@ _READINGS[Status.CCR2_STATUS] = 0, BANDS - 1
 
 def check_reading(status, response, name):
     """The range of a response depends on the status: a filter, a wavelength or a band."""
-    for number in np.unique(status):
-        low, high = _READINGS[number]
+    for number in [status] if isinstance(status, int) else np.unique(status):
+        low, high = _READINGS[int(number)]
         bad = (status == number) & ((response < low) | (response > high))
         if np.any(bad):
             wrong = response

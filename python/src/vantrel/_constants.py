@@ -11,7 +11,7 @@ den_weight = _ufuncs.den_weight
 def _doubles(value, size, name):
     if value is None:
         return None
-    array = np.ascontiguousarray(value, dtype=np.float64)
+    array = np.array(value, dtype=np.float64, order="C")
     if array.shape != (size,):
         raise ValueError(f"{name}: {size} values are needed, not the shape {array.shape}")
     return array
