@@ -74,7 +74,8 @@ def test_none_of_them_is_needed():
         "import sys; sys.modules.update(dask=None, xarray=None); import vantrel;"
         "assert round(vantrel.refl_to_xyz([100] * 31)[1]) == 100"
     )
-    subprocess.run([sys.executable, "-c", code], check=True)
+    for options in [], ["-OO"]:
+        subprocess.run([sys.executable, *options, "-c", code], check=True)
 
 
 def test_what_they_cannot_do_is_said():

@@ -214,8 +214,8 @@ def function(*outputs):
             values = declared.prepare(declared.bind(args, kwargs))
             return _dispatch(declared, *values, ok=bool(ok), out=out)
 
-        text = inspect.cleandoc(declaration.__doc__)
-        subject = declaration.__globals__["__doc__"].partition("\n\n")[2].strip()
+        text = inspect.cleandoc(declaration.__doc__ or "")  # python -OO drops them
+        subject = (declaration.__globals__["__doc__"] or "").partition("\n\n")[2].strip()
         shapes = f"Shapes: {declared.signature}, broadcast as NumPy does."
         source = f"C function: {_ufuncs.c_names[declared.name]}."
         keywords = {"out": (None, _OUT), "ok": (False, _OK)}
