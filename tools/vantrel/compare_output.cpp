@@ -134,8 +134,9 @@ std::string as_table(const Comparison &comparison, bool colour)
     if (comparison.sample_paper != comparison.reference_paper)
         paper += ", the sample over " + cut(comparison.sample_paper, widest_in_text);
     Lines lines;
-    lines.add(fmt::format("{} against {}: {} pairs by {}", comparison.sample, comparison.reference,
-                          comparison.pairs.size(), name_of(comparison.paired_by)));
+    lines.add(fmt::format("{} against {}: {} {} by {}", comparison.sample, comparison.reference,
+                          comparison.pairs.size(), comparison.pairs.size() == 1 ? "pair" : "pairs",
+                          name_of(comparison.paired_by)));
     lines.add(fmt::format("{}, metamerism with {}; {} over {}", name_of(comparison.illuminant),
                           name_of(comparison.second_illuminant), status_name(comparison.status),
                           paper));

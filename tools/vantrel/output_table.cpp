@@ -33,7 +33,8 @@ std::string spectra_of(const Source &source)
 void add_head(Lines &lines, const Report &report)
 {
     const std::string paper = cut(report.paper.name, widest_in_text);
-    lines.add(fmt::format("{}: {} patches", report.file, report.patches.size()));
+    lines.add(fmt::format("{}: {} {}", report.file, report.patches.size(),
+                          report.patches.size() == 1 ? "patch" : "patches"));
     lines.add(fmt::format("{}, {}, ΔE00 and density over {}, dot area with n = {:g}",
                           name_of(report.illuminant), status_name(report.status), paper,
                           report.n_factor));
