@@ -56,10 +56,8 @@ void add_sheet_options(CLI::App &command, Options &options)
         ->capture_default_str();
     command.add_option("--status", options.status, "Density status: " + status_names())
         ->capture_default_str();
-    command.add_option(
-        "--paper", options.paper,
-        "The paper's patch by name or id (default: the first patch without ink, or else the "
-        "first)");
+    command.add_option("--paper", options.paper,
+                       "The paper's patch by name or id (default: the first patch)");
     command
         .add_option("--scale", options.scale,
                     "Scale of a file's reflectances: auto, percent, or fraction for 0 to 1")
@@ -105,15 +103,16 @@ const Patch &paper_of(const Measurement &sheet, Options &options)
 {
     if (!options.paper.empty())
         return patch_named(sheet, options.paper);
-    const auto bare = std::find_if(sheet.patches.begin(), sheet.patches.end(),
-                                   [](const Patch &patch) { return ink_on(patch) == 0; });
-    if (bare != sheet.patches.end())
-        return *bare;
     const Patch &first = sheet.patches.front();
-    if (ink_on(first) > 0)
+    if (ink_on(first) > 0) {
+        const auto bare = std::find_if(sheet.patches.begin(), sheet.patches.end(),
+                                       [](const Patch &patch) { return ink_on(patch) == 0; });
+        const std::string other =
+            bare == sheet.patches.end() ? "" : ", " + in_quotes(bare->name) + " has none";
         options.warnings.push_back(
-            fmt::format("{}: no patch is without ink, {} stands for the paper; --paper chooses",
-                        sheet.file, in_quotes(first.name)));
+            fmt::format("{}: {} stands for the paper, but has ink{}; --paper chooses", sheet.file,
+                        in_quotes(first.name), other));
+    }
     return first;
 }
 

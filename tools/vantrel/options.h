@@ -53,8 +53,8 @@ void add_order_option(CLI::App &command, std::vector<std::string> &order);
 ILLUM_OBS illuminant_of(const std::string &name);
 int status_of(const std::string &name);
 
-// The patch that the options name, or else the first without ink, as its device values tell, or
-// else the first. Throws RequestError.
+// The patch that the options name, or else the first, with a warning where its device values have
+// ink. Throws RequestError.
 const Patch &paper_of(const Measurement &sheet, Options &options);
 
 // Illuminant A beside daylight and lamps, D65 beside A, with the same observer.
