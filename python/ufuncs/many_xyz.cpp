@@ -31,7 +31,7 @@ std::array<Weights, NUM_ILLUM_OBS> read_weights()
 }
 
 constexpr int kTogether = 8; // as many sums as hide each other's waiting
-constexpr int kAhead = 32;   // spectra from memory's arrival to its use: some eight thousand bytes
+constexpr int kAhead = 32;   // spectra are fetched this far ahead of their use: some 8,000 bytes
 
 /// The XYZ of kTogether spectra; those from `ahead` on are fetched from memory meanwhile.
 [[gnu::target("avx2")]] void several_xyz(const char *refl, const char *ahead, npy_intp step,

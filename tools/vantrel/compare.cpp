@@ -64,11 +64,12 @@ Pairs pairs_in_order(std::size_t reference, std::size_t sample)
 Pairs automatic_pairs(const Measurement &reference, const Measurement &sample)
 {
     const std::size_t shorter = std::min(reference.patches.size(), sample.patches.size());
-    for (const auto &[by, key] :
-         {std::pair{Pairing::name, &Patch::name}, std::pair{Pairing::id, &Patch::id}})
-        if (Pairs pairs = pairs_by(reference, sample, by, key);
-            reference.named && sample.named && 2 * pairs.matched.size() >= shorter)
-            return pairs;
+    if (reference.named && sample.named)
+        for (const auto &[by, key] :
+             {std::pair{Pairing::name, &Patch::name}, std::pair{Pairing::id, &Patch::id}})
+            if (Pairs pairs = pairs_by(reference, sample, by, key);
+                2 * pairs.matched.size() >= shorter)
+                return pairs;
     if (reference.patches.size() != sample.patches.size())
         throw RequestError{fmt::format(
             "{} has {} patches and {} has {}, most without a common name or id; choose with --pair",
