@@ -1,7 +1,7 @@
 // Hands arbitrary bytes to the reader of measurement files, and stops where it neither refuses them
 // in one printable line nor hands on a sheet that can be measured and printed.
-#include "reader.h"
-#include "text.h"
+#include "read/reader.h"
+#include "read/text.h"
 
 #include <algorithm>
 #include <cmath>

@@ -89,7 +89,7 @@ class Build:
     """The library and its tests, built once. A change compiles what it concerns, and links again."""
 
     # The tests, the quick ones first, and what has the objects of their programs.
-    PROGRAMS = {"tests/CMakeFiles/vantrel_tests.dir/": [
+    PROGRAMS = {"tests/library/CMakeFiles/vantrel_tests.dir/": [
                     ["--gtest_filter=Golden.*", "--gtest_fail_fast"],
                     ["--gtest_filter=-Golden.*", "--gtest_fail_fast"]],
                 "tests/bits/CMakeFiles/bits.dir/": [[ROOT / "tests/bits/functions.txt", os.devnull]]}

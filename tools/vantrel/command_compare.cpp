@@ -6,9 +6,9 @@
 
 #include <fmt/format.h>
 
-#include "compare.h"
+#include "judge/compare.h"
 #include "options.h"
-#include "text.h"
+#include "read/text.h"
 
 namespace {
 

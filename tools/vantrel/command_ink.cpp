@@ -2,8 +2,8 @@
 
 #include <memory>
 
+#include "judge/ink.h"
 #include "options.h"
-#include "patch_study.h"
 
 namespace {
 

@@ -4,10 +4,10 @@
 
 #include <fmt/format.h>
 
-#include "list.h"
-#include "names.h"
+#include "judge/list.h"
+#include "judge/names.h"
 #include "options.h"
-#include "text.h"
+#include "read/text.h"
 
 namespace {
 

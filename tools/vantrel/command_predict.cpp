@@ -2,8 +2,8 @@
 
 #include <memory>
 
+#include "judge/predict.h"
 #include "options.h"
-#include "predict.h"
 
 namespace {
 

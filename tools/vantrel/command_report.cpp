@@ -3,8 +3,8 @@
 #include <cmath>
 #include <memory>
 
+#include "judge/report.h"
 #include "options.h"
-#include "report.h"
 
 namespace {
 

@@ -5,7 +5,7 @@
 #include <cstring>
 #include <memory>
 
-#include "measurement.h"
+#include "read/measurement.h"
 
 namespace {
 

@@ -11,7 +11,7 @@
 
 #include "options.h"
 #include "output_file.h"
-#include "text.h"
+#include "read/text.h"
 
 namespace {
 

@@ -11,9 +11,9 @@
 #include <fmt/format.h>
 
 #include "file.h"
-#include "names.h"
-#include "reader.h"
-#include "text.h"
+#include "judge/names.h"
+#include "read/reader.h"
+#include "read/text.h"
 
 namespace {
 

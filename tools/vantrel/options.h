@@ -8,9 +8,9 @@
 
 #include <CLI/CLI.hpp>
 
-#include "flat.h"
-#include "measurement.h"
-#include "output_html.h"
+#include "read/measurement.h"
+#include "write/flat.h"
+#include "write/html.h"
 
 struct Options {
     std::string illuminant = "D50_2DEG";

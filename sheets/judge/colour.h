@@ -1,0 +1,33 @@
+// The colour of a spectrum, as a host shows it.
+#ifndef VANTREL_TOOL_COLOUR_H
+#define VANTREL_TOOL_COLOUR_H
+
+#include <cstdint>
+#include <string>
+
+#include "read/measurement.h"
+
+// Drive levels of the screen preview.
+struct Rgb {
+    std::uint8_t red = 0, green = 0, blue = 0;
+};
+
+struct Colour {
+    CIELABCOORD lab{};
+    Rgb rgb;
+};
+
+CIELABCOORD lab_of(const Spectrum &refl, ILLUM_OBS illuminant);
+
+// The preview is that under D65, the white of displays: under another illuminant white paper would
+// look tinted beside it.
+Colour colour_of(const Spectrum &refl, ILLUM_OBS illuminant);
+
+// As it looks under this illuminant to an eye that is adapted to the display.
+Rgb preview_of(const Spectrum &refl, ILLUM_OBS illuminant);
+
+CIELCHCOORD lch_of(const CIELABCOORD &lab);
+double delta_e00(const CIELABCOORD &first, const CIELABCOORD &second);
+std::string hex(const Rgb &rgb); // #rrggbb
+
+#endif

@@ -1,0 +1,66 @@
+#include "judge/ink.h"
+
+#include "judge/densitometer.h"
+#include "judge/names.h"
+
+namespace {
+
+StatusReading under_status(const Spectrum &refl, const Spectrum &paper, int status)
+{
+    StatusReading out;
+    out.reading = Densitometer(paper, status).read(refl);
+    DENSITYSTRUCT set{};
+    if (ReflToDensities(refl.data(), paper.data(), status, &set))
+        for (int response = 0; response < NUM_RESPONSES; ++response)
+            if (has_response(status, response))
+                out.densities[response] = set.density[response];
+    return out;
+}
+
+IlluminantReading under_illuminant(const Spectrum &refl, const Spectrum *other, ILLUM_OBS chosen,
+                                   ILLUM_OBS illuminant)
+{
+    IlluminantReading out;
+    out.colour = {lab_of(refl, illuminant), preview_of(refl, illuminant)};
+    out.lch = lch_of(out.colour.lab);
+    if (other) {
+        out.other = {lab_of(*other, illuminant), preview_of(*other, illuminant)};
+        out.de00 = delta_e00(out.other->lab, out.colour.lab);
+        double metamerism = 0, din6172 = 0;
+        Metamerism(other->data(), refl.data(), chosen, illuminant, &metamerism);
+        ReflToDIN6172(other->data(), refl.data(), chosen, illuminant, &din6172);
+        out.metamerism = metamerism;
+        out.din6172 = din6172;
+    }
+    return out;
+}
+
+} // namespace
+
+PatchStudy study_of(const Measurement &sheet, const Inks &inks, const Request &request,
+                    const Patch &patch, const Patch *other)
+{
+    const CIELABCOORD paper = lab_of(request.paper->refl, request.illuminant);
+    PatchStudy out{.file = sheet.file,
+                   .illuminant = request.illuminant,
+                   .status = request.status,
+                   .paper = request.paper->name,
+                   .patch = patch_report(patch, inks, request, paper),
+                   .as_paper = paper_report(patch, request.illuminant),
+                   .statuses = {},
+                   .illuminants = {},
+                   .against = {}};
+    for (int status = 0; status < NUM_STATUSES; ++status)
+        out.statuses[status] = under_status(patch.refl, request.paper->refl, status);
+    for (int i = 0; i < NUM_ILLUM_OBS; ++i)
+        out.illuminants[i] = under_illuminant(patch.refl, other ? &other->refl : nullptr,
+                                              request.illuminant, static_cast<ILLUM_OBS>(i));
+    if (other) {
+        out.against.emplace();
+        out.against->patch = patch_report(*other, inks, request, paper);
+        out.against->de00 = delta_e00(out.against->patch.colour.lab, out.patch.colour.lab);
+        ReflToABErrorWeights(other->refl.data(), patch.refl.data(), request.illuminant,
+                             out.against->a.data(), out.against->b.data());
+    }
+    return out;
+}

@@ -1,0 +1,56 @@
+// What `vantrel ink` says: everything about one patch.
+#ifndef VANTREL_TOOL_PATCH_STUDY_H
+#define VANTREL_TOOL_PATCH_STUDY_H
+
+#include <array>
+#include <optional>
+#include <string>
+#include <vector>
+
+#include "judge/densitometer.h"
+#include "judge/report.h"
+#include "write/flat.h"
+
+struct StatusReading {
+    DensityReading reading; // in the response that reads the patch
+    std::array<std::optional<double>, NUM_RESPONSES> densities; // of the status's own responses
+};
+
+// Under one illuminant and observer.
+struct IlluminantReading {
+    Colour colour;
+    CIELCHCOORD lch{};
+    std::optional<Colour> other;
+    // From the other patch to this one.
+    std::optional<double> de00, metamerism, din6172; // metamerism beside the chosen illuminant
+};
+
+// The other patch, and where along the spectrum the difference from it comes from.
+struct Against {
+    PatchReport patch;
+    double de00 = 0;   // under the chosen illuminant
+    Spectrum a{}, b{}; // error weights, the largest 100
+};
+
+struct PatchStudy {
+    std::string file;
+    ILLUM_OBS illuminant;
+    int status;
+    std::string paper;
+    PatchReport patch;
+    PaperReport as_paper; // brightness and whiteness of this patch
+    std::array<StatusReading, NUM_STATUSES> statuses;
+    std::array<IlluminantReading, NUM_ILLUM_OBS> illuminants;
+    std::optional<Against> against;
+};
+
+// `other` may be null.
+PatchStudy study_of(const Measurement &sheet, const Inks &inks, const Request &request,
+                    const Patch &patch, const Patch *other);
+
+// The output formats; each gives the whole text.
+std::string as_table(const PatchStudy &study, bool colour);
+std::string as_json(const PatchStudy &study);
+std::vector<Flat> flat_of(const PatchStudy &study);
+
+#endif

@@ -1,0 +1,82 @@
+#include "judge/inks.h"
+
+#include <algorithm>
+
+#include <fmt/format.h>
+
+#include "read/text.h"
+
+Inks::Inks(const Measurement &sheet, const std::vector<std::string> &order) : sheet(sheet)
+{
+    for (const Patch &patch : sheet.patches)
+        for (const auto &[field, percent] : patch.device)
+            if (!field.starts_with("RGB_") && numbers.emplace(field, fields.size()).second)
+                fields.push_back(field);
+
+    std::vector<std::size_t> sequence;
+    for (const std::string &name : order) {
+        const auto ink = named(name);
+        if (!ink)
+            throw RequestError{fmt::format(
+                "{} holds no ink {}; its inks are {}", sheet.file, in_quotes(name),
+                fields.empty() ? "unknown" : fmt::format("{}", fmt::join(fields, ", ")))};
+        if (std::find(sequence.begin(), sequence.end(), *ink) != sequence.end())
+            throw RequestError{fmt::format("the ink {} is named twice", in_quotes(name))};
+        sequence.push_back(*ink);
+    }
+    for (std::size_t ink = 0; ink < fields.size(); ++ink)
+        if (std::find(sequence.begin(), sequence.end(), ink) == sequence.end())
+            sequence.push_back(ink);
+    const std::vector<std::string> in_file = fields;
+    for (std::size_t i = 0; i < sequence.size(); ++i) {
+        fields[i] = in_file[sequence[i]];
+        numbers[fields[i]] = i;
+    }
+    for (const Patch &patch : sheet.patches)
+        if (const auto tints = tints_of(patch))
+            patches.emplace(*tints, &patch);
+}
+
+std::optional<Tints> Inks::tints_of(const Patch &patch) const
+{
+    if (fields.empty() || patch.device.empty())
+        return std::nullopt;
+    Tints tints;
+    for (const auto &[field, percent] : patch.device) {
+        const auto number = numbers.find(field);
+        if (number == numbers.end()) // no ink
+            continue;
+        if (percent < 0 || percent > 100)
+            return std::nullopt;
+        if (percent > 0)
+            tints.push_back({number->second, percent});
+    }
+    std::sort(tints.begin(), tints.end());
+    const bool twice = std::adjacent_find(tints.begin(), tints.end(), [](auto &a, auto &b) {
+                           return a.ink == b.ink;
+                       }) != tints.end();
+    return twice ? std::nullopt : std::optional(tints);
+}
+
+const Patch *Inks::measured(const Tints &tints) const
+{
+    const auto found = patches.find(tints);
+    return found == patches.end() ? nullptr : found->second;
+}
+
+std::optional<std::size_t> Inks::ink_of_solid(const Patch &patch) const
+{
+    const auto tints = tints_of(patch);
+    if (tints && tints->size() == 1 && tints->front().percent == 100)
+        return tints->front().ink;
+    return std::nullopt;
+}
+
+std::optional<std::size_t> Inks::named(std::string_view name) const
+{
+    for (std::size_t ink = 0; ink < fields.size(); ++ink)
+        if (equal_ignoring_case(fields[ink], name))
+            return ink;
+    const Patch *patch = find_patch(sheet, name);
+    return patch ? ink_of_solid(*patch) : std::nullopt;
+}

@@ -1,0 +1,55 @@
+// Which inks a patch was printed with, as its device values tell.
+#ifndef VANTREL_TOOL_INKS_H
+#define VANTREL_TOOL_INKS_H
+
+#include <cstddef>
+#include <map>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <tuple>
+#include <vector>
+
+#include "read/measurement.h"
+
+struct Tint {
+    std::size_t ink; // counted in the order of printing
+    double percent;  // nominal, above 0
+
+    friend bool operator<(const Tint &first, const Tint &second)
+    {
+        return std::tie(first.ink, first.percent) < std::tie(second.ink, second.percent);
+    }
+};
+using Tints = std::vector<Tint>; // in the order of printing; empty for bare paper
+
+class Inks {
+public:
+    // Inks print in the order of the file's device fields, after those that `order` names by field
+    // or by solid; throws RequestError.
+    Inks(const Measurement &sheet, const std::vector<std::string> &order);
+
+    // The device fields in the order of printing.
+    const std::vector<std::string> &names() const { return fields; }
+
+    // Nothing where the patch has no device values, or they are no inks or not from 0 to 100.
+    std::optional<Tints> tints_of(const Patch &patch) const;
+
+    // The first patch of this combination, null where there is none.
+    const Patch *measured(const Tints &tints) const;
+    const Patch *solid(std::size_t ink) const { return measured({{ink, 100}}); }
+
+    // The ink of which a patch is a solid; nothing where it is none.
+    std::optional<std::size_t> ink_of_solid(const Patch &patch) const;
+
+    // The ink by its device field or by its solid's name or id; nothing where there is none.
+    std::optional<std::size_t> named(std::string_view name) const;
+
+private:
+    const Measurement &sheet;
+    std::vector<std::string> fields;
+    std::map<std::string, std::size_t> numbers; // of the fields, in the order of printing
+    std::map<Tints, const Patch *> patches;
+};
+
+#endif

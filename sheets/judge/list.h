@@ -1,0 +1,28 @@
+// What `vantrel list` prints: the names that the program knows, and the library's tables.
+#ifndef VANTREL_TOOL_LIST_H
+#define VANTREL_TOOL_LIST_H
+
+#include <optional>
+#include <string>
+#include <vector>
+
+#include "write/flat.h"
+
+struct List {
+    std::string what;
+    Flat flat;
+};
+
+List list_illuminants();
+List list_tristimulus_weights(ILLUM_OBS illuminant);
+List list_statuses();
+List list_responses(const std::optional<int> &wanted); // of one status, or of all
+// Filters scaled to a peak of 100, all of a status or one; throws RequestError where there is none.
+List list_weights(int status, const std::optional<int> &wanted);
+
+// The output formats; each gives the whole text.
+std::string as_table(const List &list, bool colour);
+std::string as_json(const List &list);
+std::vector<Flat> flat_of(const List &list);
+
+#endif

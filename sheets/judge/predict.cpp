@@ -1,0 +1,165 @@
+#include "judge/predict.h"
+
+#include <algorithm>
+#include <cmath>
+
+#include <fmt/format.h>
+
+#include "read/text.h"
+
+namespace {
+
+constexpr std::size_t most_inks = 3;
+
+struct Layer {
+    const Patch *solid;
+    int percent;
+};
+
+using Model = int(int n, const double *inks, const int *percent, const double *paper, double *refl);
+
+Estimate estimate(Model *model, const std::vector<Layer> &layers, const Spectrum &paper,
+                  ILLUM_OBS illuminant, int status, const std::optional<Measured> &measured)
+{
+    std::vector<double> inks;
+    std::vector<int> percent;
+    for (const Layer &layer : layers) {
+        inks.insert(inks.end(), layer.solid->refl.begin(), layer.solid->refl.end());
+        percent.push_back(layer.percent);
+    }
+    Estimate out;
+    model(static_cast<int>(layers.size()), inks.data(), percent.data(), paper.data(),
+          out.refl.data());
+    out.colour = colour_of(out.refl, illuminant);
+    out.reading = Densitometer(paper, status).read(out.refl);
+    if (measured)
+        out.to_measured = delta_e00(measured->colour.lab, out.colour.lab);
+    return out;
+}
+
+Prediction prediction_of(const std::vector<Layer> &layers, const Patch &paper, ILLUM_OBS illuminant,
+                         int status, const Patch *patch)
+{
+    Prediction out;
+    for (const Layer &layer : layers)
+        out.inks.push_back({layer.solid->name, layer.percent});
+    if (patch)
+        out.measured = {patch->name, colour_of(patch->refl, illuminant),
+                        Densitometer(paper.refl, status).read(patch->refl)};
+    out.halftone = estimate(EstimateRefls, layers, paper.refl, illuminant, status, out.measured);
+    out.film = estimate(EstimateReflsForBestVisualColor, layers, paper.refl, illuminant, status,
+                        out.measured);
+    return out;
+}
+
+// The solid that a name stands for: a patch by name or id, or the ink of a device field.
+const Patch &solid_named(const Measurement &sheet, const Inks &inks, std::string_view name)
+{
+    if (const Patch *patch = find_patch(sheet, name)) {
+        if (inks.tints_of(*patch) && !inks.ink_of_solid(*patch))
+            throw RequestError{
+                fmt::format("{}: {} is no solid of one ink", sheet.file, in_quotes(name))};
+        return *patch;
+    }
+    const auto ink = inks.named(name);
+    if (ink && !inks.solid(*ink))
+        throw RequestError{fmt::format("{} holds no solid of {}", sheet.file, in_quotes(name))};
+    return ink ? *inks.solid(*ink) : patch_named(sheet, name);
+}
+
+Layer layer_of(const Measurement &sheet, const Inks &inks, std::string_view wish)
+{
+    const auto colon = wish.rfind(':');
+    if (colon == std::string_view::npos)
+        throw RequestError{fmt::format("--ink takes NAME:PERCENT, not {}", in_quotes(wish))};
+    const auto percent = number_in(wish.substr(colon + 1));
+    if (!percent || *percent < 0 || *percent > 100 || *percent != std::floor(*percent))
+        throw RequestError{fmt::format("--ink takes a whole percentage from 0 to 100, not {}",
+                                       in_quotes(wish.substr(colon + 1)))};
+    return {&solid_named(sheet, inks, wish.substr(0, colon)), static_cast<int>(*percent)};
+}
+
+// The patch that was printed with these layers, null where there is none.
+const Patch *measured_of(const std::vector<Layer> &layers, const Inks &inks)
+{
+    Tints tints;
+    for (const Layer &layer : layers) {
+        const auto ink = inks.ink_of_solid(*layer.solid);
+        if (!ink)
+            return nullptr;
+        if (layer.percent > 0)
+            tints.push_back({*ink, static_cast<double>(layer.percent)});
+    }
+    std::sort(tints.begin(), tints.end());
+    return inks.measured(tints);
+}
+
+// The solids of an overprint of two or three inks, nothing where it cannot be predicted.
+std::vector<Layer> layers_of(const Tints &tints, const Inks &inks)
+{
+    std::vector<Layer> layers;
+    for (const Tint &tint : tints) {
+        const Patch *solid = inks.solid(tint.ink);
+        if (!solid || tints.size() > most_inks || tint.percent != std::floor(tint.percent))
+            return {};
+        layers.push_back({solid, static_cast<int>(tint.percent)});
+    }
+    return layers;
+}
+
+} // namespace
+
+Predictions predict(const Measurement &sheet, const Inks &inks, const Patch &paper,
+                    ILLUM_OBS illuminant, int status, const std::vector<std::string> &wishes)
+{
+    if (wishes.size() > most_inks)
+        throw RequestError{fmt::format("{} inks; {} are the most", wishes.size(), most_inks)};
+    std::vector<Layer> layers;
+    for (const std::string &wish : wishes) {
+        const Layer layer = layer_of(sheet, inks, wish);
+        for (const Layer &other : layers)
+            if (other.solid == layer.solid)
+                throw RequestError{
+                    fmt::format("the ink {} is named twice", in_quotes(layer.solid->name))};
+        layers.push_back(layer);
+    }
+    return {.file = sheet.file,
+            .illuminant = illuminant,
+            .status = status,
+            .paper = paper.name,
+            .all = {prediction_of(layers, paper, illuminant, status, measured_of(layers, inks))}};
+}
+
+Predictions predict_overprints(const Measurement &sheet, const Inks &inks, const Patch &paper,
+                               ILLUM_OBS illuminant, int status)
+{
+    Predictions out{.file = sheet.file,
+                    .illuminant = illuminant,
+                    .status = status,
+                    .paper = paper.name,
+                    .all = {}};
+    for (const Patch &patch : sheet.patches) {
+        const auto tints = inks.tints_of(patch);
+        if (!tints || tints->size() < 2)
+            continue;
+        const std::vector<Layer> layers = layers_of(*tints, inks);
+        if (layers.empty())
+            ++out.left_out;
+        else
+            out.all.push_back(prediction_of(layers, paper, illuminant, status, &patch));
+    }
+    if (out.all.empty())
+        throw RequestError{fmt::format(
+            "{} holds no overprint of two or three inks beside their solids; name inks with --ink",
+            sheet.file)};
+    return out;
+}
+
+std::string inks_of(const Prediction &prediction, std::size_t widest_name)
+{
+    std::string out;
+    for (const InkTint &ink : prediction.inks)
+        out += fmt::format("{}{} {} %", out.empty() ? "" : " + ", cut(ink.name, widest_name),
+                           ink.percent);
+    return out;
+}

@@ -1,0 +1,98 @@
+// What `vantrel report` says about a sheet.
+#ifndef VANTREL_TOOL_REPORT_H
+#define VANTREL_TOOL_REPORT_H
+
+#include <optional>
+#include <string>
+#include <utility>
+#include <vector>
+
+#include "judge/colour.h"
+#include "judge/inks.h"
+#include "read/measurement.h"
+#include "write/flat.h"
+
+// What is asked of a sheet.
+struct Request {
+    ILLUM_OBS illuminant = D50_2DEG;
+    const Patch *paper = nullptr;
+    int status = E_STATUS;
+    double n_factor = 1;
+    const Patch *second_paper = nullptr; // metamerism is measured against it; may be null
+    ILLUM_OBS second_illuminant = A_2DEG;
+};
+
+// Percentages and densities are missing where they make no sense.
+struct PatchReport {
+    std::string id;
+    std::string name;
+    std::vector<std::pair<std::string, double>> device; // as in Patch
+    Spectrum refl{};
+    Colour colour;
+    CIELCHCOORD lch{};
+    double to_paper = 0;                       // ΔE00
+    std::optional<int> response;               // the one that reads this patch
+    std::optional<double> density;             // in it, over the paper
+    std::optional<double> dot_area, dot_gain;  // of a tint of one ink
+    std::optional<double> print_contrast;      // of a tint of 75 to 80 %
+    std::optional<double> hue_error, grayness; // of a solid
+    std::optional<double> trap;                // of an overprint of two solids
+};
+
+struct PaperReport {
+    std::string name;
+    CIELABCOORD lab{};
+    double brightness = 0;
+    std::optional<double> whiteness;
+    std::string no_whiteness; // the reason
+};
+
+// How a second paper differs from the first under two illuminants.
+struct MetamerismReport {
+    std::string paper;
+    ILLUM_OBS illuminant; // the second one
+    double sum;           // of the two ΔE*ab
+    double din6172;
+};
+
+// Of patches of one nominal value: their means.
+struct ToneValue {
+    double nominal;
+    double dot_area;
+    double dot_gain;
+    std::size_t patches;
+};
+
+// From the lightest tint to the darkest.
+struct ToneCurve {
+    std::string ink; // device field
+    std::string solid;
+    std::vector<ToneValue> values;
+};
+
+struct Report {
+    std::string file;
+    ILLUM_OBS illuminant;
+    int status;
+    double n_factor;
+    std::vector<std::string> inks; // device fields in the order of printing
+    Source source;
+    PaperReport paper;
+    std::optional<MetamerismReport> metamerism;
+    std::vector<PatchReport> patches;
+    std::vector<ToneCurve> tone_curves; // of the inks that have measured tints
+};
+
+// One patch; `paper` is the colour of the paper.
+PatchReport patch_report(const Patch &patch, const Inks &inks, const Request &request,
+                         const CIELABCOORD &paper);
+PaperReport paper_report(const Patch &paper, ILLUM_OBS illuminant);
+
+Report report_of(const Measurement &sheet, const Inks &inks, const Request &request);
+
+// The output formats; each gives the whole text.
+std::string as_table(const std::vector<Report> &sheets, bool colour);
+std::string as_json(const std::vector<Report> &sheets);
+std::vector<Flat> flat_of(const std::vector<Report> &sheets);
+
+#endif

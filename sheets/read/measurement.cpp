@@ -1,0 +1,27 @@
+#include "read/measurement.h"
+
+#include <fmt/format.h>
+
+#include "read/text.h"
+
+const Patch *find_patch(const Measurement &sheet, std::string_view name)
+{
+    for (const Patch &patch : sheet.patches)
+        if (patch.name == name)
+            return &patch;
+    for (const Patch &patch : sheet.patches)
+        if (patch.id == name)
+            return &patch;
+    return nullptr;
+}
+
+const Patch &patch_named(const Measurement &sheet, std::string_view name)
+{
+    if (const Patch *patch = find_patch(sheet, name))
+        return *patch;
+    std::string names;
+    for (std::size_t i = 0; i < sheet.patches.size() && i < 8; ++i)
+        names += (i ? ", " : "") + in_quotes(sheet.patches[i].name);
+    throw RequestError{fmt::format("{} holds no patch {}; its patches are {}{}", sheet.file,
+                                   in_quotes(name), names, sheet.patches.size() > 8 ? ", …" : "")};
+}

@@ -1,0 +1,147 @@
+#include "read/text.h"
+
+#include <algorithm>
+#include <charconv>
+#include <cmath>
+
+namespace {
+
+char upper_letter(char c) { return c >= 'a' && c <= 'z' ? static_cast<char>(c - 'a' + 'A') : c; }
+
+struct CodePoint {
+    char32_t value;
+    std::size_t bytes;
+};
+
+// The code point that the text begins with; a byte that begins no UTF-8 sequence is Latin-1.
+CodePoint first_code_point(std::string_view text)
+{
+    const auto lead = static_cast<unsigned char>(text[0]);
+    const std::size_t bytes = lead >= 0xF0 ? 4 : lead >= 0xE0 ? 3 : lead >= 0xC2 ? 2 : 1;
+    constexpr char32_t smallest[] = {0, 0, 0x80, 0x800, 0x10000};
+    if (bytes == 1 || lead > 0xF4 || text.size() < bytes)
+        return {lead, 1};
+    char32_t value = lead & (0x7Fu >> bytes);
+    for (std::size_t i = 1; i < bytes; ++i) {
+        const auto next = static_cast<unsigned char>(text[i]);
+        if ((next & 0xC0) != 0x80)
+            return {lead, 1};
+        value = value << 6 | (next & 0x3Fu);
+    }
+    if (value < smallest[bytes] || value > 0x10FFFF || (value >= 0xD800 && value <= 0xDFFF))
+        return {lead, 1};
+    return {value, bytes};
+}
+
+bool unprintable(char32_t c)
+{
+    return c < 0x20 || (c >= 0x7F && c < 0xA0) || c == 0x061C || (c >= 0x200B && c <= 0x200F) ||
+           (c >= 0x2028 && c <= 0x202E) || (c >= 0x2060 && c <= 0x206F) || c == 0xFEFF;
+}
+
+void append_utf8(std::string &out, char32_t c)
+{
+    const auto tail = [&](int shift) { out += static_cast<char>(0x80 | ((c >> shift) & 0x3F)); };
+    if (c < 0x80) {
+        out += static_cast<char>(c);
+    } else if (c < 0x800) {
+        out += static_cast<char>(0xC0 | (c >> 6));
+        tail(0);
+    } else if (c < 0x10000) {
+        out += static_cast<char>(0xE0 | (c >> 12));
+        tail(6);
+        tail(0);
+    } else {
+        out += static_cast<char>(0xF0 | (c >> 18));
+        tail(12);
+        tail(6);
+        tail(0);
+    }
+}
+
+} // namespace
+
+std::string upper(std::string_view text)
+{
+    std::string out(text);
+    std::transform(out.begin(), out.end(), out.begin(), upper_letter);
+    return out;
+}
+
+bool equal_ignoring_case(std::string_view first, std::string_view second)
+{
+    return upper(first) == upper(second);
+}
+
+std::string_view trimmed(std::string_view text)
+{
+    const auto begin = text.find_first_not_of(" \t");
+    if (begin == std::string_view::npos)
+        return {};
+    return text.substr(begin, text.find_last_not_of(" \t") - begin + 1);
+}
+
+std::optional<double> number_in(std::string_view text)
+{
+    std::string digits(trimmed(text));
+    const auto comma = digits.find(',');
+    if (comma != std::string::npos && digits.find('.') == std::string::npos)
+        digits[comma] = '.';
+    const char *begin = digits.data();
+    const char *end = begin + digits.size();
+    if (digits.size() > 1 && digits[0] == '+' && digits[1] != '-')
+        ++begin;
+    double value = 0;
+    const auto [last, error] = std::from_chars(begin, end, value);
+    if (error != std::errc() || last != end || !std::isfinite(value))
+        return std::nullopt;
+    return value;
+}
+
+std::string printable(std::string_view text)
+{
+    std::string out;
+    while (!text.empty()) {
+        const CodePoint next = first_code_point(text);
+        if (next.value == '\t' || next.value == '\n' || next.value == '\r')
+            out += ' ';
+        else
+            append_utf8(out, unprintable(next.value) ? U'\uFFFD' : next.value);
+        text.remove_prefix(next.bytes);
+    }
+    return out;
+}
+
+std::string utf8_of_utf16(std::string_view bytes)
+{
+    const std::size_t high = bytes[0] == '\xFE' ? 0 : 1; // which byte of a pair
+    const auto unit = [&](std::size_t i) -> char32_t {
+        return static_cast<unsigned char>(bytes[i + high]) * 256u +
+               static_cast<unsigned char>(bytes[i + 1 - high]);
+    };
+    std::string out;
+    for (std::size_t i = 2; i + 1 < bytes.size(); i += 2) {
+        char32_t value = unit(i);
+        if (value >= 0xD800 && value < 0xDC00 && i + 3 < bytes.size() &&
+            (unit(i + 2) & 0xFC00) == 0xDC00) {
+            i += 2;
+            value = 0x10000 + ((value & 0x3FF) << 10) + (unit(i) & 0x3FF);
+        }
+        append_utf8(out, value >= 0xD800 && value < 0xE000 ? U'\uFFFD' : value);
+    }
+    return out;
+}
+
+std::string cut(const std::string &text, std::size_t most)
+{
+    std::size_t characters = 0;
+    for (std::size_t i = 0; i < text.size(); ++i)
+        if ((text[i] & 0xC0) != 0x80 && ++characters > most)
+            return text.substr(0, i) + "…";
+    return text;
+}
+
+std::string in_quotes(std::string_view text)
+{
+    return '"' + cut(printable(text.substr(0, 400)), 40) + '"';
+}

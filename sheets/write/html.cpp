@@ -1,0 +1,45 @@
+#include "write/html.h"
+
+#include "read/measurement.h"
+#include "write/page/page.h"
+
+namespace {
+
+// JSON as the text of a script element: no sequence in it ends the element or opens a comment, and
+// no space stands between its tokens. `<`, U+2028 and U+2029 occur in strings alone.
+void append_script_data(std::string &out, std::string_view json)
+{
+    bool in_string = false;
+    for (std::size_t i = 0; i < json.size(); ++i) {
+        const char c = json[i];
+        const std::string_view next3 = json.substr(i, 3);
+        if (c == '<') {
+            out += "\\u003c";
+        } else if (next3 == "\u2028" || next3 == "\u2029") {
+            out += next3 == "\u2028" ? "\\u2028" : "\\u2029";
+            i += 2;
+        } else if (in_string && c == '\\') {
+            out += json.substr(i, 2);
+            ++i;
+        } else if (in_string || (c != ' ' && c != '\n')) {
+            in_string ^= c == '"';
+            out += c;
+        }
+    }
+}
+
+} // namespace
+
+std::string as_html(std::string_view json)
+{
+    if (page_before_data.empty())
+        throw RequestError{
+            "--format html: this program was built without the page, which takes npm"};
+    std::string out;
+    for (const std::string_view part : page_before_data)
+        out += part;
+    append_script_data(out, json);
+    for (const std::string_view part : page_after_data)
+        out += part;
+    return out;
+}

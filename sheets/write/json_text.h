@@ -1,0 +1,37 @@
+// Small helpers of the JSON documents.
+#ifndef VANTREL_TOOL_JSON_TEXT_H
+#define VANTREL_TOOL_JSON_TEXT_H
+
+#include <cstddef>
+#include <functional>
+#include <optional>
+#include <string>
+#include <string_view>
+
+#include <nlohmann/json.hpp>
+
+#include "judge/colour.h"
+#include "judge/densitometer.h"
+
+using Json = nlohmann::ordered_json;
+
+template <typename Value> Json or_null(const std::optional<Value> &value)
+{
+    return value ? Json(*value) : Json();
+}
+
+struct PatchReport;
+
+Json lab_json(const CIELABCOORD &lab);
+
+// Adds `response` and `density`.
+void add_reading(Json &object, const DensityReading &reading, int status);
+
+Json patch_json(const PatchReport &patch, int status);
+
+// The object with one more member, an array whose elements never stand in memory together: each is
+// a line.
+std::string with_array(const Json &object, std::string_view name, std::size_t count,
+                       const std::function<Json(std::size_t)> &element);
+
+#endif

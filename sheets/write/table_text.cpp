@@ -1,0 +1,36 @@
+#include "write/table_text.h"
+
+#include <algorithm>
+
+#include <fmt/format.h>
+
+std::string fixed(const std::optional<double> &value, int decimals)
+{
+    if (!value)
+        return "";
+    std::string out = fmt::format("{:.{}f}", *value, decimals);
+    return out.find_first_of("123456789in") == std::string::npos && out[0] == '-' ? out.substr(1)
+                                                                                  : out;
+}
+
+std::string fixed(const CIELABCOORD &lab)
+{
+    return fmt::format("{} {} {}", fixed(lab.L), fixed(lab.a), fixed(lab.b));
+}
+
+std::size_t characters(const std::string &text)
+{
+    return static_cast<std::size_t>(
+        std::count_if(text.begin(), text.end(), [](char c) { return (c & 0xC0) != 0x80; }));
+}
+
+std::string swatch(const Rgb &rgb)
+{
+    return fmt::format("\x1b[48;2;{};{};{}m    \x1b[0m", rgb.red, rgb.green, rgb.blue);
+}
+
+void Lines::add(std::string line)
+{
+    line.resize(line.find_last_not_of(' ') + 1);
+    out += line + '\n';
+}

@@ -1,0 +1,28 @@
+// Small helpers of the tables on a terminal.
+#ifndef VANTREL_TOOL_TABLE_TEXT_H
+#define VANTREL_TOOL_TABLE_TEXT_H
+
+#include <cstddef>
+#include <optional>
+#include <string>
+
+#include "judge/colour.h"
+
+constexpr std::size_t widest_name = 40;
+constexpr std::size_t widest_in_text = 30; // a line has 120 columns
+
+// Without a minus before zero; nothing stays blank.
+std::string fixed(const std::optional<double> &value, int decimals = 2);
+std::string fixed(const CIELABCOORD &lab); // L*, a*, b* with spaces between
+
+std::size_t characters(const std::string &text);
+std::string swatch(const Rgb &rgb);
+
+// Collects lines, none of them with spaces at its end.
+class Lines {
+public:
+    void add(std::string line);
+    std::string out;
+};
+
+#endif

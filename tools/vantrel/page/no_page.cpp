@@ -1,5 +1,0 @@
-// Stands for the page in a build without npm.
-#include "page.h"
-
-const std::span<const std::string_view> page_before_data{};
-const std::span<const std::string_view> page_after_data{};
