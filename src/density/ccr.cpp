@@ -1,6 +1,6 @@
 #include "density/ccr.h"
 
-#include "density/density.h"
+#include "density/weighted.h"
 
 #include <algorithm>
 #include <cmath>

@@ -6,6 +6,9 @@
 
 namespace vantrel {
 
+inline bool is_status(int status) { return status >= 0 && status < NUM_STATUSES; }
+inline bool is_response(int response) { return response >= 0 && response < NUM_RESPONSES; }
+
 /// The responses that a status measures, in the order of a density set.
 struct StatusResponses {
     int count;

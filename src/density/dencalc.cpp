@@ -2,11 +2,14 @@
 #include "vantrel.h"
 
 #include "base/require.h"
+#include "density/automatic_response.h"
 #include "density/band_constants.h"
 #include "density/ccr.h"
-#include "density/contrast.h"
 #include "density/den_weight.h"
 #include "density/density.h"
+#include "density/paper_adjustment.h"
+#include "density/spectral.h"
+#include "density/weighted.h"
 
 #include <algorithm>
 
@@ -84,7 +87,7 @@ int DetermineDensityResponse(const double *refl, int status, const double *paper
 {
     VANTREL_REQUIRE(refl, "0");
     VANTREL_REQUIRE(is_status(status), "0");
-    return density_response(spectrum(refl), status, vantrel::paper(paper));
+    return automatic_response(spectrum(refl), status, vantrel::paper(paper));
 }
 
 void FindDensityMax(DENSITYSTRUCT *densities, double &density, int &response, int includeVisual)

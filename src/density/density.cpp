@@ -2,61 +2,15 @@
 
 #include "density/ccr.h"
 #include "density/den_weight.h"
+#include "density/spectral.h"
 #include "density/spectralx.h"
+#include "density/weighted.h"
 
 #include <algorithm>
-#include <cmath>
 
 namespace vantrel {
-namespace {
 
-// A weight row sums to 100 000 and a spectrum is in percent.
-constexpr double kToFactor = 1e-7;
-constexpr double kToPercent = 1e-5f;
-constexpr double kLeastFactor = 1e-5;
-constexpr double kLeastPercent = 0.0009999999310821295;
-static_assert(kToPercent == 9.999999747378752e-6);
-
-// Subtracted from 0 rather than negated, so that a perfect white has 0 and not -0.
-double density_of_sum(double sum)
-{
-    return 0 - std::log10(std::max(sum * kToFactor, kLeastFactor));
-}
-
-double clamped(double density) { return std::clamp(density, 0.0, 5.0); }
-
-} // namespace
-
-double weighted_sum(Spectrum refl, int status, int response)
-{
-    const Weights weights = weights_of(status, response);
-    double sum = 0;
-    for (int i = 0; i < kBands; ++i)
-        sum += refl[i] * static_cast<double>(weights[i]);
-    return sum;
-}
-
-double weighted_reflectance(Spectrum refl, int status, int response)
-{
-    return std::max(weighted_sum(refl, status, response) * kToPercent, kLeastPercent);
-}
-
-double weighted_density(Spectrum refl, Paper paper, int status, int response)
-{
-    if (!paper)
-        return density_of_sum(weighted_sum(refl, status, response));
-    // Both sums in one pass: the additions of the one run in the shadow of the other.
-    const Weights weights = weights_of(status, response);
-    double sum = 0, paper_sum = 0;
-    for (int i = 0; i < kBands; ++i) {
-        const double weight = static_cast<double>(weights[i]);
-        sum += refl[i] * weight;
-        paper_sum += (*paper)[i] * weight;
-    }
-    return density_of_sum(sum) - density_of_sum(paper_sum);
-}
-
-double spectral_density(double refl) { return 0 - std::log10(std::max(refl, 1e-5) / 100); }
+static double clamped(double density) { return std::clamp(density, 0.0, 5.0); }
 
 std::optional<double> density(Spectrum refl, Paper paper, int status, int response)
 {
@@ -80,6 +34,29 @@ std::optional<double> density(Spectrum refl, Paper paper, int status, int respon
         if (!is_status(status) || !is_response(response))
             return std::nullopt;
         return weighted_density(refl, paper, status, response);
+    }
+}
+
+std::optional<Densities> densities(Spectrum refl, Paper paper, int status)
+{
+    if (!is_status(status))
+        return std::nullopt;
+    Densities set{};
+    switch (status) {
+    case CCR1_STATUS:
+    case CCR2_STATUS:
+        return ccr_densities(refl, paper, status);
+    case SPECTRAL_STATUS:
+        std::ranges::fill(set.density,
+                          *density(refl, paper, status, darkest_wavelength(refl, paper)));
+        return set;
+    case SPECTRALX_STATUS:
+        std::ranges::fill(set.density, *density(refl, paper, status, VISUAL_RESPONSE));
+        return set;
+    default:
+        for (const int response : responses_of(status))
+            set.density[response] = weighted_density(refl, paper, status, response);
+        return set;
     }
 }
 

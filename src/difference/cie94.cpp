@@ -3,7 +3,8 @@
 
 #include "base/require.h"
 #include "colorimetry/lab.h"
-#include "difference/cielab.h"
+#include "difference/de94.h"
+#include "difference/din6172.h"
 
 using namespace vantrel;
 

@@ -2,7 +2,8 @@
 #include "vantrel.h"
 
 #include "base/require.h"
-#include "difference/cielab.h"
+#include "difference/cie76.h"
+#include "difference/cmc.h"
 
 using namespace vantrel;
 

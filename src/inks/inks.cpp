@@ -8,6 +8,7 @@
 #include "colorimetry/spaces.h"
 #include "inks/error_weights.h"
 #include "inks/estimate.h"
+#include "inks/film.h"
 #include "inks/overprint.h"
 #include "inks/saunderson.h"
 #include "inks/tint.h"

@@ -1,10 +1,6 @@
 #include "inks/saunderson.h"
 
-#include <cmath>
-
 namespace vantrel {
-
-static constexpr double kBlack = 0.0001; // percent; below it a reflectance is not modelled
 
 double saunderson(double refl, double k1, double k2)
 {
@@ -18,30 +14,6 @@ double unsaunderson(double refl, double k1, double k2)
         return refl;
     const double r = refl / 100;
     return ((1 - k1 - k2) + k1 / r) / (1 / r - k2) * 100;
-}
-
-// The surface of a printed film.
-static constexpr double kSurface = 0;
-static constexpr double kInside = 0.6;
-
-// Absorbance of a layer in natural logarithms.
-static double absorbance(double refl) { return 2 - std::log(saunderson(refl, kSurface, kInside)); }
-
-Bands film(Spectrum ink, double thickness, Spectrum paper)
-{
-    Bands refl;
-    for (int i = 0; i < kBands; ++i) {
-        if (ink[i] < kBlack) {
-            refl[i] = ink[i];
-            continue;
-        }
-        const double Dp = absorbance(paper[i]);
-        double Di = (absorbance(ink[i]) - Dp) * thickness;
-        if (Di < 0)
-            Di = 0;
-        refl[i] = unsaunderson(std::exp(2 - Di - Dp), kSurface, kInside);
-    }
-    return refl;
 }
 
 } // namespace vantrel

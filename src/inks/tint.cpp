@@ -1,6 +1,6 @@
 #include "inks/tint.h"
 
-#include "inks/saunderson.h"
+#include "inks/film.h"
 
 namespace vantrel {
 

@@ -1,7 +1,7 @@
 #include "paper/metamerism.h"
 
 #include "colorimetry/lab.h"
-#include "difference/cielab.h"
+#include "difference/cie76.h"
 
 namespace vantrel {
 

@@ -1,6 +1,6 @@
 #include "polarisation/adjust.h"
 
-#include "density/densities.h"
+#include "density/automatic_response.h"
 
 namespace vantrel {
 
@@ -63,7 +63,7 @@ Bands scaled(Spectrum refl, double factor)
 std::optional<Bands> polarised(Spectrum refl, Targets targets, const PolWeights &weights,
                                double noise)
 {
-    const int response = density_response(refl, E_STATUS, std::nullopt);
+    const int response = automatic_response(refl, E_STATUS, std::nullopt);
     const auto factor =
         overall_factor(channel_factors(refl, response, targets, weights), response, noise);
     if (!factor)

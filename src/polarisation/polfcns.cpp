@@ -2,14 +2,17 @@
 #include "vantrel.h"
 
 #include "base/require.h"
+#include "density/automatic_response.h"
+#include "density/den_weight.h"
 #include "density/density.h"
+#include "density/hue_gray.h"
 #include "polarisation/adjust.h"
 #include "polarisation/densities.h"
 #include "print/contrast_trap.h"
 #include "print/dot_area.h"
-#include "print/hue_gray.h"
 
-#include <algorithm>
+#include <array>
+#include <initializer_list>
 
 using namespace vantrel;
 
@@ -17,21 +20,38 @@ namespace {
 
 Targets four(const double *targets) { return Targets(targets, 4); }
 
-// The paper of a call, adjusted where there is one; failed where it cannot be adjusted.
-struct PolarisedPaper {
-    PolarisedPaper(Paper refl, const double *targets, const POLWEIGHTSTRUCT &weights,
-                   double noise = 0)
-    {
-        if (!refl)
-            return;
-        adjusted = polarised(*refl, four(targets), weights, noise);
-        failed = !adjusted;
-    }
-    operator Paper() const { return adjusted ? Paper(*adjusted) : std::nullopt; }
-
-    std::optional<Bands> adjusted;
-    bool failed = false;
+/// A spectrum of a call and its targets.
+struct Reading {
+    const double *refl, *targets;
 };
+
+/// Up to three patches of a call and the paper, where there is one, each adjusted in its own
+/// response.
+struct Patches {
+    std::array<Bands, 3> patch{};
+    std::optional<Bands> adjusted_paper;
+
+    Paper paper() const { return adjusted_paper ? Paper(*adjusted_paper) : std::nullopt; }
+};
+
+/// Nothing where one of them cannot be adjusted.
+std::optional<Patches> adjusted(std::initializer_list<Reading> patches, Reading paper,
+                                const PolWeights &weights)
+{
+    Patches result;
+    for (Bands *out = result.patch.data(); const auto &[refl, targets] : patches) {
+        const auto patch = polarised(spectrum(refl), four(targets), weights);
+        if (!patch)
+            return std::nullopt;
+        *out++ = *patch;
+    }
+    if (paper.refl) {
+        result.adjusted_paper = polarised(spectrum(paper.refl), four(paper.targets), weights);
+        if (!result.adjusted_paper)
+            return std::nullopt;
+    }
+    return result;
+}
 
 } // namespace
 
@@ -59,10 +79,9 @@ int PolDetermineDensityResponse(const double *refl, const double *targets, int s
                                 const POLWEIGHTSTRUCT *weights)
 {
     VANTREL_REQUIRE(is_status(status), "0");
-    const auto sample = polarised(spectrum(refl), four(targets), *weights);
-    const PolarisedPaper adjustedPaper(vantrel::paper(paper), paperTargets, *weights);
-    VANTREL_REQUIRE(sample && !adjustedPaper.failed, "0");
-    return density_response(*sample, status, adjustedPaper);
+    const auto read = adjusted({{refl, targets}}, {paper, paperTargets}, *weights);
+    VANTREL_REQUIRE(read, "0");
+    return automatic_response(read->patch[0], status, read->paper());
 }
 
 int PolReflToDensity(const double *refl, const double *targets, const double *paper,
@@ -71,10 +90,9 @@ int PolReflToDensity(const double *refl, const double *targets, const double *pa
 {
     VANTREL_REQUIRE(density, "0");
     VANTREL_REQUIRE(is_status(status), "0");
-    const auto sample = polarised(spectrum(refl), four(targets), *weights);
-    const PolarisedPaper adjustedPaper(vantrel::paper(paper), paperTargets, *weights);
-    VANTREL_REQUIRE(sample && !adjustedPaper.failed, "0");
-    return store(vantrel::density(*sample, adjustedPaper, status, response), density);
+    const auto read = adjusted({{refl, targets}}, {paper, paperTargets}, *weights);
+    VANTREL_REQUIRE(read, "0");
+    return store(vantrel::density(read->patch[0], read->paper(), status, response), density);
 }
 
 int PolReflToDensities(const double *refl, const double *targets, const double *paper,
@@ -83,10 +101,10 @@ int PolReflToDensities(const double *refl, const double *targets, const double *
 {
     VANTREL_REQUIRE(refl && densities, "0");
     VANTREL_REQUIRE(is_status(status), "0");
-    const PolarisedPaper adjustedPaper(vantrel::paper(paper), paperTargets, *weights);
-    const auto result = adjustedPaper.failed ? std::nullopt
-                                             : polarised_densities(spectrum(refl), four(targets),
-                                                                   adjustedPaper, *weights, status);
+    const auto read = adjusted({}, {paper, paperTargets}, *weights);
+    const auto result =
+        read ? polarised_densities(spectrum(refl), four(targets), read->paper(), *weights, status)
+             : std::nullopt;
     *densities = result.value_or(Densities{});
     return result ? 1 : 0;
 }
@@ -97,14 +115,17 @@ int PolReflToHueGray(const double *refl, const double *targets, const double *pa
 {
     VANTREL_REQUIRE(refl && grayness && hueError, "0");
     VANTREL_REQUIRE(is_status(status) && status != SPECTRALX_STATUS, "0");
-    const PolarisedPaper adjustedPaper(vantrel::paper(paper), paperTargets, *weights);
-    VANTREL_REQUIRE(!adjustedPaper.failed, "0");
+    auto read = adjusted({}, {paper, paperTargets}, *weights);
+    VANTREL_REQUIRE(read, "0");
     // The density set adjusts the paper that it is given, here one that is adjusted already.
-    const PolarisedPaper twice(adjustedPaper, paperTargets, *weights, kRoundingNoise);
-    if (twice.failed)
-        return 9;
-    const auto set =
-        polarised_densities(spectrum(refl), four(targets), twice, *weights, process_status(status));
+    if (paper) {
+        read->adjusted_paper =
+            polarised(*read->adjusted_paper, four(paperTargets), *weights, kRoundingNoise);
+        if (!read->adjusted_paper)
+            return 9;
+    }
+    const auto set = polarised_densities(spectrum(refl), four(targets), read->paper(), *weights,
+                                         process_status(status));
     if (!set)
         return 9;
     const HueGray result = hue_gray(*set);
@@ -120,12 +141,11 @@ int PolReflToDotArea(const double *solid, const double *solidTargets, const doub
 {
     VANTREL_REQUIRE(dotArea, "0");
     VANTREL_REQUIRE(is_status(status), "0");
-    const auto adjustedSolid = polarised(spectrum(solid), four(solidTargets), *weights);
-    const auto adjustedTint = polarised(spectrum(tint), four(tintTargets), *weights);
-    const PolarisedPaper adjustedPaper(vantrel::paper(paper), paperTargets, *weights);
-    VANTREL_REQUIRE(adjustedSolid && adjustedTint && !adjustedPaper.failed, "0");
-    return store(dot_area(*adjustedSolid, *adjustedTint, adjustedPaper, status, response, nFactor),
-                 dotArea);
+    const auto read =
+        adjusted({{solid, solidTargets}, {tint, tintTargets}}, {paper, paperTargets}, *weights);
+    VANTREL_REQUIRE(read, "0");
+    const auto &[s, t, unused] = read->patch;
+    return store(dot_area(s, t, read->paper(), status, response, nFactor), dotArea);
 }
 
 int PolReflToDotGain(const double *solid, const double *solidTargets, const double *tint,
@@ -135,13 +155,11 @@ int PolReflToDotGain(const double *solid, const double *solidTargets, const doub
 {
     VANTREL_REQUIRE(dotGain, "0");
     VANTREL_REQUIRE(is_status(status), "0");
-    const auto adjustedSolid = polarised(spectrum(solid), four(solidTargets), *weights);
-    const auto adjustedTint = polarised(spectrum(tint), four(tintTargets), *weights);
-    const PolarisedPaper adjustedPaper(vantrel::paper(paper), paperTargets, *weights);
-    VANTREL_REQUIRE(adjustedSolid && adjustedTint && !adjustedPaper.failed, "0");
-    return store(dot_gain(*adjustedSolid, *adjustedTint, adjustedPaper, status, response, nFactor,
-                          nominalDotArea),
-                 dotGain);
+    const auto read =
+        adjusted({{solid, solidTargets}, {tint, tintTargets}}, {paper, paperTargets}, *weights);
+    VANTREL_REQUIRE(read, "0");
+    const auto &[s, t, unused] = read->patch;
+    return store(dot_gain(s, t, read->paper(), status, response, nFactor, nominalDotArea), dotGain);
 }
 
 int PolReflToPrintContrast(const double *solid, const double *solidTargets, const double *tint,
@@ -151,12 +169,11 @@ int PolReflToPrintContrast(const double *solid, const double *solidTargets, cons
 {
     VANTREL_REQUIRE(contrast, "0");
     VANTREL_REQUIRE(is_status(status), "0");
-    const auto adjustedSolid = polarised(spectrum(solid), four(solidTargets), *weights);
-    const auto adjustedTint = polarised(spectrum(tint), four(tintTargets), *weights);
-    const PolarisedPaper adjustedPaper(vantrel::paper(paper), paperTargets, *weights);
-    VANTREL_REQUIRE(adjustedSolid && adjustedTint && !adjustedPaper.failed, "0");
-    return store(print_contrast(*adjustedSolid, *adjustedTint, adjustedPaper, status, response),
-                 contrast);
+    const auto read =
+        adjusted({{solid, solidTargets}, {tint, tintTargets}}, {paper, paperTargets}, *weights);
+    VANTREL_REQUIRE(read, "0");
+    const auto &[s, t, unused] = read->patch;
+    return store(print_contrast(s, t, read->paper(), status, response), contrast);
 }
 
 int PolReflToTrap(const double *second, const double *secondTargets, const double *first,
@@ -166,13 +183,11 @@ int PolReflToTrap(const double *second, const double *secondTargets, const doubl
 {
     VANTREL_REQUIRE(trap, "0");
     VANTREL_REQUIRE(is_status(status), "0");
-    const auto adjustedSecond = polarised(spectrum(second), four(secondTargets), *weights);
-    const auto adjustedFirst = polarised(spectrum(first), four(firstTargets), *weights);
-    const auto adjustedOverprint = polarised(spectrum(overprint), four(overprintTargets), *weights);
-    const PolarisedPaper adjustedPaper(vantrel::paper(paper), paperTargets, *weights);
-    VANTREL_REQUIRE(adjustedSecond && adjustedFirst && adjustedOverprint && !adjustedPaper.failed,
-                    "0");
-    return store(vantrel::trap(*adjustedSecond, *adjustedFirst, *adjustedOverprint, adjustedPaper,
-                               status, response),
+    const auto read =
+        adjusted({{second, secondTargets}, {first, firstTargets}, {overprint, overprintTargets}},
+                 {paper, paperTargets}, *weights);
+    VANTREL_REQUIRE(read, "0");
+    const auto &[second_down, first_down, printed] = read->patch;
+    return store(vantrel::trap(second_down, first_down, printed, read->paper(), status, response),
                  trap);
 }

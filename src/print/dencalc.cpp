@@ -2,12 +2,14 @@
 #include "vantrel.h"
 
 #include "base/require.h"
+#include "density/den_weight.h"
 #include "density/density.h"
+#include "density/hue_gray.h"
 #include "print/contrast_trap.h"
 #include "print/density_ratio.h"
 #include "print/dot_area.h"
-#include "print/hue_gray.h"
 #include "print/integrated_refl.h"
+#include "print/polarisation_intercept.h"
 
 using namespace vantrel;
 

@@ -1,7 +1,7 @@
 #include "print/density_ratio.h"
 
 #include "base/numeric.h"
-#include "density/densities.h"
+#include "density/automatic_response.h"
 #include "density/density.h"
 
 #include <cmath>
@@ -12,7 +12,7 @@ static constexpr double kLargestRatio = 1000;
 
 double density_ratio(Spectrum reference, Spectrum sample, int status)
 {
-    const int response = density_response(reference, status, std::nullopt);
+    const int response = automatic_response(reference, status, std::nullopt);
     const double Dref = density(reference, std::nullopt, status, response).value_or(0);
     const double Dsmp = density(sample, std::nullopt, status, response).value_or(0);
     if (Dref == 0)

@@ -1,4 +1,4 @@
-#include "print/hue_gray.h"
+#include "density/hue_gray.h"
 
 namespace vantrel {
 

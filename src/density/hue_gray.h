@@ -1,6 +1,6 @@
 #pragma once
 
-#include "density/densities.h"
+#include "density/density_set.h"
 
 namespace vantrel {
 

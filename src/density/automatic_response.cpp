@@ -1,45 +1,28 @@
-#include "density/densities.h"
+#include "density/automatic_response.h"
 
 #include "colorimetry/lab.h"
 #include "density/achromatic.h"
-#include "density/ccr.h"
-#include "density/contrast.h"
-#include "density/den_weight.h"
 #include "density/density.h"
+#include "density/hue_gray.h"
+#include "density/paper_adjustment.h"
+#include "density/spectral.h"
 #include "density/spectralx.h"
 
-#include <algorithm>
+#include <cmath>
 
 namespace vantrel {
 namespace {
 
-/// Every second band from 420 nm.
-int darkest_wavelength(Spectrum refl)
+double hue_error(Spectrum refl)
 {
-    int darkest = 2;
-    double largest = 0;
-    for (int band = 2; band < kBands; band += 2) {
-        const double density = spectral_density(refl[band]);
-        if (density > largest) {
-            darkest = band;
-            largest = density;
-        }
-    }
-    return 400 + 10 * darkest;
-}
-
-double hue_error(Spectrum refl, int status)
-{
-    double grayness = 0, error = 0;
-    ReflToHueGray(refl.data(), nullptr, status, &grayness, &error);
-    return error;
+    return hue_gray(*densities(refl, std::nullopt, E_STATUS)).hue_error;
 }
 
 /// The third HiFi ink and cyan are both darkest in the red; the hue error tells them apart.
 int hifi_response(Spectrum refl, int response)
 {
     if (response == HIFI3_RESPONSE || response == RED_RESPONSE)
-        return hue_error(refl, HIFI_STATUS) > 39.5 ? HIFI3_RESPONSE : RED_RESPONSE;
+        return hue_error(refl) > 39.5 ? HIFI3_RESPONSE : RED_RESPONSE;
     return response;
 }
 
@@ -47,7 +30,7 @@ int hifi_response(Spectrum refl, int response)
 int hexachrome_response(Spectrum refl, const Lab &lab, int response)
 {
     if (response == HEXACHROME1_RESPONSE || response == BLUE_RESPONSE)
-        response = hue_error(refl, HEXACHROME_STATUS) > 30 ? HEXACHROME1_RESPONSE : BLUE_RESPONSE;
+        response = hue_error(refl) > 30 ? HEXACHROME1_RESPONSE : BLUE_RESPONSE;
     if (response == HEXACHROME1_RESPONSE || response == HEXACHROME2_RESPONSE) {
         const double hue = lch_from_lab(lab).h;
         response = 90 < hue && hue < 270 ? HEXACHROME2_RESPONSE : HEXACHROME1_RESPONSE;
@@ -57,8 +40,6 @@ int hexachrome_response(Spectrum refl, const Lab &lab, int response)
 
 int response_of(Spectrum refl, int status)
 {
-    if (status == SPECTRAL_STATUS)
-        return darkest_wavelength(refl);
     const Lab lab = rounded(lab_from_spectrum(refl, D65_10DEG));
     if (!is_chromatic(lab.L, chroma(lab)))
         return VISUAL_RESPONSE;
@@ -76,6 +57,33 @@ int response_of(Spectrum refl, int status)
     default:
         return response;
     }
+}
+
+/// A sample on a paper, as they are measured: the adjusted reflectance stays of ordinary size.
+bool is_ordinary(double refl, double paper)
+{
+    return refl > 1e-3 && refl < 200 && paper > 1 && paper < 200;
+}
+
+// With Ds = log10(100 / R) and Ds - Dp = log10(P / R) that is R (R / P)^k. What is not ordinary, or
+// too near to the step at a density of 0.5, stays with the logarithms.
+double roughly_adjusted(double refl, double paper)
+{
+    constexpr double kStep = 0.31622776601683794; // 10^-0.5
+    const double ratio = refl / paper;
+    if (!is_ordinary(refl, paper) || std::fabs(ratio - kStep) < 1e-12)
+        return adjusted_for_paper(refl, paper);
+    return ratio < kStep ? refl * ratio : refl * ratio * ratio;
+}
+
+/// adjusted_for_paper() but for the last digits (1e-14 of a reflectance), in a fraction of the
+/// time.
+Bands roughly_adjusted(Spectrum refl, Spectrum paper)
+{
+    Bands result;
+    for (int i = 0; i < kBands; ++i)
+        result[i] = roughly_adjusted(refl[i], paper[i]);
+    return result;
 }
 
 /// The response of an ISO status, where a change in the last digits of the spectrum could not give
@@ -105,55 +113,16 @@ std::optional<int> firm_response(Spectrum refl, int status)
 
 } // namespace
 
-std::optional<Densities> densities(Spectrum refl, Paper paper, int status)
+int automatic_response(Spectrum refl, int status, Paper paper)
 {
-    if (!is_status(status))
-        return std::nullopt;
-    Densities set{};
-    switch (status) {
-    case CCR1_STATUS:
-    case CCR2_STATUS:
-        return ccr_densities(refl, paper, status);
-    case SPECTRAL_STATUS:
-    case SPECTRALX_STATUS: {
-        const int response =
-            status == SPECTRAL_STATUS ? density_response(refl, status, paper) : VISUAL_RESPONSE;
-        std::ranges::fill(set.density, *density(refl, paper, status, response));
-        return set;
-    }
-    default:
-        for (const int response : responses_of(status))
-            set.density[response] = weighted_density(refl, paper, status, response);
-        return set;
-    }
-}
-
-Extreme largest(const Densities &set, bool include_visual, int preset_response)
-{
-    Extreme result = {0, preset_response};
-    for (int r = include_visual ? VISUAL_RESPONSE : RED_RESPONSE; r < NUM_RESPONSES; ++r)
-        if (set.density[r] > result.density)
-            result = {set.density[r], r};
-    return result;
-}
-
-Extreme smallest(const Densities &set, bool include_visual, int preset_response)
-{
-    Extreme result = {100, preset_response};
-    for (int r = include_visual ? VISUAL_RESPONSE : RED_RESPONSE; r < NUM_RESPONSES; ++r)
-        if (set.density[r] != 0 && set.density[r] < result.density)
-            result = {set.density[r], r};
-    return result;
-}
-
-int density_response(Spectrum refl, int status, Paper paper)
-{
+    if (status == SPECTRAL_STATUS)
+        return darkest_wavelength(refl, paper);
     if (!paper)
         return response_of(refl, status);
     // Whatever the speed, the answer is that of the exact adjustment, even where the densities of
     // two responses tie (in filters whose weights do not all but cancel out).
     if (status <= T_STATUS)
-        if (const auto response = firm_response(roughly_adjusted_for_paper(refl, *paper), status))
+        if (const auto response = firm_response(roughly_adjusted(refl, *paper), status))
             return *response;
     return response_of(adjusted_for_paper(refl, *paper), status);
 }

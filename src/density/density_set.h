@@ -2,8 +2,6 @@
 
 #include "base/spectrum.h"
 
-#include <optional>
-
 namespace vantrel {
 
 using Densities = DENSITYSTRUCT;
@@ -14,17 +12,11 @@ struct Extreme {
     int response;
 };
 
-/// Every response that the status measures; nothing for an unknown status.
-std::optional<Densities> densities(Spectrum refl, Paper paper, int status);
-
 /// The largest density above 0; 0 and the preset response where there is none.
 Extreme largest(const Densities &set, bool include_visual, int preset_response);
 
 /// The smallest density below 100 that is not exactly 0; 100 and the preset response where there is
 /// none.
 Extreme smallest(const Densities &set, bool include_visual, int preset_response);
-
-/// The response (or wavelength, or band) that reads this ink.
-int density_response(Spectrum refl, int status, Paper paper);
 
 } // namespace vantrel

@@ -1,0 +1,30 @@
+#include "difference/cie76.h"
+
+#include "base/numeric.h"
+#include "colorimetry/lab.h"
+
+#include <cmath>
+
+namespace vantrel {
+
+double delta_e76(const Lab &first, const Lab &second)
+{
+    return std::sqrt(square(first.L - second.L) + square(first.a - second.a) +
+                     square(first.b - second.b));
+}
+
+double delta_h(const Lab &first, const Lab &second)
+{
+    const Lch lch1 = lch_from_lab(rounded(first));
+    const Lch lch2 = lch_from_lab(rounded(second));
+    const double dH = std::sqrt(std::fabs(square(second.a - first.a) + square(second.b - first.b) -
+                                          square(lch2.C - lch1.C)));
+    double dh = lch2.h - lch1.h;
+    if (dh > 180)
+        dh -= 360;
+    if (dh < -180)
+        dh += 360;
+    return dh < 0 ? -dH : dH;
+}
+
+} // namespace vantrel

@@ -1,0 +1,14 @@
+#pragma once
+
+#include "base/spectrum.h"
+
+namespace vantrel {
+
+/// CIE 1976 ΔE*ab (CIE 15).
+double delta_e76(const Lab &first, const Lab &second);
+
+/// Signed CIE 1976 ΔH*ab (CIE 15): positive when the second hue lies counter-clockwise of the
+/// first.
+double delta_h(const Lab &first, const Lab &second);
+
+} // namespace vantrel
