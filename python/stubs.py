@@ -57,7 +57,8 @@ def declaration(name, function):
             starred = True
         kind = "Any" if p.annotation is p.empty else f"_{p.annotation}"
         annotation = keywords.get(p.name, kind)
-        parameters.append(f"{p.name}: {annotation}" + ("" if p.default is p.empty else " = ..."))
+        default = "" if p.default is p.empty else f" = {p.default!r}"
+        parameters.append(f"{p.name}: {annotation}{default}")
     result = "Any"
     if name.startswith("get_num") and not parameters:
         result = "int"

@@ -37,7 +37,6 @@ from ._colour import (
 )
 from ._difference import (
     CIEDE2000,
-    cie_yxy_to_white_e313_98,
     cielch_to_de94,
     lab_to_de2000,
     lab_to_de2000_ex,
@@ -45,11 +44,14 @@ from ._difference import (
     lab_to_de_cmc,
     lab_to_de_lab,
     lab_to_dh,
+    refl_to_din6172,
+    verbal_color_difference,
+)
+from ._paper import (
+    cie_yxy_to_white_e313_98,
     metamerism,
     refl_to_brightness,
-    refl_to_din6172,
     refl_to_white_e313_98,
-    verbal_color_difference,
 )
 from ._density import (
     adjust_for_paper_refls,

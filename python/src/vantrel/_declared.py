@@ -1,0 +1,104 @@
+"""What a declaration says of a function, and the call of its ufunc on NumPy arrays."""
+
+import inspect
+
+import numpy as np
+
+from . import _ufuncs
+from ._arguments import check_core, check_reading, convert, is_lazy
+
+WORDS = {"verbal_color_difference": np.array(_ufuncs.difference_words)}
+
+
+class Declared:
+    """One function: its ufuncs, and the names of its outputs."""
+
+    def __init__(self, declaration, outputs):
+        self.name = declaration.__name__
+        self.outputs = outputs
+        self.parameters = list(inspect.signature(declaration).parameters.values())
+        self.ufunc = getattr(_ufuncs, self.name)
+        self.flagged = getattr(_ufuncs, self.name + "_ok", None)
+        self.signature = _signature(self.ufunc)
+        inputs, _, results = self.signature.partition("->")
+        self.cores = _cores(inputs)
+        self.result_cores = _cores(results)
+        self.names = [p.name for p in self.parameters]
+        self.kinds = [p.annotation for p in self.parameters]
+        self.defaults = {p.name: p.default for p in self.parameters if p.default is not p.empty}
+
+    def bind(self, args, kwargs):
+        """The arguments in order, defaults filled in."""
+        if len(args) > len(self.names):
+            raise TypeError(f"{self.name}() takes {len(self.names)} arguments, not {len(args)}")
+        values = list(args)
+        for name in self.names[len(args) :]:
+            if name in kwargs:
+                values.append(kwargs.pop(name))
+            elif name in self.defaults:
+                values.append(self.defaults[name])
+            else:
+                raise TypeError(f"{self.name}() needs the argument {name!r}")
+        if kwargs:
+            wrong = next(iter(kwargs))
+            given = "twice" if wrong in self.names else "an unknown argument"
+            raise TypeError(f"{self.name}() was given {wrong!r}: {given}")
+        return values
+
+    def prepare(self, values):
+        given = dict(zip(self.kinds, values))
+        if given.get("OptionalSpectra") is not None and given.get("OptionalTargets", 0) is None:
+            raise ValueError("paper_targets: a paper needs them")
+        values = [convert(*three) for three in zip(self.kinds, values, self.names)]
+        for value, core, kind, name in zip(values, self.cores, self.kinds, self.names):
+            if core:
+                check_core(value, core, kind, name)
+        if "Reading" in self.kinds:
+            reading = self.kinds.index("Reading")
+            status = values[self.names.index("status")]
+            if not is_lazy(status) and not is_lazy(values[reading]):
+                check_reading(status, values[reading], self.names[reading])
+        return values
+
+    def result_types(self, ok):
+        """(names of the core dimensions, type) of each output."""
+        types = (self.flagged if ok else self.ufunc).types[0].partition("->")[2]
+        dtypes = [np.dtype(t) for t in types]
+        if self.name in WORDS:
+            dtypes[:3] = [WORDS[self.name].dtype] * 3
+        cores = self.result_cores + ([[]] if ok else [])
+        return cores, dtypes
+
+
+def _signature(ufunc):
+    """NumPy forgets the signature of a ufunc without a core."""
+    nothing = ",".join(["()"] * ufunc.nin) + "->" + ",".join(["()"] * ufunc.nout)
+    return ufunc.signature or nothing
+
+
+def _cores(signature):
+    """The core dimensions of "(n,31),()" as [["n", "31"], []]."""
+    return [[d for d in core.split(",") if d] for core in signature[1:-1].split("),(")]
+
+
+DECLARED = {}
+
+
+def evaluate(name, ok, *values, out=None, missing=()):
+    """Runs the ufunc of a function on NumPy arrays; `missing` spectra were not handed on."""
+    declared = DECLARED[name]
+    for index in missing:
+        values = values[:index] + (np.empty(0),) + values[index:]
+    ufunc = declared.flagged if ok else declared.ufunc
+    words = WORDS.get(name)
+    if out is None:
+        results = ufunc(*values)
+    elif words is not None:
+        raise TypeError(f"{name}() makes new arrays of words and has no out=")
+    else:
+        outs = out if isinstance(out, tuple) else (out,)
+        results = ufunc(*values, out=outs + (None,) * (ufunc.nout - len(outs)))
+    if words is None:
+        return results
+    texts = tuple(words[np.maximum(r, 0)] for r in results[:3])
+    return tuple(t if np.ndim(t) else str(t) for t in texts) + results[3:]
