@@ -9,6 +9,8 @@
 #include <cstdio>
 #include <cstdlib>
 
+using namespace vantrel::sheets;
+
 namespace {
 
 void require(bool holds, const char *fault)

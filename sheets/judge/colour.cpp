@@ -2,6 +2,8 @@
 
 #include <fmt/format.h>
 
+namespace vantrel::sheets {
+
 CIELABCOORD lab_of(const Spectrum &refl, ILLUM_OBS illuminant)
 {
     double lab[3];
@@ -42,3 +44,5 @@ std::string hex(const Rgb &rgb)
 {
     return fmt::format("#{:02x}{:02x}{:02x}", rgb.red, rgb.green, rgb.blue);
 }
+
+} // namespace vantrel::sheets

@@ -1,11 +1,12 @@
 // The colour of a spectrum, as a host shows it.
-#ifndef VANTREL_TOOL_COLOUR_H
-#define VANTREL_TOOL_COLOUR_H
+#pragma once
+
+#include "read/measurement.h"
 
 #include <cstdint>
 #include <string>
 
-#include "read/measurement.h"
+namespace vantrel::sheets {
 
 // Drive levels of the screen preview.
 struct Rgb {
@@ -30,4 +31,4 @@ CIELCHCOORD lch_of(const CIELABCOORD &lab);
 double delta_e00(const CIELABCOORD &first, const CIELABCOORD &second);
 std::string hex(const Rgb &rgb); // #rrggbb
 
-#endif
+} // namespace vantrel::sheets

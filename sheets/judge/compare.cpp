@@ -1,19 +1,20 @@
 #include "judge/compare.h"
 
+#include "read/progress.h"
+#include "read/text.h"
+
+#include <fmt/format.h>
+
 #include <algorithm>
 #include <cmath>
 #include <iterator>
 #include <numeric>
 #include <unordered_map>
 
-#include <fmt/format.h>
-
-#include "read/progress.h"
-#include "read/text.h"
-
+namespace vantrel::sheets {
 namespace {
 
-constexpr std::size_t most_worst = 10;
+constexpr std::size_t kMostWorst = 10;
 
 constexpr struct {
     Formula formula;
@@ -253,6 +254,8 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
     for (std::size_t metric = 0; metric < request.metrics.size(); ++metric)
         out.statistics.push_back(statistics_of(out.pairs, metric));
     out.worst = worst_first(out.pairs, 0);
-    out.worst.resize(std::min(out.worst.size(), most_worst));
+    out.worst.resize(std::min(out.worst.size(), kMostWorst));
     return out;
 }
+
+} // namespace vantrel::sheets

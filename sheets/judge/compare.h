@@ -1,6 +1,10 @@
 // What `vantrel compare` says about a sample beside its reference.
-#ifndef VANTREL_TOOL_COMPARE_H
-#define VANTREL_TOOL_COMPARE_H
+#pragma once
+
+#include "judge/colour.h"
+#include "judge/densitometer.h"
+#include "read/measurement.h"
+#include "write/flat.h"
 
 #include <optional>
 #include <string>
@@ -8,10 +12,7 @@
 #include <utility>
 #include <vector>
 
-#include "judge/colour.h"
-#include "judge/densitometer.h"
-#include "read/measurement.h"
-#include "write/flat.h"
+namespace vantrel::sheets {
 
 enum class Pairing { automatic, name, id, order };
 std::string_view name_of(Pairing pairing); // auto, name, id, order
@@ -108,4 +109,4 @@ std::string as_table(const Comparison &comparison, bool colour);
 std::string as_json(const Comparison &comparison);
 std::vector<Flat> flat_of(const Comparison &comparison);
 
-#endif
+} // namespace vantrel::sheets

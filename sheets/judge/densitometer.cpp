@@ -1,5 +1,7 @@
 #include "judge/densitometer.h"
 
+namespace vantrel::sheets {
+
 std::optional<int> Densitometer::response(const Spectrum &refl) const
 {
     const int response = DetermineDensityResponse(refl.data(), status, paper.data());
@@ -68,3 +70,5 @@ std::optional<Densitometer::HueGray> Densitometer::hue_gray(const Spectrum &refl
         return std::nullopt;
     return out;
 }
+
+} // namespace vantrel::sheets

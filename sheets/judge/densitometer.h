@@ -1,10 +1,11 @@
 // Densities of patches over one paper, and the print attributes that rest on them.
-#ifndef VANTREL_TOOL_DENSITOMETER_H
-#define VANTREL_TOOL_DENSITOMETER_H
+#pragma once
+
+#include "read/measurement.h"
 
 #include <optional>
 
-#include "read/measurement.h"
+namespace vantrel::sheets {
 
 // A density over the paper, in the response that reads the ink; both missing where there is none.
 struct DensityReading {
@@ -46,4 +47,4 @@ private:
     int status;
 };
 
-#endif
+} // namespace vantrel::sheets

@@ -3,6 +3,7 @@
 #include "judge/densitometer.h"
 #include "judge/names.h"
 
+namespace vantrel::sheets {
 namespace {
 
 StatusReading under_status(const Spectrum &refl, const Spectrum &paper, int status)
@@ -64,3 +65,5 @@ PatchStudy study_of(const Measurement &sheet, const Inks &inks, const Request &r
     }
     return out;
 }
+
+} // namespace vantrel::sheets

@@ -1,15 +1,16 @@
 // What `vantrel ink` says: everything about one patch.
-#ifndef VANTREL_TOOL_PATCH_STUDY_H
-#define VANTREL_TOOL_PATCH_STUDY_H
+#pragma once
+
+#include "judge/densitometer.h"
+#include "judge/report.h"
+#include "write/flat.h"
 
 #include <array>
 #include <optional>
 #include <string>
 #include <vector>
 
-#include "judge/densitometer.h"
-#include "judge/report.h"
-#include "write/flat.h"
+namespace vantrel::sheets {
 
 struct StatusReading {
     DensityReading reading; // in the response that reads the patch
@@ -53,4 +54,4 @@ std::string as_table(const PatchStudy &study, bool colour);
 std::string as_json(const PatchStudy &study);
 std::vector<Flat> flat_of(const PatchStudy &study);
 
-#endif
+} // namespace vantrel::sheets

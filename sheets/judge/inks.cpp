@@ -1,10 +1,12 @@
 #include "judge/inks.h"
 
-#include <algorithm>
+#include "read/text.h"
 
 #include <fmt/format.h>
 
-#include "read/text.h"
+#include <algorithm>
+
+namespace vantrel::sheets {
 
 Inks::Inks(const Measurement &sheet, const std::vector<std::string> &order) : sheet(sheet)
 {
@@ -80,3 +82,5 @@ std::optional<std::size_t> Inks::named(std::string_view name) const
     const Patch *patch = find_patch(sheet, name);
     return patch ? ink_of_solid(*patch) : std::nullopt;
 }
+
+} // namespace vantrel::sheets

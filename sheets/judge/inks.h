@@ -1,6 +1,7 @@
 // Which inks a patch was printed with, as its device values tell.
-#ifndef VANTREL_TOOL_INKS_H
-#define VANTREL_TOOL_INKS_H
+#pragma once
+
+#include "read/measurement.h"
 
 #include <cstddef>
 #include <map>
@@ -10,7 +11,7 @@
 #include <tuple>
 #include <vector>
 
-#include "read/measurement.h"
+namespace vantrel::sheets {
 
 struct Tint {
     std::size_t ink; // counted in the order of printing
@@ -52,4 +53,4 @@ private:
     std::map<Tints, const Patch *> patches;
 };
 
-#endif
+} // namespace vantrel::sheets

@@ -1,14 +1,15 @@
 #include "judge/list.h"
 
-#include <algorithm>
-
-#include <fmt/format.h>
-
 #include "judge/names.h"
 #include "read/text.h"
 #include "write/json_text.h"
 #include "write/table_text.h"
 
+#include <fmt/format.h>
+
+#include <algorithm>
+
+namespace vantrel::sheets {
 namespace {
 
 // All rows at hand.
@@ -177,3 +178,5 @@ std::string as_json(const List &list)
 }
 
 std::vector<Flat> flat_of(const List &list) { return {list.flat}; }
+
+} // namespace vantrel::sheets

@@ -1,12 +1,13 @@
 // What `vantrel list` prints: the names that the program knows, and the library's tables.
-#ifndef VANTREL_TOOL_LIST_H
-#define VANTREL_TOOL_LIST_H
+#pragma once
+
+#include "write/flat.h"
 
 #include <optional>
 #include <string>
 #include <vector>
 
-#include "write/flat.h"
+namespace vantrel::sheets {
 
 struct List {
     std::string what;
@@ -25,4 +26,4 @@ std::string as_table(const List &list, bool colour);
 std::string as_json(const List &list);
 std::vector<Flat> flat_of(const List &list);
 
-#endif
+} // namespace vantrel::sheets

@@ -1,11 +1,12 @@
 #include "judge/names.h"
 
-#include <iterator>
+#include "read/text.h"
 
 #include <fmt/format.h>
 
-#include "read/text.h"
+#include <iterator>
 
+namespace vantrel::sheets {
 namespace {
 
 // In the order of ILLUM_OBS.
@@ -105,3 +106,5 @@ std::string response_code(int status, int response)
     return is_band(status, response) ? fmt::format("b{}", response)
                                      : std::string(responses[response].code);
 }
+
+} // namespace vantrel::sheets

@@ -1,12 +1,13 @@
 // The names under which a user picks what the library knows by number.
-#ifndef VANTREL_TOOL_NAMES_H
-#define VANTREL_TOOL_NAMES_H
+#pragma once
+
+#include <vantrel.h>
 
 #include <optional>
 #include <string>
 #include <string_view>
 
-#include <vantrel.h>
+namespace vantrel::sheets {
 
 // All names come separated by ", "; each is looked up in any case.
 
@@ -28,4 +29,4 @@ std::string response_names();
 std::string response_name(int status, int response);
 std::string response_code(int status, int response);
 
-#endif
+} // namespace vantrel::sheets

@@ -1,15 +1,16 @@
 #include "judge/predict.h"
 
-#include <algorithm>
-#include <cmath>
+#include "read/text.h"
 
 #include <fmt/format.h>
 
-#include "read/text.h"
+#include <algorithm>
+#include <cmath>
 
+namespace vantrel::sheets {
 namespace {
 
-constexpr std::size_t most_inks = 3;
+constexpr std::size_t kMostInks = 3;
 
 struct Layer {
     const Patch *solid;
@@ -100,7 +101,7 @@ std::vector<Layer> layers_of(const Tints &tints, const Inks &inks)
     std::vector<Layer> layers;
     for (const Tint &tint : tints) {
         const Patch *solid = inks.solid(tint.ink);
-        if (!solid || tints.size() > most_inks || tint.percent != std::floor(tint.percent))
+        if (!solid || tints.size() > kMostInks || tint.percent != std::floor(tint.percent))
             return {};
         layers.push_back({solid, static_cast<int>(tint.percent)});
     }
@@ -112,8 +113,8 @@ std::vector<Layer> layers_of(const Tints &tints, const Inks &inks)
 Predictions predict(const Measurement &sheet, const Inks &inks, const Patch &paper,
                     ILLUM_OBS illuminant, int status, const std::vector<std::string> &wishes)
 {
-    if (wishes.size() > most_inks)
-        throw RequestError{fmt::format("{} inks; {} are the most", wishes.size(), most_inks)};
+    if (wishes.size() > kMostInks)
+        throw RequestError{fmt::format("{} inks; {} are the most", wishes.size(), kMostInks)};
     std::vector<Layer> layers;
     for (const std::string &wish : wishes) {
         const Layer layer = layer_of(sheet, inks, wish);
@@ -155,11 +156,13 @@ Predictions predict_overprints(const Measurement &sheet, const Inks &inks, const
     return out;
 }
 
-std::string inks_of(const Prediction &prediction, std::size_t widest_name)
+std::string inks_of(const Prediction &prediction, std::size_t kWidestName)
 {
     std::string out;
     for (const InkTint &ink : prediction.inks)
-        out += fmt::format("{}{} {} %", out.empty() ? "" : " + ", cut(ink.name, widest_name),
+        out += fmt::format("{}{} {} %", out.empty() ? "" : " + ", cut(ink.name, kWidestName),
                            ink.percent);
     return out;
 }
+
+} // namespace vantrel::sheets

@@ -1,16 +1,17 @@
 // What inks will measure as tints and over one another, beside what was measured.
-#ifndef VANTREL_TOOL_PREDICT_H
-#define VANTREL_TOOL_PREDICT_H
-
-#include <optional>
-#include <string>
-#include <vector>
+#pragma once
 
 #include "judge/colour.h"
 #include "judge/densitometer.h"
 #include "judge/inks.h"
 #include "read/measurement.h"
 #include "write/flat.h"
+
+#include <optional>
+#include <string>
+#include <vector>
+
+namespace vantrel::sheets {
 
 struct InkTint {
     std::string name; // of the solid's patch
@@ -57,11 +58,11 @@ Predictions predict_overprints(const Measurement &sheet, const Inks &inks, const
                                ILLUM_OBS illuminant, int status);
 
 // "Magenta 100 40 % + Yellow 100 70 %", each name cut to a number of characters.
-std::string inks_of(const Prediction &prediction, std::size_t widest_name);
+std::string inks_of(const Prediction &prediction, std::size_t kWidestName);
 
 // The output formats; each gives the whole text.
 std::string as_table(const Predictions &predictions, bool colour);
 std::string as_json(const Predictions &predictions);
 std::vector<Flat> flat_of(const Predictions &predictions);
 
-#endif
+} // namespace vantrel::sheets

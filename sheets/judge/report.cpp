@@ -1,13 +1,14 @@
 #include "judge/report.h"
 
-#include <map>
-
-#include <fmt/format.h>
-
 #include "judge/densitometer.h"
 #include "judge/names.h"
 #include "read/progress.h"
 
+#include <fmt/format.h>
+
+#include <map>
+
+namespace vantrel::sheets {
 namespace {
 
 // A gain is never negative: a tint that prints too light has none.
@@ -162,3 +163,5 @@ Report report_of(const Measurement &sheet, const Inks &inks, const Request &requ
     report.tone_curves = tone_curves(sheet, inks, report.patches);
     return report;
 }
+
+} // namespace vantrel::sheets

@@ -1,16 +1,17 @@
 // What `vantrel report` says about a sheet.
-#ifndef VANTREL_TOOL_REPORT_H
-#define VANTREL_TOOL_REPORT_H
+#pragma once
+
+#include "judge/colour.h"
+#include "judge/inks.h"
+#include "read/measurement.h"
+#include "write/flat.h"
 
 #include <optional>
 #include <string>
 #include <utility>
 #include <vector>
 
-#include "judge/colour.h"
-#include "judge/inks.h"
-#include "read/measurement.h"
-#include "write/flat.h"
+namespace vantrel::sheets {
 
 // What is asked of a sheet.
 struct Request {
@@ -95,4 +96,4 @@ std::string as_table(const std::vector<Report> &sheets, bool colour);
 std::string as_json(const std::vector<Report> &sheets);
 std::vector<Flat> flat_of(const std::vector<Report> &sheets);
 
-#endif
+} // namespace vantrel::sheets

@@ -1,34 +1,35 @@
 #include "read/bands.h"
 
+#include <fmt/format.h>
+
 #include <algorithm>
 #include <cmath>
 
-#include <fmt/format.h>
-
+namespace vantrel::sheets {
 namespace {
 
-constexpr double half_width = 10;
-constexpr double tolerance = 0.001; // of a wavelength, in nm
+constexpr double kHalfWidth = 10;
+constexpr double kTolerance = 0.001; // of a wavelength, in nm
 
 double centre(std::size_t band) { return 400 + 10 * static_cast<double>(band); }
 
 // Why these wavelengths, in ascending order, do not give every band; empty where they do.
 std::string fault_of(const std::vector<double> &nm)
 {
-    if (nm.empty() || nm.front() > 400 + tolerance || nm.back() < 700 - tolerance)
+    if (nm.empty() || nm.front() > 400 + kTolerance || nm.back() < 700 - kTolerance)
         return "the range is too short";
-    double narrowest = half_width, widest = 0;
+    double narrowest = kHalfWidth, widest = 0;
     for (std::size_t i = 1; i < nm.size(); ++i) {
         const double step = nm[i] - nm[i - 1];
-        if (step > half_width + tolerance)
+        if (step > kHalfWidth + kTolerance)
             return fmt::format("no value between {:g} and {:g} nm", nm[i - 1], nm[i]);
         narrowest = std::min(narrowest, step);
         widest = std::max(widest, step);
     }
-    if (widest - narrowest > 1 + tolerance) // names may be rounded: 380, 383, 387, 390 nm
+    if (widest - narrowest > 1 + kTolerance) // names may be rounded: 380, 383, 387, 390 nm
         return fmt::format("the steps are uneven, {:g} to {:g} nm", narrowest, widest);
     const double off = std::fmod(nm.front(), 10);
-    if (widest > half_width - tolerance && std::min(off, 10 - off) > tolerance)
+    if (widest > kHalfWidth - kTolerance && std::min(off, 10 - off) > kTolerance)
         return fmt::format("no value at 400 nm, but at {:g} and {:g} nm", nm[0], nm[1]);
     return "";
 }
@@ -44,10 +45,10 @@ Bands::Bands(std::vector<double> wavelengths, std::size_t line) : nm(std::move(w
     std::vector<double> near;
     for (std::size_t i = 0; i < order.size(); ++i) {
         const double wavelength = nm[order[i]];
-        if (i > 0 && wavelength - nm[order[i - 1]] < tolerance)
+        if (i > 0 && wavelength - nm[order[i - 1]] < kTolerance)
             throw InputError{line, fmt::format("{:g} nm occurs twice in a spectrum", wavelength)};
-        if (wavelength > 400 - half_width + tolerance &&
-            wavelength < 700 + half_width - tolerance) {
+        if (wavelength > 400 - kHalfWidth + kTolerance &&
+            wavelength < 700 + kHalfWidth - kTolerance) {
             needed.push_back(order[i]);
             near.push_back(wavelength);
         }
@@ -60,13 +61,13 @@ Bands::Bands(std::vector<double> wavelengths, std::size_t line) : nm(std::move(w
                               nm.empty() ? 0 : nm[order.back()])};
 
     for (std::size_t band = 0; band < parts.size(); ++band) {
-        const auto first = std::lower_bound(near.begin(), near.end(), centre(band) - half_width);
+        const auto first = std::lower_bound(near.begin(), near.end(), centre(band) - kHalfWidth);
         double sum = 0;
-        for (auto at = first; at != near.end() && *at < centre(band) + half_width; ++at) {
-            double weight = 1 - std::abs(*at - centre(band)) / half_width;
-            if (weight > 1 - tolerance / half_width)
+        for (auto at = first; at != near.end() && *at < centre(band) + kHalfWidth; ++at) {
+            double weight = 1 - std::abs(*at - centre(band)) / kHalfWidth;
+            if (weight > 1 - kTolerance / kHalfWidth)
                 weight = 1;
-            if (weight < tolerance / half_width)
+            if (weight < kTolerance / kHalfWidth)
                 continue;
             parts[band].push_back({needed[static_cast<std::size_t>(at - near.begin())], weight});
             sum += weight;
@@ -96,3 +97,5 @@ Source Bands::source() const
     out.averaged = std::any_of(parts.begin(), parts.end(), [](auto &p) { return p.size() > 1; });
     return out;
 }
+
+} // namespace vantrel::sheets

@@ -1,12 +1,13 @@
 // The 31 bands of a spectrum, out of the values that a file has at wavelengths of its own.
-#ifndef VANTREL_TOOL_BANDS_H
-#define VANTREL_TOOL_BANDS_H
+#pragma once
+
+#include "read/measurement.h"
 
 #include <array>
 #include <cstddef>
 #include <vector>
 
-#include "read/measurement.h"
+namespace vantrel::sheets {
 
 class Bands {
 public:
@@ -37,4 +38,4 @@ private:
     std::array<std::vector<Part>, VANTREL_BANDS> parts;
 };
 
-#endif
+} // namespace vantrel::sheets

@@ -1,16 +1,17 @@
 #include "read/cgats.h"
 
-#include <algorithm>
-#include <memory>
-#include <utility>
-
-#include <fmt/format.h>
-
 #include "read/lines.h"
 #include "read/progress.h"
 #include "read/table.h"
 #include "read/text.h"
 
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <memory>
+#include <utility>
+
+namespace vantrel::sheets {
 namespace {
 
 // The values of a line, at most `most` and one more. Tabs separate them, empty ones too, or else
@@ -222,3 +223,5 @@ void Reader::read(std::string_view text)
 } // namespace
 
 void read_cgats(std::string_view text, Sheet &sheet) { Reader(sheet).read(text); }
+
+} // namespace vantrel::sheets

@@ -1,14 +1,15 @@
 #include "read/csv.h"
 
-#include <algorithm>
-
-#include <fmt/format.h>
-
 #include "read/lines.h"
 #include "read/progress.h"
 #include "read/table.h"
 #include "read/text.h"
 
+#include <fmt/format.h>
+
+#include <algorithm>
+
+namespace vantrel::sheets {
 namespace {
 
 // Takes a record off the text, with the end of its last line; counts the lines that it ends. A
@@ -111,3 +112,5 @@ void read_csv(std::string_view text, Sheet &sheet)
     }
     table.finish();
 }
+
+} // namespace vantrel::sheets

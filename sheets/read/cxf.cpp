@@ -1,23 +1,24 @@
 #include "read/cxf.h"
 
+#include "read/progress.h"
+#include "read/text.h"
+
+#include <fmt/format.h>
+#include <pugixml.hpp>
+
 #include <algorithm>
 #include <cstring>
 #include <map>
 #include <utility>
 
-#include <fmt/format.h>
-#include <pugixml.hpp>
-
-#include "read/progress.h"
-#include "read/text.h"
-
+namespace vantrel::sheets {
 namespace {
 
 using Node = pugi::xml_node;
 using Devices = std::vector<std::pair<std::string, double>>;
 
-constexpr std::ptrdiff_t most_signs = 16'000'000; // bounds the memory that the parsed text takes
-constexpr std::size_t longest_ink_name = 80;
+constexpr std::ptrdiff_t kMostSigns = 16'000'000; // bounds the memory that the parsed text takes
+constexpr std::size_t kLongestInkName = 80;
 
 // The name behind a prefix of a namespace, which each program chooses for itself.
 std::string_view local_name(const char *name)
@@ -183,7 +184,7 @@ void Reader::read_tints(const Node &custom)
                 ink = child(above, "SpotInkName").child_value();
         }
         if (!trimmed(ink).empty())
-            tints.try_emplace(object, cut(printable(trimmed(ink)), longest_ink_name),
+            tints.try_emplace(object, cut(printable(trimmed(ink)), kLongestInkName),
                               number(node, tint));
         return false;
     });
@@ -209,7 +210,7 @@ Devices Reader::device_values(const Node &object)
                 const std::string_view called =
                     spot ? std::string_view(spot.child_value()) : attribute(part, "Name");
                 inks.emplace_back(
-                    cut(printable(trimmed(called)), longest_ink_name),
+                    cut(printable(trimmed(called)), kLongestInkName),
                     number(part, percent ? percent.child_value() : attribute(part, "Percentage")));
             } else if (is(colour, "ColorRGB") && name.size() == 1 && contains("RGB", name)) {
                 rgb.emplace_back(fmt::format("RGB_{}", name), number(part, part.child_value()));
@@ -298,7 +299,7 @@ void Reader::read_object(const Node &object)
 void Reader::read()
 {
     if (std::count_if(text.begin(), text.end(), [](char c) { return c == '<' || c == '='; }) >
-        most_signs)
+        kMostSigns)
         throw InputError{0, "more elements than a sheet can have"};
     const auto parsed =
         document.load_buffer(text.data(), text.size(), pugi::parse_default, pugi::encoding_utf8);
@@ -335,3 +336,5 @@ void read_cxf(std::string_view text, Sheet &sheet)
     sheet.largest_fraction = 3; // reflectances are fractions there, below 3
     Reader(text, sheet).read();
 }
+
+} // namespace vantrel::sheets

@@ -1,12 +1,13 @@
 // CxF3 (ISO 17972), with the tint steps of CxF/X-4.
-#ifndef VANTREL_TOOL_CXF_H
-#define VANTREL_TOOL_CXF_H
+#pragma once
+
+#include "read/sheet.h"
 
 #include <string_view>
 
-#include "read/sheet.h"
+namespace vantrel::sheets {
 
 // The reflectance spectra of all objects. UTF-8, or Latin-1; throws InputError.
 void read_cxf(std::string_view text, Sheet &sheet);
 
-#endif
+} // namespace vantrel::sheets

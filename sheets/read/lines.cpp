@@ -1,5 +1,7 @@
 #include "read/lines.h"
 
+namespace vantrel::sheets {
+
 std::string_view next_line(std::string_view &text)
 {
     const std::string_view line = before(text, [](char c) { return c == '\n' || c == '\r'; });
@@ -23,3 +25,5 @@ std::optional<std::string> next_string(std::string_view &text)
     }
     return std::nullopt;
 }
+
+} // namespace vantrel::sheets

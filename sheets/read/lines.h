@@ -1,11 +1,12 @@
 // Text taken apart from its beginning: lines, quoted strings.
-#ifndef VANTREL_TOOL_LINES_H
-#define VANTREL_TOOL_LINES_H
+#pragma once
 
 #include <algorithm>
 #include <optional>
 #include <string>
 #include <string_view>
+
+namespace vantrel::sheets {
 
 // The text up to the first character that ends it, or all of it.
 template <typename Ends> std::string_view before(std::string_view text, Ends ends)
@@ -21,4 +22,4 @@ std::string_view next_line(std::string_view &text);
 // one. Nothing where the string is not closed.
 std::optional<std::string> next_string(std::string_view &text);
 
-#endif
+} // namespace vantrel::sheets

@@ -1,8 +1,10 @@
 #include "read/measurement.h"
 
+#include "read/text.h"
+
 #include <fmt/format.h>
 
-#include "read/text.h"
+namespace vantrel::sheets {
 
 const Patch *find_patch(const Measurement &sheet, std::string_view name)
 {
@@ -25,3 +27,5 @@ const Patch &patch_named(const Measurement &sheet, std::string_view name)
     throw RequestError{fmt::format("{} holds no patch {}; its patches are {}{}", sheet.file,
                                    in_quotes(name), names, sheet.patches.size() > 8 ? ", …" : "")};
 }
+
+} // namespace vantrel::sheets

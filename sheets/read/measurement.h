@@ -1,6 +1,7 @@
 // What a measurement file holds, whatever its format.
-#ifndef VANTREL_TOOL_MEASUREMENT_H
-#define VANTREL_TOOL_MEASUREMENT_H
+#pragma once
+
+#include <vantrel.h>
 
 #include <array>
 #include <cstddef>
@@ -9,7 +10,7 @@
 #include <utility>
 #include <vector>
 
-#include <vantrel.h>
+namespace vantrel::sheets {
 
 using Spectrum = std::array<double, VANTREL_BANDS>; // 400, 410, … 700 nm in percent
 
@@ -66,4 +67,4 @@ const Patch *find_patch(const Measurement &sheet, std::string_view name);
 // find_patch(); throws RequestError.
 const Patch &patch_named(const Measurement &sheet, std::string_view name);
 
-#endif
+} // namespace vantrel::sheets

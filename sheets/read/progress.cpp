@@ -1,16 +1,17 @@
 #include "read/progress.h"
 
+#include <fmt/format.h>
+
 #include <chrono>
 #include <cstdio>
 #include <string>
 #include <unistd.h>
 
-#include <fmt/format.h>
-
+namespace vantrel::sheets {
 namespace {
 
-constexpr std::size_t width = 40;
-constexpr double interval = 0.1; // seconds
+constexpr std::size_t kWidth = 40;
+constexpr double kInterval = 0.1; // seconds
 
 double seconds()
 {
@@ -43,9 +44,12 @@ void Progress::done(std::size_t amount)
 {
     if (!terminal || seconds() < next)
         return;
-    next = seconds() + interval;
+    next = seconds() + kInterval;
     drawn = true;
     const double share = static_cast<double>(amount) / static_cast<double>(total);
-    const auto full = static_cast<std::size_t>(share * static_cast<double>(width));
-    print(fmt::format("\r{} [{:<{}}] {:3.0f} %", what, std::string(full, '='), width, share * 100));
+    const auto full = static_cast<std::size_t>(share * static_cast<double>(kWidth));
+    print(
+        fmt::format("\r{} [{:<{}}] {:3.0f} %", what, std::string(full, '='), kWidth, share * 100));
 }
+
+} // namespace vantrel::sheets

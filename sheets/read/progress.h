@@ -1,8 +1,9 @@
 // A bar on standard error for work that takes over a second, where that is a terminal.
-#ifndef VANTREL_TOOL_PROGRESS_H
-#define VANTREL_TOOL_PROGRESS_H
+#pragma once
 
 #include <cstddef>
+
+namespace vantrel::sheets {
 
 class Progress {
 public:
@@ -24,4 +25,4 @@ private:
     double next = 1; // seconds
 };
 
-#endif
+} // namespace vantrel::sheets

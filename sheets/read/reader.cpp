@@ -7,6 +7,7 @@
 #include "read/sheet.h"
 #include "read/text.h"
 
+namespace vantrel::sheets {
 namespace {
 
 bool is_cgats(std::string_view text)
@@ -45,3 +46,5 @@ Measurement read_measurement(std::string_view bytes, const Reading &reading)
         read_csv(bytes, sheet);
     return sheet.measurement();
 }
+
+} // namespace vantrel::sheets

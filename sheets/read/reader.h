@@ -1,12 +1,13 @@
 // Measurement files of every format: CGATS text, CSV and CxF.
-#ifndef VANTREL_TOOL_READER_H
-#define VANTREL_TOOL_READER_H
+#pragma once
+
+#include "read/measurement.h"
 
 #include <string_view>
 
-#include "read/measurement.h"
+namespace vantrel::sheets {
 
 // The format is found from the content. Throws InputError.
 Measurement read_measurement(std::string_view bytes, const Reading &reading);
 
-#endif
+} // namespace vantrel::sheets

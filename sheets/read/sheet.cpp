@@ -1,15 +1,16 @@
 #include "read/sheet.h"
 
+#include <fmt/format.h>
+
 #include <algorithm>
 #include <cmath>
 #include <set>
 
-#include <fmt/format.h>
-
+namespace vantrel::sheets {
 namespace {
 
-constexpr std::size_t most_warnings = 20;
-constexpr double largest_percent = 1e6; // beyond it colours overflow, and no instrument measures it
+constexpr std::size_t kMostWarnings = 20;
+constexpr double kLargestPercent = 1e6; // beyond it colours overflow, and no instrument measures it
 
 bool is_word(char c)
 {
@@ -75,9 +76,9 @@ void Sheet::set_full_scale(double value, std::string_view keyword, std::size_t l
 
 void Sheet::warn(std::size_t line, const std::string &text)
 {
-    if (warnings.size() < most_warnings)
+    if (warnings.size() < kMostWarnings)
         warnings.push_back(fmt::format("{} {}", line ? fmt::format("{}:", line) : "", text));
-    else if (warnings.size() == most_warnings)
+    else if (warnings.size() == kMostWarnings)
         warnings.emplace_back(" more warnings are left out");
 }
 
@@ -130,7 +131,7 @@ void Sheet::bring_to_percent()
         for (double &value : patches[i].refl) {
             if (origin.scaled)
                 value *= factor;
-            if (!(std::abs(value) <= largest_percent))
+            if (!(std::abs(value) <= kLargestPercent))
                 throw InputError{lines[i], "a value is too large in percent"};
         }
 }
@@ -161,3 +162,5 @@ Measurement Sheet::measurement()
             .source = std::move(origin),
             .warnings = std::move(warnings)};
 }
+
+} // namespace vantrel::sheets

@@ -1,6 +1,8 @@
 // Gathers what the reader of one format finds in a file, and makes the measurement of it.
-#ifndef VANTREL_TOOL_SHEET_H
-#define VANTREL_TOOL_SHEET_H
+#pragma once
+
+#include "read/bands.h"
+#include "read/measurement.h"
 
 #include <cstddef>
 #include <optional>
@@ -8,8 +10,7 @@
 #include <string_view>
 #include <vector>
 
-#include "read/bands.h"
-#include "read/measurement.h"
+namespace vantrel::sheets {
 
 // A measurement condition of ISO 13655, 0 to 3 for M0 to M3.
 using Condition = std::optional<int>;
@@ -57,4 +58,4 @@ private:
     std::string scale_by;
 };
 
-#endif
+} // namespace vantrel::sheets

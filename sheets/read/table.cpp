@@ -1,18 +1,19 @@
 #include "read/table.h"
 
+#include "read/text.h"
+
+#include <fmt/format.h>
+
 #include <algorithm>
 #include <array>
 #include <cmath>
 #include <initializer_list>
 
-#include <fmt/format.h>
-
-#include "read/text.h"
-
+namespace vantrel::sheets {
 namespace {
 
-constexpr std::size_t none = static_cast<std::size_t>(-1);
-constexpr std::size_t longest_ink_name = 80;
+constexpr std::size_t kNone = static_cast<std::size_t>(-1);
+constexpr std::size_t kLongestInkName = 80;
 
 // SAMPLE_ID, SampleID and Sample Id are the same field.
 std::string letters(std::string_view field)
@@ -31,7 +32,7 @@ std::size_t column_of(const std::vector<std::string> &keys,
         if (found != keys.end())
             return static_cast<std::size_t>(found - keys.begin());
     }
-    return none;
+    return kNone;
 }
 
 // CMYK_M, CMYKOG_O, CMY_C, RGB_R, 6CLR_1: what the printer was asked for, by the standard's names.
@@ -49,7 +50,7 @@ bool is_standard_device_field(std::string_view field)
 }
 
 // The ink of a column such as cyan, magenta_pct, Yellow %, Orange (percent); empty where it is
-// none.
+// kNone.
 // A lone C, Y or K may be chroma or a tristimulus value; initials say whether all four are there.
 std::string ink_of(std::string key, bool initials)
 {
@@ -156,19 +157,19 @@ Table::Table(Sheet &sheet, std::vector<std::string> names, std::size_t line)
     tint = column_of(keys, {"TINT", "TINTPCT", "TINT%", "TINTVALUE", "TONEVALUE", "NOMINAL"});
     bool initials = true;
     for (const char *initial : {"C", "M", "Y", "K"})
-        initials = initials && column_of(keys, {initial}) != none;
+        initials = initials && column_of(keys, {initial}) != kNone;
     for (std::size_t i = 0; i < fields.size(); ++i) {
         const bool standard = is_standard_device_field(fields[i]);
         std::string device = standard ? upper(fields[i]) : ink_of(keys[i], initials);
         if (device.empty())
             continue;
         free_names = free_names || !standard;
-        devices.push_back({i, cut(printable(device), longest_ink_name)});
+        devices.push_back({i, cut(printable(device), kLongestInkName)});
     }
-    free_names = free_names || tint != none;
-    if (tint == none) {
-        name = name == none ? ink : name;
-        ink = none;
+    free_names = free_names || tint != kNone;
+    if (tint == kNone) {
+        name = name == kNone ? ink : name;
+        ink = kNone;
     }
 }
 
@@ -183,7 +184,7 @@ double Table::value_at(const Row &row, std::size_t column, std::size_t line) con
 
 std::string Table::text_at(const Row &row, std::size_t column) const
 {
-    return column == none ? "" : printable(trimmed(row[column]));
+    return column == kNone ? "" : printable(trimmed(row[column]));
 }
 
 const Bands &Table::bands(const Row &row, std::size_t line)
@@ -206,8 +207,8 @@ std::vector<std::pair<std::string, double>> Table::device_values(const Row &row,
 {
     std::vector<std::pair<std::string, double>> out;
     const auto blank = [&](std::size_t column) { return trimmed(row[column]).empty(); };
-    if (tint != none && !blank(tint)) {
-        std::string of = cut(text_at(row, ink), longest_ink_name);
+    if (tint != kNone && !blank(tint)) {
+        std::string of = cut(text_at(row, ink), kLongestInkName);
         out.emplace_back(of.empty() ? "TINT" : std::move(of), value_at(row, tint, line));
     } else if (std::any_of(devices.begin(), devices.end(),
                            [&](const Device &device) { return !blank(device.column); })) {
@@ -224,19 +225,19 @@ void Table::add(const Row &row, Condition given, std::size_t line)
     for (const std::size_t value : at.used())
         refl[value] = value_at(row, values[value], line);
 
-    if (sheet.patches.empty() && id == none && name == none && ink == none)
-        for (std::size_t i = 0; i < fields.size() && name == none; ++i)
+    if (sheet.patches.empty() && id == kNone && name == kNone && ink == kNone)
+        for (std::size_t i = 0; i < fields.size() && name == kNone; ++i)
             if (!trimmed(row[i]).empty() && !number_in(row[i])) // the first column of words
                 name = i;
     Patch patch{
         .id = text_at(row, id), .name = text_at(row, name), .refl = at.of(refl), .device = {}};
-    sheet.named = sheet.named || ink != none || !patch.id.empty() || !patch.name.empty();
+    sheet.named = sheet.named || ink != kNone || !patch.id.empty() || !patch.name.empty();
     if (patch.id.empty())
         patch.id = std::to_string(sheet.patches.size() + 1);
-    if (patch.name.empty() && ink == none)
+    if (patch.name.empty() && ink == kNone)
         patch.name = patch.id;
     patch.device = device_values(row, line);
-    const Condition own = condition == none ? std::nullopt : condition_in(row[condition]);
+    const Condition own = condition == kNone ? std::nullopt : condition_in(row[condition]);
     sheet.add(std::move(patch), own ? own : given, line);
 }
 
@@ -251,7 +252,7 @@ void Table::finish()
         for (Patch &patch : patches)
             for (auto &[field, value] : patch.device)
                 value = std::round(value * 1e8) / 1e6; // 0.07 is 7 %
-    if (ink == none)
+    if (ink == kNone)
         return;
     // where it has no name, a tint is named by its ink and percentage; the bare paper is a tint of
     // any ink
@@ -270,3 +271,5 @@ void Table::finish()
             patch.name = patch.id;
     }
 }
+
+} // namespace vantrel::sheets

@@ -1,6 +1,7 @@
 // Rows of named columns, as CGATS text and CSV hold them, and the patches that they are.
-#ifndef VANTREL_TOOL_TABLE_H
-#define VANTREL_TOOL_TABLE_H
+#pragma once
+
+#include "read/sheet.h"
 
 #include <cstddef>
 #include <optional>
@@ -8,7 +9,7 @@
 #include <string_view>
 #include <vector>
 
-#include "read/sheet.h"
+namespace vantrel::sheets {
 
 // The wavelength in nm that a column's name carries: SPECTRAL_NM400, NM_400, R_400, 400NM, 400, …
 std::optional<double> wavelength_of(std::string_view field);
@@ -54,4 +55,4 @@ private:
     bool free_names = false; // of a field that no standard names, and so gives no scale
 };
 
-#endif
+} // namespace vantrel::sheets

@@ -4,6 +4,7 @@
 #include <charconv>
 #include <cmath>
 
+namespace vantrel::sheets {
 namespace {
 
 char upper_letter(char c) { return c >= 'a' && c <= 'z' ? static_cast<char>(c - 'a' + 'A') : c; }
@@ -145,3 +146,5 @@ std::string in_quotes(std::string_view text)
 {
     return '"' + cut(printable(text.substr(0, 400)), 40) + '"';
 }
+
+} // namespace vantrel::sheets

@@ -1,11 +1,12 @@
 // Small helpers on text.
-#ifndef VANTREL_TOOL_TEXT_H
-#define VANTREL_TOOL_TEXT_H
+#pragma once
 
 #include <cstddef>
 #include <optional>
 #include <string>
 #include <string_view>
+
+namespace vantrel::sheets {
 
 std::string upper(std::string_view text); // ASCII letters only
 bool equal_ignoring_case(std::string_view first, std::string_view second);
@@ -28,4 +29,4 @@ std::string cut(const std::string &text, std::size_t most);
 // printable(), in quotes and cut to a length that fits a message.
 std::string in_quotes(std::string_view text);
 
-#endif
+} // namespace vantrel::sheets

@@ -1,16 +1,17 @@
 // A comparison as table, JSON and rows.
 
-#include <algorithm>
-#include <numeric>
-
-#include <fmt/format.h>
-
 #include "judge/compare.h"
 #include "judge/names.h"
 #include "read/text.h"
 #include "write/json_text.h"
 #include "write/table_text.h"
 
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <numeric>
+
+namespace vantrel::sheets {
 namespace {
 
 // ΔE00, ΔE CMC(2:1), ΔE94 (kL 2, kC 1)
@@ -69,7 +70,7 @@ void add_statistics(Lines &lines, const Comparison &comparison)
         const Statistics &all = comparison.statistics[i];
         lines.add(fmt::format("{:<22}{:>8}{:>8}{:>8}  {}", full_title(comparison.metrics[i]),
                               fixed(all.mean), fixed(all.p95), fixed(all.max),
-                              cut(comparison.pairs[all.max_pair].reference.name, widest_name)));
+                              cut(comparison.pairs[all.max_pair].reference.name, kWidestName)));
     }
 }
 
@@ -80,7 +81,7 @@ void add_unpaired(Lines &lines, const std::string &file, const std::vector<std::
     constexpr std::size_t most = 10;
     std::string line = fmt::format("\nWithout a partner in {}: ", file);
     for (std::size_t i = 0; i < names.size() && i < most; ++i)
-        line += (i ? ", " : "") + cut(names[i], widest_in_text);
+        line += (i ? ", " : "") + cut(names[i], kWidestInText);
     if (names.size() > most)
         line += fmt::format(" and {} more", names.size() - most);
     lines.add(line);
@@ -130,9 +131,9 @@ Json pair_json(const PairReport &pair, const Comparison &comparison)
 
 std::string as_table(const Comparison &comparison, bool colour)
 {
-    std::string paper = cut(comparison.reference_paper, widest_in_text);
+    std::string paper = cut(comparison.reference_paper, kWidestInText);
     if (comparison.sample_paper != comparison.reference_paper)
-        paper += ", the sample over " + cut(comparison.sample_paper, widest_in_text);
+        paper += ", the sample over " + cut(comparison.sample_paper, kWidestInText);
     Lines lines;
     lines.add(fmt::format("{} against {}: {} {} by {}", comparison.sample, comparison.reference,
                           comparison.pairs.size(), comparison.pairs.size() == 1 ? "pair" : "pairs",
@@ -235,3 +236,5 @@ std::vector<Flat> flat_of(const Comparison &comparison)
     };
     return {flat};
 }
+
+} // namespace vantrel::sheets

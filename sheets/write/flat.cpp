@@ -1,14 +1,15 @@
 #include "write/flat.h"
 
+#include "read/progress.h"
+#include "read/text.h"
+
+#include <fmt/format.h>
+
 #include <algorithm>
 #include <iterator>
 #include <map>
 
-#include <fmt/format.h>
-
-#include "read/progress.h"
-#include "read/text.h"
-
+namespace vantrel::sheets {
 namespace {
 
 // What spreadsheets compute: =1+1, +A1, @SUM(A1), -A1. Numbers stay as they are.
@@ -198,3 +199,5 @@ void add_spectrum_cells(Row &row, const Spectrum &refl)
     for (const double value : refl)
         row.push_back(exact_cell(value));
 }
+
+} // namespace vantrel::sheets

@@ -1,6 +1,7 @@
 // A result as plain rows under named columns: what CSV and CGATS text are written from.
-#ifndef VANTREL_TOOL_FLAT_H
-#define VANTREL_TOOL_FLAT_H
+#pragma once
+
+#include "judge/colour.h"
 
 #include <cstddef>
 #include <functional>
@@ -9,7 +10,7 @@
 #include <utility>
 #include <vector>
 
-#include "judge/colour.h"
+namespace vantrel::sheets {
 
 struct Field {
     std::string name;  // in CSV
@@ -51,4 +52,4 @@ void add_colour_cells(Row &row, const Colour &colour);
 void add_spectrum_fields(std::vector<Field> &fields);
 void add_spectrum_cells(Row &row, const Spectrum &refl);
 
-#endif
+} // namespace vantrel::sheets

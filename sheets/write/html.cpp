@@ -3,6 +3,7 @@
 #include "read/measurement.h"
 #include "write/page/page.h"
 
+namespace vantrel::sheets {
 namespace {
 
 // JSON as the text of a script element: no sequence in it ends the element or opens a comment, and
@@ -43,3 +44,5 @@ std::string as_html(std::string_view json)
         out += part;
     return out;
 }
+
+} // namespace vantrel::sheets

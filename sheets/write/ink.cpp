@@ -1,15 +1,16 @@
 // A patch's study as table, JSON and rows.
 
-#include <algorithm>
-
-#include <fmt/format.h>
-
 #include "judge/ink.h"
 #include "judge/names.h"
 #include "read/text.h"
 #include "write/json_text.h"
 #include "write/table_text.h"
 
+#include <fmt/format.h>
+
+#include <algorithm>
+
+namespace vantrel::sheets {
 namespace {
 
 std::string device_values(const PatchReport &patch)
@@ -23,10 +24,10 @@ std::string device_values(const PatchReport &patch)
 void add_summary(Lines &lines, const PatchStudy &study, bool colour)
 {
     const PatchReport &patch = study.patch;
-    lines.add(fmt::format("{} ({}) of {}{}", cut(patch.name, widest_name), patch.id, study.file,
+    lines.add(fmt::format("{} ({}) of {}{}", cut(patch.name, kWidestName), patch.id, study.file,
                           device_values(patch)));
     lines.add(fmt::format("{}, {} over {}", name_of(study.illuminant), status_name(study.status),
-                          cut(study.paper, widest_in_text)));
+                          cut(study.paper, kWidestInText)));
     lines.add(fmt::format("\n{}L*a*b* {}, C* {}, h {}, ΔE00 to the paper {}",
                           colour ? swatch(patch.colour.rgb) + ' ' : "", fixed(patch.colour.lab),
                           fixed(patch.lch.C), fixed(patch.lch.h), fixed(patch.to_paper)));
@@ -48,7 +49,7 @@ void add_summary(Lines &lines, const PatchStudy &study, bool colour)
                           paper.whiteness ? fixed(paper.whiteness)
                                           : "none (" + paper.no_whiteness + ")"));
     if (study.against)
-        lines.add(fmt::format("Against {}: ΔE00 {}", cut(study.against->patch.name, widest_name),
+        lines.add(fmt::format("Against {}: ΔE00 {}", cut(study.against->patch.name, kWidestName),
                               fixed(study.against->de00)));
 }
 
@@ -300,3 +301,5 @@ std::vector<Flat> flat_of(const PatchStudy &study)
     out.push_back(colours(study));
     return out;
 }
+
+} // namespace vantrel::sheets

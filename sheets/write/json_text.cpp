@@ -1,9 +1,11 @@
 #include "write/json_text.h"
 
-#include <fmt/format.h>
-
 #include "judge/names.h"
 #include "read/progress.h"
+
+#include <fmt/format.h>
+
+namespace vantrel::sheets {
 
 Json lab_json(const CIELABCOORD &lab) { return {lab.L, lab.a, lab.b}; }
 
@@ -26,3 +28,5 @@ std::string with_array(const Json &object, std::string_view name, std::size_t co
     }
     return out + "\n  ]\n}";
 }
+
+} // namespace vantrel::sheets

@@ -1,6 +1,10 @@
 // Small helpers of the JSON documents.
-#ifndef VANTREL_TOOL_JSON_TEXT_H
-#define VANTREL_TOOL_JSON_TEXT_H
+#pragma once
+
+#include "judge/colour.h"
+#include "judge/densitometer.h"
+
+#include <nlohmann/json.hpp>
 
 #include <cstddef>
 #include <functional>
@@ -8,10 +12,7 @@
 #include <string>
 #include <string_view>
 
-#include <nlohmann/json.hpp>
-
-#include "judge/colour.h"
-#include "judge/densitometer.h"
+namespace vantrel::sheets {
 
 using Json = nlohmann::ordered_json;
 
@@ -34,4 +35,4 @@ Json patch_json(const PatchReport &patch, int status);
 std::string with_array(const Json &object, std::string_view name, std::size_t count,
                        const std::function<Json(std::size_t)> &element);
 
-#endif
+} // namespace vantrel::sheets

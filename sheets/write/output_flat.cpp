@@ -1,16 +1,17 @@
 // Reports and predictions as rows.
 
-#include <set>
-#include <string_view>
-
-#include <fmt/format.h>
-
 #include "judge/names.h"
 #include "judge/predict.h"
 #include "judge/report.h"
 #include "read/measurement.h"
 #include "write/flat.h"
 
+#include <fmt/format.h>
+
+#include <set>
+#include <string_view>
+
+namespace vantrel::sheets {
 namespace {
 
 struct Column {
@@ -33,7 +34,7 @@ void add_reading_cells(Row &row, const DensityReading &reading, int status)
     row.push_back(cell(reading.density));
 }
 
-constexpr std::size_t most_cells = 50'000'000; // of device values: bounds what empty ones take
+constexpr std::size_t kMostCells = 50'000'000; // of device values: bounds what empty ones take
 
 // The names of the device values of all patches.
 std::vector<std::string> device_names(const Report &report)
@@ -44,7 +45,7 @@ std::vector<std::string> device_names(const Report &report)
         for (const auto &[name, value] : patch.device)
             if (seen.insert(name).second)
                 names.push_back(name);
-    if (names.size() * report.patches.size() > most_cells)
+    if (names.size() * report.patches.size() > kMostCells)
         throw RequestError{fmt::format("{}: {} inks are too many for a column each; --format json "
                                        "has them",
                                        report.file, names.size())};
@@ -144,3 +145,5 @@ std::vector<Flat> flat_of(const Predictions &predictions)
     };
     return {flat};
 }
+
+} // namespace vantrel::sheets

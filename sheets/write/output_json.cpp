@@ -3,6 +3,7 @@
 #include "judge/report.h"
 #include "write/json_text.h"
 
+namespace vantrel::sheets {
 namespace {
 
 Json paper_json(const Report &report)
@@ -141,3 +142,5 @@ std::string as_json(const Predictions &predictions)
                       }) +
            '\n';
 }
+
+} // namespace vantrel::sheets

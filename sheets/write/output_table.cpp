@@ -1,3 +1,11 @@
+#include "judge/names.h"
+#include "judge/predict.h"
+#include "judge/report.h"
+#include "read/text.h"
+#include "write/table_text.h"
+
+#include <fmt/format.h>
+
 #include <algorithm>
 #include <cmath>
 #include <iterator>
@@ -5,14 +13,7 @@
 #include <optional>
 #include <utility>
 
-#include <fmt/format.h>
-
-#include "judge/names.h"
-#include "judge/predict.h"
-#include "judge/report.h"
-#include "read/text.h"
-#include "write/table_text.h"
-
+namespace vantrel::sheets {
 namespace {
 
 // Where the 31 bands in percent come from.
@@ -32,7 +33,7 @@ std::string spectra_of(const Source &source)
 
 void add_head(Lines &lines, const Report &report)
 {
-    const std::string paper = cut(report.paper.name, widest_in_text);
+    const std::string paper = cut(report.paper.name, kWidestInText);
     lines.add(fmt::format("{}: {} {}", report.file, report.patches.size(),
                           report.patches.size() == 1 ? "patch" : "patches"));
     lines.add(fmt::format("{}, {}, ΔE00 and density over {}, dot area with n = {:g}",
@@ -49,7 +50,7 @@ void add_patches(Lines &lines, const Report &report, std::size_t width, bool col
                           "Area", "Gain"));
     for (const PatchReport &patch : report.patches) {
         const CIELABCOORD &lab = patch.colour.lab;
-        std::string line = fmt::format("{:<{}} {}", cut(patch.name, widest_name), width,
+        std::string line = fmt::format("{:<{}} {}", cut(patch.name, kWidestName), width,
                                        colour ? swatch(patch.colour.rgb) : "");
         for (const double value : {lab.L, lab.a, lab.b, patch.lch.C, patch.lch.h, patch.to_paper})
             line += fmt::format("{:>8}", fixed(value));
@@ -71,7 +72,7 @@ void add_paper(Lines &lines, const Report &report)
                     fixed(paper.lab)));
     if (const auto &metamerism = report.metamerism)
         lines.add(fmt::format("Metamerism against {}: {} (ΔE*ab under {} plus {}), DIN 6172 {}",
-                              cut(metamerism->paper, widest_in_text), fixed(metamerism->sum),
+                              cut(metamerism->paper, kWidestInText), fixed(metamerism->sum),
                               name_of(report.illuminant), name_of(metamerism->illuminant),
                               fixed(metamerism->din6172)));
 }
@@ -96,7 +97,7 @@ void add_block(Lines &lines, const Report &report, const char *title, std::size_
                 head += fmt::format("{:>12}", column.title);
             lines.add(head);
         }
-        std::string line = fmt::format("{:<{}}", cut(patch.name, widest_name), width);
+        std::string line = fmt::format("{:<{}}", cut(patch.name, kWidestName), width);
         for (const Column &column : columns)
             line += fmt::format("{:>12}", fixed(patch.*column.value, column.decimals));
         lines.add(line);
@@ -178,7 +179,7 @@ std::string as_table(const Report &report, bool colour)
 {
     std::size_t width = 10;
     for (const PatchReport &patch : report.patches)
-        width = std::max(width, characters(cut(patch.name, widest_name)));
+        width = std::max(width, characters(cut(patch.name, kWidestName)));
     Lines lines;
     add_head(lines, report);
     add_patches(lines, report, width, colour);
@@ -210,7 +211,7 @@ std::string as_table(const Predictions &predictions, bool colour)
     const std::size_t widest = colour ? 26 : 38; // 120 columns in all
     const auto title = [&](const Prediction &prediction) {
         return cut(prediction.measured ? prediction.measured->patch
-                                       : inks_of(prediction, widest_in_text),
+                                       : inks_of(prediction, kWidestInText),
                    widest);
     };
     std::size_t width = 11;
@@ -218,9 +219,9 @@ std::string as_table(const Predictions &predictions, bool colour)
         width = std::max(width, characters(title(prediction)));
     Lines lines;
     lines.add(fmt::format("{}: {}, on {}", predictions.file, name_of(predictions.illuminant),
-                          cut(predictions.paper, widest_name)));
+                          cut(predictions.paper, kWidestName)));
     if (predictions.all.size() == 1)
-        lines.add(inks_of(predictions.all[0], widest_in_text));
+        lines.add(inks_of(predictions.all[0], kWidestInText));
     const std::string gap = colour ? "    " : "";
     const std::string lab = fmt::format(" {}{:>7}{:>7}{:>7}", gap, "L*", "a*", "b*");
     lines.add(fmt::format("\n{:<{}} {}{:>28} {}{:>28} {}{:>21}", "", width, gap, "Halftone", gap,
@@ -249,3 +250,5 @@ std::string as_table(const Predictions &predictions, bool colour)
                               predictions.left_out));
     return lines.out;
 }
+
+} // namespace vantrel::sheets

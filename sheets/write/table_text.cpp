@@ -1,8 +1,10 @@
 #include "write/table_text.h"
 
+#include <fmt/format.h>
+
 #include <algorithm>
 
-#include <fmt/format.h>
+namespace vantrel::sheets {
 
 std::string fixed(const std::optional<double> &value, int decimals)
 {
@@ -34,3 +36,5 @@ void Lines::add(std::string line)
     line.resize(line.find_last_not_of(' ') + 1);
     out += line + '\n';
 }
+
+} // namespace vantrel::sheets

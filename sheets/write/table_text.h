@@ -1,15 +1,16 @@
 // Small helpers of the tables on a terminal.
-#ifndef VANTREL_TOOL_TABLE_TEXT_H
-#define VANTREL_TOOL_TABLE_TEXT_H
+#pragma once
+
+#include "judge/colour.h"
 
 #include <cstddef>
 #include <optional>
 #include <string>
 
-#include "judge/colour.h"
+namespace vantrel::sheets {
 
-constexpr std::size_t widest_name = 40;
-constexpr std::size_t widest_in_text = 30; // a line has 120 columns
+constexpr std::size_t kWidestName = 40;
+constexpr std::size_t kWidestInText = 30; // a line has 120 columns
 
 // Without a minus before zero; nothing stays blank.
 std::string fixed(const std::optional<double> &value, int decimals = 2);
@@ -25,4 +26,4 @@ public:
     std::string out;
 };
 
-#endif
+} // namespace vantrel::sheets

@@ -9,6 +9,8 @@
 #include <fmt/format.h>
 #include <gtest/gtest.h>
 
+using namespace vantrel::sheets;
+
 namespace {
 
 // A straight line over the wavelengths, in percent, for each patch; averages leave it straight.

@@ -1,15 +1,16 @@
 // vantrel compare REFERENCE SAMPLE
 
-#include <algorithm>
-#include <cmath>
-#include <memory>
-
-#include <fmt/format.h>
-
 #include "judge/compare.h"
 #include "options.h"
 #include "read/text.h"
 
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <cmath>
+#include <memory>
+
+namespace vantrel::program {
 namespace {
 
 struct CompareOptions : Options {
@@ -117,7 +118,7 @@ Outcome run(CompareOptions &options)
     return outcome;
 }
 
-constexpr const char *footer =
+constexpr const char *kFooter =
     "Patches pair by name, by id or by their place in the file; of several with the same name the "
     "first\npairs with the first. auto goes by name, or else by id, where at least half of the "
     "shorter sheet's\npatches find a partner, or else by place where the sheets are equally long. "
@@ -170,6 +171,8 @@ Command add_compare(CLI::App &app)
         ->capture_default_str();
     command->add_option("--tolerance", options->tolerance, "Largest difference that is accepted");
     command->add_flag("--all", options->all, "List every pair in the table, not the worst ten");
-    command->footer(footer);
+    command->footer(kFooter);
     return {command, [options] { return run(*options); }};
 }
+
+} // namespace vantrel::program

@@ -1,10 +1,11 @@
 // vantrel ink FILE --patch NAME
 
-#include <memory>
-
 #include "judge/ink.h"
 #include "options.h"
 
+#include <memory>
+
+namespace vantrel::program {
 namespace {
 
 struct InkOptions : Options {
@@ -25,7 +26,7 @@ Outcome run(InkOptions &options)
     return outcome_of(study_of(sheet, Inks(sheet, options.order), request, patch, other), options);
 }
 
-constexpr const char *footer =
+constexpr const char *kFooter =
     "Densities are over the paper. Brightness and the whiteness of ASTM E313 describe the patch as "
     "a\npaper. With --against there are, under every illuminant, the difference from that patch "
     "(Delta E00)\nand the metamerism of the two beside --illuminant (sum of two Delta E*ab; DIN "
@@ -50,6 +51,8 @@ Command add_ink(CLI::App &app)
     command->add_option("--against", options->against, "Another patch to set it beside");
     add_sheet_options(*command, *options);
     add_order_option(*command, options->order);
-    command->footer(footer);
+    command->footer(kFooter);
     return {command, [options] { return run(*options); }};
 }
+
+} // namespace vantrel::program

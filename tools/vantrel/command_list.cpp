@@ -1,14 +1,15 @@
 // vantrel list illuminants|statuses|responses|weights
 
-#include <memory>
-
-#include <fmt/format.h>
-
 #include "judge/list.h"
 #include "judge/names.h"
 #include "options.h"
 #include "read/text.h"
 
+#include <fmt/format.h>
+
+#include <memory>
+
+namespace vantrel::program {
 namespace {
 
 struct ListOptions : Options {
@@ -42,7 +43,7 @@ List list_of(const ListOptions &options)
                                        : list_weights(status.value_or(E_STATUS), response);
 }
 
-constexpr const char *footer =
+constexpr const char *kFooter =
     "illuminants: the combinations of illuminant and observer with their white points; with "
     "--illuminant\nthe weights of one, which sum to its white point. statuses: with the codes of "
     "their responses.\nresponses: the filters of every status, or of --status, with the first "
@@ -69,6 +70,8 @@ Command add_list(CLI::App &app)
     command->add_option("--response", options->response,
                         "One of the responses: " + response_names());
     add_common_options(*command, *options);
-    command->footer(footer);
+    command->footer(kFooter);
     return {command, [options] { return outcome_of(list_of(*options), *options); }};
 }
+
+} // namespace vantrel::program

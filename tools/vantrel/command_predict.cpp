@@ -1,10 +1,11 @@
 // vantrel predict FILE
 
-#include <memory>
-
 #include "judge/predict.h"
 #include "options.h"
 
+#include <memory>
+
+namespace vantrel::program {
 namespace {
 
 struct PredictOptions : Options {
@@ -26,7 +27,7 @@ Outcome run(PredictOptions &options)
                       options);
 }
 
-constexpr const char *footer =
+constexpr const char *kFooter =
     "Two models stand side by side: tints as halftones, which mix ink and paper by area, and as "
     "thinner\nfilms. Where the file holds the same combination, its colour and the difference are "
     "shown.\n\n"
@@ -53,6 +54,8 @@ Command add_predict(CLI::App &app)
                      "NAME is the solid's patch by name or id, or the ink's device field. Without "
                      "any, every measured overprint of two or three inks is predicted")
         ->allow_extra_args(false);
-    command->footer(footer);
+    command->footer(kFooter);
     return {command, [options] { return run(*options); }};
 }
+
+} // namespace vantrel::program

@@ -1,11 +1,12 @@
 // vantrel report FILE…
 
-#include <cmath>
-#include <memory>
-
 #include "judge/report.h"
 #include "options.h"
 
+#include <cmath>
+#include <memory>
+
+namespace vantrel::program {
 namespace {
 
 struct ReportOptions : Options {
@@ -42,7 +43,7 @@ Outcome run(ReportOptions &options)
     return outcome_of(sheets, options);
 }
 
-constexpr const char *footer =
+constexpr const char *kFooter =
     "The response that reads a patch is V(isual), R(ed), G(reen), B(lue), H1 to H3 (HiFi), X1 or "
     "X2\n(Hexachrome), a wavelength in nm under SPECTRAL_STATUS, a band (b0 is 400 nm, b30 700 nm) "
     "under\nSPECTRALX_STATUS. Densities are over the paper under every status. Dot area and gain "
@@ -75,6 +76,8 @@ Command add_report(CLI::App &app)
     command->add_option("--second-illuminant", options->second_illuminant,
                         "Illuminant of that metamerism beside --illuminant (default: A_2DEG or "
                         "A_10DEG, beside these D65_2DEG or D65_10DEG)");
-    command->footer(footer);
+    command->footer(kFooter);
     return {command, [options] { return run(*options); }};
 }
+
+} // namespace vantrel::program

@@ -1,15 +1,16 @@
 #include "file.h"
 
+#include "read/measurement.h"
+
 #include <cerrno>
 #include <cstdio>
 #include <cstring>
 #include <memory>
 
-#include "read/measurement.h"
-
+namespace vantrel::program {
 namespace {
 
-constexpr std::size_t largest_file = 512u << 20;
+constexpr std::size_t kLargestFile = 512u << 20;
 
 struct Close {
     void operator()(std::FILE *file) const
@@ -26,15 +27,17 @@ std::string read_file(const std::string &path)
     const std::unique_ptr<std::FILE, Close> file(path == "-" ? stdin
                                                              : std::fopen(path.c_str(), "rb"));
     if (!file)
-        throw InputError{0, std::strerror(errno)};
+        throw sheets::InputError{0, std::strerror(errno)};
     std::string text;
     char block[1 << 16];
     while (const std::size_t got = std::fread(block, 1, sizeof block, file.get())) {
         text.append(block, got);
-        if (text.size() > largest_file)
-            throw InputError{0, "larger than 512 MiB"};
+        if (text.size() > kLargestFile)
+            throw sheets::InputError{0, "larger than 512 MiB"};
     }
     if (std::ferror(file.get()))
-        throw InputError{0, std::strerror(errno)};
+        throw sheets::InputError{0, std::strerror(errno)};
     return text;
 }
+
+} // namespace vantrel::program

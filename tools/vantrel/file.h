@@ -1,10 +1,11 @@
 // Files in.
-#ifndef VANTREL_TOOL_FILE_H
-#define VANTREL_TOOL_FILE_H
+#pragma once
 
 #include <string>
+
+namespace vantrel::program {
 
 // The whole file, or standard input for -; throws InputError.
 std::string read_file(const std::string &path);
 
-#endif
+} // namespace vantrel::program

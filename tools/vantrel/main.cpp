@@ -3,15 +3,17 @@
 // Exit status: 0 done; 1 a sheet failed its tolerance; 2 the request or a file is at fault; 3 the
 // output could not be written.
 
+#include "options.h"
+#include "output_file.h"
+#include "read/text.h"
+
 #include <csignal>
 #include <cstdio>
 #include <exception>
 #include <new>
 #include <sstream>
 
-#include "options.h"
-#include "output_file.h"
-#include "read/text.h"
+using namespace vantrel::program;
 
 namespace {
 

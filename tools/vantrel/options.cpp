@@ -1,5 +1,12 @@
 #include "options.h"
 
+#include "file.h"
+#include "judge/names.h"
+#include "read/reader.h"
+#include "read/text.h"
+
+#include <fmt/format.h>
+
 #include <algorithm>
 #include <cmath>
 #include <cstdio>
@@ -8,13 +15,7 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
-#include <fmt/format.h>
-
-#include "file.h"
-#include "judge/names.h"
-#include "read/reader.h"
-#include "read/text.h"
-
+namespace vantrel::program {
 namespace {
 
 // The ink of a patch, all its percentages; nothing where its device values name no ink.
@@ -157,3 +158,5 @@ void complain(const std::string &message)
 {
     static_cast<void>(std::fputs(("vantrel: " + message + "\n").c_str(), stderr));
 }
+
+} // namespace vantrel::program

@@ -1,16 +1,19 @@
 // What every command takes, and how its result leaves the program.
-#ifndef VANTREL_TOOL_OPTIONS_H
-#define VANTREL_TOOL_OPTIONS_H
+#pragma once
+
+#include "read/measurement.h"
+#include "write/flat.h"
+#include "write/html.h"
+
+#include <CLI/CLI.hpp>
 
 #include <functional>
 #include <string>
 #include <vector>
 
-#include <CLI/CLI.hpp>
+namespace vantrel::program {
 
-#include "read/measurement.h"
-#include "write/flat.h"
-#include "write/html.h"
+using namespace sheets;
 
 struct Options {
     std::string illuminant = "D50_2DEG";
@@ -83,4 +86,4 @@ template <typename Result> Outcome outcome_of(const Result &result, const Option
     return {text(), options.output, options.warnings};
 }
 
-#endif
+} // namespace vantrel::program

@@ -8,6 +8,7 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
+namespace vantrel::program {
 namespace {
 
 std::string reason() { return std::strerror(errno); }
@@ -84,3 +85,5 @@ std::string write_output(const std::string &path, std::string_view text)
                                                              std::free);
     return target ? replace_file(target.get(), file.st_mode & 07777, text) : reason();
 }
+
+} // namespace vantrel::program

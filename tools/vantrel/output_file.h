@@ -1,9 +1,10 @@
 // Text out.
-#ifndef VANTREL_TOOL_OUTPUT_FILE_H
-#define VANTREL_TOOL_OUTPUT_FILE_H
+#pragma once
 
 #include <string>
 #include <string_view>
+
+namespace vantrel::program {
 
 // Writes all of the text to the file, or to standard output where the path is empty or "-". A file
 // has either its old content or all of the new one: it is written under a temporary name beside its
@@ -11,4 +12,4 @@
 // or the reason why the text could not be written.
 std::string write_output(const std::string &path, std::string_view text);
 
-#endif
+} // namespace vantrel::program

@@ -63,6 +63,7 @@ const literals = (text) =>
 writeFileSync(output, `// The page, as build.mjs made it.
 #include "write/page/page.h"
 
+namespace vantrel::sheets {
 namespace {
 constexpr std::string_view before[] = {
 ${literals(before)}};
@@ -72,4 +73,5 @@ ${literals(after)}};
 
 const std::span<const std::string_view> page_before_data = before;
 const std::span<const std::string_view> page_after_data = after;
+} // namespace vantrel::sheets
 `);
