@@ -6,11 +6,23 @@ target_include_directories(Vantrel
          $<INSTALL_INTERFACE:${CMAKE_INSTALL_INCLUDEDIR}>
   PRIVATE ${PROJECT_SOURCE_DIR}/src)
 
+# The header tells the version to those who compile.
+file(STRINGS include/vantrel.h version REGEX "#define VANTREL_VERSION_(MAJOR|MINOR|PATCH) ")
+list(TRANSFORM version REPLACE "^[^0-9]*([0-9]+).*" "\\1")
+list(JOIN version "." version)
+if(NOT version STREQUAL PROJECT_VERSION)
+  message(FATAL_ERROR "include/vantrel.h is of version ${version}, not ${PROJECT_VERSION}")
+endif()
+
 # The same bits from every compiler: no fused multiply-adds. Nothing reads errno after a call of the
 # mathematics library, so that a square root is one instruction.
-target_compile_options(Vantrel PRIVATE -ffp-contract=off -fno-math-errno
-  -Wall -Wextra -Wpedantic -Wshadow -Wconversion -Wno-sign-conversion
-  "-fmacro-prefix-map=${PROJECT_SOURCE_DIR}/=")
+if(MSVC)
+  target_compile_options(Vantrel PRIVATE /fp:precise /utf-8 /W3)
+else()
+  target_compile_options(Vantrel PRIVATE -ffp-contract=off -fno-math-errno
+    -Wall -Wextra -Wpedantic -Wshadow -Wconversion -Wno-sign-conversion
+    "-fmacro-prefix-map=${PROJECT_SOURCE_DIR}/=")
+endif()
 if(VANTREL_CHECKED)
   target_compile_definitions(Vantrel PRIVATE VANTREL_CHECKED)
 endif()
@@ -19,21 +31,24 @@ endif()
 # layout behind one changes; new names leave it as it is.
 set_target_properties(Vantrel PROPERTIES
   VERSION ${PROJECT_VERSION} SOVERSION ${PROJECT_VERSION_MAJOR}
-  CXX_VISIBILITY_PRESET hidden VISIBILITY_INLINES_HIDDEN ON POSITION_INDEPENDENT_CODE ON)
+  CXX_VISIBILITY_PRESET hidden VISIBILITY_INLINES_HIDDEN ON POSITION_INDEPENDENT_CODE ON
+  DEFINE_SYMBOL VANTREL_BUILD)
 
-# src/exports.txt lists the names that the library exports; no other symbol leaves it.
-set(exports ${PROJECT_SOURCE_DIR}/src/exports.txt)
-set_property(DIRECTORY APPEND PROPERTY CMAKE_CONFIGURE_DEPENDS ${exports})
-file(STRINGS ${exports} names)
-list(JOIN names ";\n    " names)
-file(CONFIGURE OUTPUT exports.map CONTENT "{\n  global:\n    @names@;\n  local: *;\n};\n" @ONLY)
 get_target_property(type Vantrel TYPE)
-if(type STREQUAL SHARED_LIBRARY)
-  target_link_options(Vantrel PRIVATE "-Wl,--version-script=${CMAKE_CURRENT_BINARY_DIR}/exports.map")
-  set_target_properties(Vantrel PROPERTIES LINK_DEPENDS ${CMAKE_CURRENT_BINARY_DIR}/exports.map)
-else()
+if(NOT type STREQUAL SHARED_LIBRARY)
+  target_compile_definitions(Vantrel PUBLIC VANTREL_STATIC)
   # Who links the static library, from C perhaps, needs the C++ runtime too.
   set(runtime ${CMAKE_CXX_IMPLICIT_LINK_LIBRARIES})
   list(FILTER runtime INCLUDE REGEX "^(stdc\\+\\+|c\\+\\+|m)$")
   target_link_libraries(Vantrel INTERFACE ${runtime})
+elseif(CMAKE_EXECUTABLE_FORMAT STREQUAL "ELF")
+  # src/exports.txt lists the names that the library exports; no other symbol leaves it, those of
+  # the C++ library neither. Elsewhere the marks in the header decide.
+  set(exports ${PROJECT_SOURCE_DIR}/src/exports.txt)
+  set_property(DIRECTORY APPEND PROPERTY CMAKE_CONFIGURE_DEPENDS ${exports})
+  file(STRINGS ${exports} names)
+  list(JOIN names ";\n    " names)
+  file(CONFIGURE OUTPUT exports.map CONTENT "{\n  global:\n    @names@;\n  local: *;\n};\n" @ONLY)
+  target_link_options(Vantrel PRIVATE "-Wl,--version-script=${CMAKE_CURRENT_BINARY_DIR}/exports.map")
+  set_target_properties(Vantrel PROPERTIES LINK_DEPENDS ${CMAKE_CURRENT_BINARY_DIR}/exports.map)
 endif()

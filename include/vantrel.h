@@ -12,7 +12,15 @@
  * What holds for every function:
  *
  * - A **spectrum** is 31 doubles, the reflectance at 400, 410, … 700 nm in percent (100 is the
- *   perfect white). Any double is legal; values below 0 and above 100 are used as they are.
+ *   perfect white). Any double is legal; values below 0 and above 100 are used as they are. An
+ *   instrument that reads 36 bands, 380 to 730 nm, has them as bands 2 to 32 of its own: hand over
+ *   `reading + 2`. The weights at 400 and 700 nm stand for what lies beyond.
+ * - A **not-a-number** is no reading. A sum over the bands that meets one is not a number, and what
+ *   is formed from it; the call succeeds all the same. No comparison with one holds, so that a
+ *   choice hides it: the spectrum counts as neutral (#VISUAL_RESPONSE), a display level and a dot
+ *   gain are 0, and a whiteness is refused. Look for them before a call.
+ * - Graphic arts (ISO 13655) measure under **D50 with the 2-degree observer**: where nothing speaks
+ *   for another combination, it is D50_2DEG.
  * - **XYZ** is three doubles with Y = 100 for the perfect white; **L\*a\*b\*** and **L\*C\*h** are
  *   three doubles each (h in degrees, counter-clockwise from the +a\* axis).
  * - Inputs are only read; results go to memory of the caller, who owns everything. An output may
@@ -22,6 +30,13 @@
  * - No function allocates, throws, or keeps a pointer. All of them may be called from any number
  *   of threads at once, as long as no thread calls a `Set…Constants` function (or writes
  *   #den_weight) meanwhile.
+ * - Arithmetic runs in the rounding mode of the caller and changes neither the mode nor what is
+ *   trapped. Under another mode than to nearest, results differ in their last places, and a value
+ *   that is rounded, cut or compared may fall to the other side. Infinities and not-a-numbers come
+ *   out of divisions by zero, logarithms of zero and overflows on purpose: a host that has these
+ *   exceptions trapped must mask them around a call.
+ * - A host may define functions with these names itself: the library calls none of its own by an
+ *   exported name.
  *
  * Plain names have C linkage, from C99 on; what takes typed records or references stands in the
  * C++ groups at the end, from C++11 on.
@@ -32,8 +47,24 @@
 #include <stddef.h>
 #include <stdint.h>
 
-/** Marks what the library exports. */
-#if defined(__GNUC__)
+/** @name Version of this header
+ *  @{ */
+#define VANTREL_VERSION_MAJOR 0 /**< rises when an exported name goes away or changes */
+#define VANTREL_VERSION_MINOR 1 /**< rises with what is new */
+#define VANTREL_VERSION_PATCH 0 /**< rises with what is mended */
+/** @} */
+
+/**
+ * Marks what the library exports. Who links the static library defines VANTREL_STATIC, as the CMake
+ * target and pkg-config do; VANTREL_BUILD is defined while the shared library itself is compiled.
+ */
+#if defined(VANTREL_STATIC)
+#define VANTREL_API
+#elif defined(_WIN32) && defined(VANTREL_BUILD)
+#define VANTREL_API __declspec(dllexport)
+#elif defined(_WIN32)
+#define VANTREL_API __declspec(dllimport)
+#elif defined(__GNUC__)
 #define VANTREL_API __attribute__((visibility("default")))
 #else
 #define VANTREL_API
@@ -44,7 +75,12 @@
 
 /**
  * Illuminant and observer: a CIE illuminant with the 1931 2-degree or the 1964 10-degree standard
- * observer. F12 is a three-narrow-band lamp of 3000 K. Passed as a signed int in C and C++.
+ * observer. D50_2DEG is the usual choice of the graphic arts. Passed as a signed int in C and C++.
+ *
+ * The weights are those of ASTM E308, within 0.06 of its tables of 2022 for A, C, D50, D65 and D75,
+ * within 0.4 for F2 and F7 and 0.8 for F11. F12, a three-narrow-band lamp of 3000 K, is a table of
+ * our own: single weights differ by up to 3.3 from those of ASTM E308, the colours of real patches
+ * by up to 0.7 to 1.9 ΔE\*ab.
  */
 #ifdef __cplusplus
 enum ILLUM_OBS : int {
@@ -143,7 +179,7 @@ extern "C" {
  *  Weighted sums over the bands with the 10 nm weights of ASTM E308 (F12: its own table).
  *  @{ */
 
-/** The number of illuminant/observer combinations, 18. */
+/** The number of illuminant/observer combinations. @return 18. */
 VANTREL_API int GetNumIlluminantObservers(void);
 
 /**
@@ -181,24 +217,29 @@ VANTREL_API int ReflToXYZs(const double *refl, ILLUM_OBS illumObs, double *x, do
  */
 VANTREL_API int ReflToCIELAB(const double *refl, ILLUM_OBS illumObs, double *lab);
 
-/** L\*a\*b\* of XYZ, relative to the white point of the combination. Fails like ReflToCIELAB(). */
+/** L\*a\*b\* of XYZ, relative to the white point of the combination.
+ * @return 1; 0 for a null pointer or an unknown combination. */
 VANTREL_API int XYZToCIELab(const double *xyz, ILLUM_OBS illumObs, double *lab);
 
-/** L\*C\*h of a spectrum, rounded as described above. Fails like ReflToCIELAB(). */
+/** L\*C\*h of a spectrum, rounded as described above.
+ * @return 1; 0 for a null pointer or an unknown combination. */
 VANTREL_API int ReflToCIELCH(const double *refl, ILLUM_OBS illumObs, double *lch);
 
-/** L\*C\*h of XYZ, rounded as described above. Fails like ReflToCIELAB(). */
+/** L\*C\*h of XYZ, rounded as described above.
+ * @return 1; 0 for a null pointer or an unknown combination. */
 VANTREL_API int XYZToCIELCH(const double *xyz, ILLUM_OBS illumObs, double *lch);
 
-/** L\*C\*h of L\*a\*b\* (three doubles each), rounded as described above; 0 for a null pointer. */
+/** L\*C\*h of L\*a\*b\* (three doubles each), rounded as described above.
+ * @return 1; 0 for a null pointer. */
 VANTREL_API int CIELabToCIELCH(const double *lab, double *lch);
 
 /** L\*C\*h of L\*a\*b\*; a\* and b\* are rounded to two decimals when `round` is not 0, and an a\*
- * of 0 counts as 0.000001 either way. Without rounding, a hue a hair below 0 comes out as 360. 0
- * for a null pointer. */
+ * of 0 counts as 0.000001 either way. Without rounding, a hue a hair below 0 comes out as 360.
+ * @return 1; 0 for a null pointer. */
 VANTREL_API int CIELabToCIELChEx(const double *lab, double *lch, int round);
 
-/** L\*a\*b\* of L\*C\*h (three doubles each), without rounding; 0 for a null pointer. */
+/** L\*a\*b\* of L\*C\*h (three doubles each), without rounding.
+ * @return 1; 0 for a null pointer. */
 VANTREL_API int CIELChToCIELab(const double *lch, double *lab);
 
 /** @} */
@@ -215,7 +256,8 @@ VANTREL_API int CIELChToCIELab(const double *lch, double *lab);
  */
 VANTREL_API int ReflToCIELUV(const double *refl, ILLUM_OBS illumObs, double *luv);
 
-/** CIE 1976 L\*u\*v\* of XYZ; as ReflToCIELUV(). */
+/** CIE 1976 L\*u\*v\* of XYZ; as ReflToCIELUV().
+ * @return 1; 0 for a null pointer or an unknown combination. */
 VANTREL_API int XYZToCIELUV(const double *xyz, ILLUM_OBS illumObs, double *luv);
 
 /**
@@ -228,7 +270,8 @@ VANTREL_API int XYZToCIELUV(const double *xyz, ILLUM_OBS illumObs, double *luv);
  */
 VANTREL_API int ReflToCIEYxy(const double *refl, ILLUM_OBS illumObs, double *Yxy);
 
-/** Luminance and chromaticity of XYZ; as ReflToCIEYxy(). The combination is checked, not used. */
+/** Luminance and chromaticity of XYZ. The combination is checked, not used.
+ * @return as ReflToCIEYxy(). */
 VANTREL_API int XYZToCIEYxy(const double *xyz, ILLUM_OBS illumObs, double *Yxy);
 
 /**
@@ -257,30 +300,33 @@ VANTREL_API int LabToXYZ(const double *lab, ILLUM_OBS illumObs, double *xyz);
 
 /** @name Screen preview
  *  The colour as 8-bit drive levels of one fixed display: red | green << 8 | blue << 16. What lies
- *  outside the display's gamut is clipped channel by channel.
+ *  outside the display's gamut is clipped channel by channel. The display is not sRGB: its
+ *  primaries have the chromaticities (0.6106, 0.3503), (0.3014, 0.5885) and (0.1501, 0.0701), its
+ *  white (0.2861, 0.3164) and its own drive curve. Colours are not adapted to that white: the
+ *  perfect white of every combination is clipped.
  *  @{ */
 
-/** Display value of a spectrum; 0 for a null pointer or an unknown combination. */
+/** Display value of a spectrum. @return 1; 0 for a null pointer or an unknown combination. */
 VANTREL_API int ReflToRGB(const double *refl, ILLUM_OBS illumObs, unsigned int *rgb);
 
-/** Display value of XYZ; 0 for a null pointer. A channel that is not a number has level 0. */
+/** Display value of XYZ. A channel that is not a number has level 0.
+ * @return 1; 0 for a null pointer. */
 VANTREL_API int XYZtoRGB(const double *xyz, unsigned int *rgb);
 
 /** @} */
 
 /** @name Colour differences
- *  Each writes its result through its last parameters and returns 1; a null pointer or an unknown
- *  combination returns 0 with the result as it was. Zero weights are not refused unless stated: the
- *  division gives what IEEE arithmetic gives.
+ *  Zero weights are not refused unless stated: the division gives what IEEE arithmetic gives.
  *  @{ */
 
-/** CIE 1976 ΔE\*ab (CIE 15) of two L\*a\*b\* records. */
+/** CIE 1976 ΔE\*ab (CIE 15) of two L\*a\*b\* records. @return 1; 0 for a null pointer. */
 VANTREL_API int LabToDElab(const CIELABCOORD *first, const CIELABCOORD *second, double *deltaE);
 
 /**
  * Signed CIE 1976 hue difference ΔH\*ab (CIE 15): positive when the second hue lies from 0 up to
  * and including 180 degrees counter-clockwise of the first. Chroma and hue are those of
  * CIELabToCIELCH().
+ * @return 1; 0 for a null pointer.
  */
 VANTREL_API int LabToDH(const CIELABCOORD *first, const CIELABCOORD *second, double *deltaH);
 
@@ -290,19 +336,22 @@ VANTREL_API int LabToDH(const CIELABCOORD *first, const CIELABCOORD *second, dou
  * @param[in]  sample,reference  L\*a\*b\*
  * @param[in]  kL,kC             parametric factors (1, 1 for the reference conditions)
  * @param[out] deltaE            ΔE\*94
+ * @return 1; 0 for a null pointer.
  */
 VANTREL_API int LabToDE94(const CIELABCOORD *sample, const CIELABCOORD *reference, double kL,
                           double kC, double *deltaE);
 
-/** CIE94 of two L\*C\*h records; as LabToDE94() of their L\*a\*b\*. */
+/** CIE94 of two L\*C\*h records; as LabToDE94() of their L\*a\*b\*.
+ * @return 1; 0 for a null pointer. */
 VANTREL_API int CIELChToDE94(const CIELCHCOORD *sample, const CIELCHCOORD *reference, double kL,
                              double kC, double *deltaE);
 
-/** CIEDE2000 ΔE00 (CIE 142, ISO/CIE 11664-6) with kH = 1; symmetric in the two records. */
+/** CIEDE2000 ΔE00 (CIE 142, ISO/CIE 11664-6) with kH = 1; symmetric in the two records.
+ * @return 1; 0 for a null pointer. */
 VANTREL_API int LabToDE2000(const CIELABCOORD *first, const CIELABCOORD *second, double kL,
                             double kC, double *deltaE);
 
-/** CIEDE2000 ΔE00 with all three parametric factors. */
+/** CIEDE2000 ΔE00 with all three parametric factors. @return 1; 0 for a null pointer. */
 VANTREL_API int LabToDE2000Ex(const CIELABCOORD *first, const CIELABCOORD *second, double kL,
                               double kC, double kH, double *deltaE);
 
@@ -324,6 +373,7 @@ VANTREL_API int LabToDEcmc(const CIELABCOORD *sample, const CIELABCOORD *referen
  * @param[in]  first,second            spectra, 31 values in percent
  * @param[in]  illumObs1,illumObs2     the two ILLUM_OBS combinations
  * @param[out] index                   metamerism index in CIELAB units
+ * @return 1; 0 for a null pointer or an unknown combination.
  */
 VANTREL_API int ReflToDIN6172(const double *first, const double *second, int illumObs1,
                               int illumObs2, double *index);
@@ -360,14 +410,15 @@ VANTREL_API int VerbalColorDifference(const double *standard, const double *samp
  */
 extern VANTREL_API int64_t den_weight[NUM_STATUSES][NUM_RESPONSES][VANTREL_BANDS];
 
-/** The number of density statuses, 10. */
+/** The number of density statuses. @return 10. */
 VANTREL_API int GetNumStatuses(void);
 
-/** The number of density responses, 9. */
+/** The number of density responses. @return 9. */
 VANTREL_API int GetNumResponses(void);
 
-/** How many responses a status measures: 4, or 7 for HiFi, 6 for Hexachrome, 0 for the two spectral
- * statuses and for an unknown status. */
+/** How many responses a status measures.
+ * @return 4, or 7 for HiFi, 6 for Hexachrome, 0 for the two spectral statuses and for an unknown
+ *         status. */
 VANTREL_API int GetNumStatusResponses(int status);
 
 /**
@@ -425,7 +476,8 @@ VANTREL_API int ReflToReflDensity(const double *refl, int status, int response,
 VANTREL_API int ReflToDensities(const double *refl, const double *paper, int status,
                                 DENSITYSTRUCT *densities);
 
-/** ReflToDensities() without a paper. */
+/** ReflToDensities() without a paper.
+ * @return 1; 0 for a null pointer or an unknown status. */
 VANTREL_API int ReflToDensitiesNoPaper(const double *refl, int status, DENSITYSTRUCT *densities);
 
 /**
@@ -515,8 +567,9 @@ VANTREL_API int CalculateSpectralXDensity(const double *refl, const double *pape
  */
 VANTREL_API int FindMaxDensityPoints(const double *refl, DENSITYPOINT *points, int *count);
 
-/** Index of the peak that borders the brightest stretch of the spectrum, on the side nearer to the
- * crest of that stretch; 0 for a null pointer, no peaks, or a band outside 0 to 30. */
+/** Chooses the peak that borders the brightest stretch of the spectrum, on the side nearer to the
+ * crest of that stretch.
+ * @return its index; 0 for a null pointer, no peaks, or a band outside 0 to 30. */
 VANTREL_API int ChooseBPWavelen(const double *refl, const DENSITYPOINT *points, int count);
 
 /**
@@ -544,11 +597,12 @@ VANTREL_API void GetSpectralXConstants(double *tolerance, double *reserved, doub
  * 3) to (14, 11) unless set otherwise.
  *  @{ */
 
-/** 1 where the spectrum is chromatic under the ILLUM_OBS, else 0; 0 for a null pointer or an
- * unknown combination. */
+/** Whether the spectrum is chromatic under the ILLUM_OBS, with a\* and b\* rounded to two decimals.
+ * @return 1 where it is, else 0; 0 for a null pointer or an unknown combination. */
 VANTREL_API int IsChromatic(const double *refl, uint8_t illumObs);
 
-/** 1 where the L\*C\*h (three doubles) is chromatic, else 0; 0 for a null pointer. */
+/** Whether the L\*C\*h (three doubles) is chromatic. @return 1 where it is, else 0; 0 for a null
+ * pointer. */
 VANTREL_API int IsChromaticLCH(const double *lch);
 
 /** Sets the two points of the line; a null pointer, or points through which no finite line
@@ -579,9 +633,9 @@ VANTREL_API void GetAChromaticConstants(double *L1, double *L2, double *C1, doub
 VANTREL_API int DensityToDotArea(double solidDensity, double tintDensity, double nFactor,
                                  double *dotArea);
 
-/** The tint density of a dot area in percent, the inverse of DensityToDotArea() to seven digits. A
- * dot area beyond what any density can have gives an infinite or not-a-number density and 1; 0 for
- * a null pointer or an n-factor of 0. */
+/** The tint density of a dot area in percent, the inverse of DensityToDotArea() to seven digits;
+ * infinite or not a number for a dot area beyond what any density can have.
+ * @return 1; 0 for a null pointer or an n-factor of 0. */
 VANTREL_API int DensityFromDotArea(double solidDensity, double dotArea, double nFactor,
                                    double *tintDensity);
 
@@ -597,27 +651,30 @@ VANTREL_API int ReflToDotArea(const double *solid, const double *tint, const dou
                               int status, int response, double nFactor, double *dotArea);
 
 /** Dot gain: how many percent the dot area of ReflToDotArea() has over the nominal one, at least 0.
- * Fails like ReflToDotArea(). */
+ * @return 1; 0 as ReflToDotArea(). */
 VANTREL_API int ReflToDotGain(const double *solid, const double *tint, const double *paper,
                               int status, int response, double nFactor, int nominalDotArea,
                               double *dotGain);
 
-/** Print contrast 100 (Ds - Dt) / Ds in percent of a solid and a shadow tint; 0 for a null pointer
- * or a solid density of 0. */
+/** Print contrast 100 (Ds - Dt) / Ds in percent of a solid and a shadow tint.
+ * @return 1; 0 for a null pointer or a solid density of 0. */
 VANTREL_API int DensityToPrintContrast(double solidDensity, double tintDensity, double *contrast);
 
-/** Print contrast of measured patches; 0 also for another null pointer, an unknown status or
- * response. */
+/** Print contrast of measured patches.
+ * @return 1; 0 for a null pointer (but the paper), an unknown status or response, or a solid
+ *         density of 0. */
 VANTREL_API int ReflToPrintContrast(const double *solid, const double *tint, const double *paper,
                                     int status, int response, double *contrast);
 
 /** Apparent trap 100 (Dop - D1) / D2 in percent (Preucil 1958): how much of the second-down ink an
- * overprint has taken up; 0 for a null pointer or a second-down density of 0. */
+ * overprint has taken up.
+ * @return 1; 0 for a null pointer or a second-down density of 0. */
 VANTREL_API int DensityToTrap(double overprintDensity, double secondDensity, double firstDensity,
                               double *trap);
 
-/** Trap of measured patches: the second-down ink, the first-down ink, the overprint, in this order;
- * 0 also for another null pointer, an unknown status or response. */
+/** Trap of measured patches: the second-down ink, the first-down ink, the overprint, in this order.
+ * @return 1; 0 for a null pointer (but the paper), an unknown status or response, or a second-down
+ *         density of 0. */
 VANTREL_API int ReflToTrap(const double *second, const double *first, const double *overprint,
                            const double *paper, int status, int response, double *trap);
 
@@ -705,18 +762,20 @@ VANTREL_API int ColorAtEquivalentDensity(const double *reference, const double *
 VANTREL_API int PolReflAdjust(const double *refl, int response, const double *targets,
                               double *adjusted, const POLWEIGHTSTRUCT *weights);
 
-/** PolReflAdjust() in the response that DetermineDensityResponse() gives under #E_STATUS. */
+/** PolReflAdjust() in the response that DetermineDensityResponse() gives under #E_STATUS.
+ * @return 1; 0 with nothing written for a mean factor above 1. */
 VANTREL_API int PolReflAutoAdjust(const double *refl, const double *targets, double *adjusted,
                                   const POLWEIGHTSTRUCT *weights);
 
-/** DetermineDensityResponse() of the spectrum over the paper, each after PolReflAutoAdjust(); 0,
- * which is also #VISUAL_RESPONSE, where one of them fails and for an unknown status. */
+/** DetermineDensityResponse() of the spectrum over the paper, each after PolReflAutoAdjust().
+ * @return as there; 0, which is also #VISUAL_RESPONSE, where one of them fails and for an unknown
+ *         status. */
 VANTREL_API int PolDetermineDensityResponse(const double *refl, const double *targets, int status,
                                             const double *paper, const double *paperTargets,
                                             const POLWEIGHTSTRUCT *weights);
 
-/** ReflToDensity() of the spectrum over the paper, each after PolReflAutoAdjust(); fails with them,
- * and for a null output, the density as it was. */
+/** ReflToDensity() of the spectrum over the paper, each after PolReflAutoAdjust().
+ * @return 1; 0 with nothing written where one of them fails, and for a null output. */
 VANTREL_API int PolReflToDensity(const double *refl, const double *targets, const double *paper,
                                  const double *paperTargets, const POLWEIGHTSTRUCT *weights,
                                  int status, int response, double *density);
@@ -743,28 +802,29 @@ VANTREL_API int PolReflToHueGray(const double *refl, const double *targets, cons
                                  const double *paperTargets, const POLWEIGHTSTRUCT *weights,
                                  int status, double *grayness, double *hueError);
 
-/** ReflToDotArea() of the spectra, each after PolReflAutoAdjust(); fails with them, and for a null
- * output; nothing is written then. */
+/** ReflToDotArea() of the spectra, each after PolReflAutoAdjust().
+ * @return 1; 0 with nothing written where one of them fails, and for a null output. */
 VANTREL_API int PolReflToDotArea(const double *solid, const double *solidTargets,
                                  const double *tint, const double *tintTargets, const double *paper,
                                  const double *paperTargets, const POLWEIGHTSTRUCT *weights,
                                  int status, int response, double nFactor, double *dotArea);
 
-/** ReflToDotGain() in the same way. */
+/** ReflToDotGain() in the same way. @return as PolReflToDotArea(). */
 VANTREL_API int PolReflToDotGain(const double *solid, const double *solidTargets,
                                  const double *tint, const double *tintTargets, const double *paper,
                                  const double *paperTargets, const POLWEIGHTSTRUCT *weights,
                                  int status, int response, double nFactor, int nominalDotArea,
                                  double *dotGain);
 
-/** ReflToPrintContrast() in the same way. */
+/** ReflToPrintContrast() in the same way. @return as PolReflToDotArea(). */
 VANTREL_API int PolReflToPrintContrast(const double *solid, const double *solidTargets,
                                        const double *tint, const double *tintTargets,
                                        const double *paper, const double *paperTargets,
                                        const POLWEIGHTSTRUCT *weights, int status, int response,
                                        double *contrast);
 
-/** ReflToTrap() in the same way: the second-down ink, the first-down ink, the overprint. */
+/** ReflToTrap() in the same way: the second-down ink, the first-down ink, the overprint.
+ * @return as PolReflToDotArea(). */
 VANTREL_API int PolReflToTrap(const double *second, const double *secondTargets,
                               const double *first, const double *firstTargets,
                               const double *overprint, const double *overprintTargets,
@@ -811,7 +871,7 @@ VANTREL_API int Metamerism(const double *standard, const double *sample, ILLUM_O
  */
 VANTREL_API int ReflToWhiteE313_98(const double *refl, ILLUM_OBS illumObs, double *whiteness);
 
-/** Whiteness of Y, x, y as ReflToCIEYxy() writes them; as ReflToWhiteE313_98(). */
+/** Whiteness of Y, x, y as ReflToCIEYxy() writes them. @return as ReflToWhiteE313_98(). */
 VANTREL_API int CIEYxyToWhiteE313_98(const double *Yxy, ILLUM_OBS illumObs, double *whiteness);
 
 /** @} */
@@ -833,15 +893,16 @@ VANTREL_API int CIEYxyToWhiteE313_98(const double *Yxy, ILLUM_OBS illumObs, doub
  */
 VANTREL_API int CombineInkColors(const double *first, const double *second, double *refl);
 
-/** Spectrum of three inks: the first two as CombineInkColors(), then the third over the result. 0
- * for a null pointer. */
+/** Spectrum of three inks: the first two as CombineInkColors(), then the third over the result.
+ * @return 1; 0 for a null pointer. */
 VANTREL_API int Combine3InkColors(const double *first, const double *second, const double *third,
                                   double *refl);
 
-/** Mean of two L\*a\*b\* (three doubles each), in place of an overprint. 0 for a null pointer. */
+/** Mean of two L\*a\*b\* (three doubles each), in place of an overprint.
+ * @return 1; 0 for a null pointer. */
 VANTREL_API int CombineInkColorsEx(const double *first, const double *second, double *lab);
 
-/** Sum of three L\*a\*b\* times 0.3333333 each. 0 for a null pointer. */
+/** Sum of three L\*a\*b\* times 0.3333333 each. @return 1; 0 for a null pointer. */
 VANTREL_API int Combine3InkColorsEx(const double *first, const double *second, const double *third,
                                     double *lab);
 
@@ -858,19 +919,22 @@ VANTREL_API int Combine3InkColorsEx(const double *first, const double *second, c
 VANTREL_API int EstimateRefls(int n, const double *inks, const int *percent, const double *paper,
                               double *refl);
 
-/** As EstimateRefls(), with tints as thinner films: EstimateReflsForThickness(). */
+/** As EstimateRefls(), with tints as thinner films: EstimateReflsForThickness().
+ * @return 1; 0 for a null pointer, or a number or percentage out of range. */
 VANTREL_API int EstimateReflsForBestVisualColor(int n, const double *inks, const int *percent,
                                                 const double *paper, double *refl);
 
 /**
  * EstimateRefls() of inks in arrays of their own. Of the three only the first n are read; a null
- * `second` or `third` that n asks for reflects nothing, a null `first` returns 0.
+ * `second` or `third` that n asks for reflects nothing.
+ * @return 1; 0 for another null pointer, or a number or percentage out of range.
  */
 VANTREL_API int EstimateReflsEx(int n, const double *first, const double *second,
                                 const double *third, const int *percent, const double *paper,
                                 double *refl);
 
-/** EstimateReflsForBestVisualColor() of inks in arrays of their own; as EstimateReflsEx(). */
+/** EstimateReflsForBestVisualColor() of inks in arrays of their own.
+ * @return as EstimateReflsEx(). */
 VANTREL_API int EstimateReflsExForBestVisualColor(int n, const double *first, const double *second,
                                                   const double *third, const int *percent,
                                                   const double *paper, double *refl);
@@ -899,7 +963,8 @@ VANTREL_API void EstimateReflsForTintColor(const double *ink, int percent, const
 VANTREL_API int EstimateColor(int n, const double *inks, const int *percent, const double *paper,
                               double *lab);
 
-/** L\*a\*b\* of a tint: ink and paper mixed. 0 for a null pointer or a percentage out of range. */
+/** L\*a\*b\* of a tint: ink and paper mixed.
+ * @return 1; 0 for a null pointer or a percentage outside 0 to 100. */
 VANTREL_API int EstimateTintColor(const double *ink, int percent, const double *paper, double *lab);
 
 /**
@@ -930,8 +995,8 @@ VANTREL_API int ReflToABErrorWeights(const double *first, const double *second, 
 /** @name Typed records (C++)
  *  @{ */
 
-/** L\*C\*h of L\*a\*b\*; a\* and b\* are rounded to two decimals when `round`. False for a null
- * pointer. */
+/** L\*C\*h of L\*a\*b\*; a\* and b\* are rounded to two decimals when `round`.
+ * @return true; false for a null pointer. */
 VANTREL_API bool CIELabToCIELCh(CIELABCOORD *lab, CIELCHCOORD *lch, bool round);
 
 /**
@@ -947,14 +1012,14 @@ public:
     CIEDE2000();
     ~CIEDE2000();
 
-    /** ΔE00 of two L\*a\*b\* records with the parametric factors kL, kC, kH. */
+    /** Compares L\*a\*b\* records. @return ΔE00 with the parametric factors kL, kC, kH. */
     double Calculate(const CIELABCOORD &first, const CIELABCOORD &second, double kL, double kC,
                      double kH);
-    /** Whether the magnitude is at most the tolerance; a not-a-number counts as zero. */
+    /** A not-a-number counts as zero. @return whether the magnitude is at most the tolerance. */
     bool IsZero(double value, double tolerance);
-    /** An angle in radians as degrees, a negative one counted from 360 downward. */
+    /** Radians to degrees. @return the angle, a negative one counted from 360 downward. */
     double ConvertToDegrees(double radians);
-    /** An angle in degrees as radians. */
+    /** Degrees to radians. @return the angle. */
     double ConvertToRadians(double degrees);
 
 private:
@@ -967,7 +1032,7 @@ private:
  *  Pointers are not checked, except by CalculateSpecialDensity().
  *  @{ */
 
-/** -log10 of a reflectance in percent, floored at 0.00001 % (D = 7). */
+/** The density of a reflectance in percent. @return -log10 of it, floored at 0.00001 % (D = 7). */
 VANTREL_API double CalculateSpectralDensity(double refl);
 
 /**
@@ -1031,9 +1096,9 @@ VANTREL_API double DensityRatio(const double *reference, const double *sample, i
  */
 VANTREL_API double Saunderson(double refl, double k1, double k2);
 
-/** The inverse of Saunderson(): the measured reflectance of an internal one; one below 0.0001 is
- * returned as it is. Like its inverse it divides as IEEE arithmetic does where k1 and k2 make a
- * denominator 0. */
+/** The inverse of Saunderson(). Like it, it divides as IEEE arithmetic does where k1 and k2 make a
+ * denominator 0.
+ * @return the measured reflectance of an internal one; one below 0.0001 as it is. */
 VANTREL_API double UnSaunderson(double refl, double k1, double k2);
 
 /**

@@ -16,7 +16,7 @@ Xyz integrate(Spectrum refl, TristimulusWeights &weights)
     return {xy[0] / kScale, xy[1] / kScale, z[0] / kScale};
 }
 
-#ifdef __x86_64__
+#ifdef VANTREL_AVX2
 [[gnu::target("avx2")]] Xyz integrate_avx2(Spectrum refl, TristimulusWeights &weights)
 {
     using Lanes = double __attribute__((vector_size(32)));
@@ -36,7 +36,7 @@ static const bool has_avx2 = __builtin_cpu_supports("avx2");
 Xyz xyz_from_spectrum(Spectrum refl, ILLUM_OBS illum_obs)
 {
     TristimulusWeights &weights = tristimulus_weights(illum_obs);
-#ifdef __x86_64__
+#ifdef VANTREL_AVX2
     if (has_avx2)
         return integrate_avx2(refl, weights);
 #endif

@@ -13,6 +13,11 @@ Xyz xyz_from_spectrum(Spectrum refl, ILLUM_OBS illum_obs);
 /// The summands of xyz_from_spectrum: R Wx / 100 000 of each band.
 std::array<Xyz, kBands> xyz_by_band(Spectrum refl, ILLUM_OBS illum_obs);
 
+// GCC for Windows does not align the stack for such vectors.
+#if defined(__x86_64__) && defined(__GNUC__) && !defined(_WIN32)
+#define VANTREL_AVX2
+#endif
+
 /// The two ways to sum, in the same order and to the same bits: for any processor, and for one with
 /// AVX2.
 Xyz integrate(Spectrum refl, TristimulusWeights &weights);

@@ -78,7 +78,8 @@ bool CIELabToCIELCh(CIELABCOORD *lab, CIELCHCOORD *lch, bool round)
 int CIELabToCIELCH(const double *lab, double *lch)
 {
     VANTREL_REQUIRE(lab && lch, "0");
-    return CIELabToCIELChEx(lab, lch, 1);
+    store(lch_from_lab(rounded(lab_of(lab))), lch);
+    return 1;
 }
 
 int CIELabToCIELChEx(const double *lab, double *lch, int round)

@@ -80,7 +80,11 @@ int ReflToDensities(const double *refl, const double *paper, int status, DENSITY
 
 int ReflToDensitiesNoPaper(const double *refl, int status, DENSITYSTRUCT *densities)
 {
-    return ReflToDensities(refl, nullptr, status, densities);
+    VANTREL_REQUIRE(densities && refl, "0");
+    const auto result = vantrel::densities(spectrum(refl), std::nullopt, status);
+    VANTREL_REQUIRE(result, "0");
+    *densities = *result;
+    return 1;
 }
 
 int DetermineDensityResponse(const double *refl, int status, const double *paper)

@@ -5,6 +5,7 @@
 #include "colorimetry/lab.h"
 #include "density/achromatic.h"
 #include "density/spectralx.h"
+#include "density/weighted.h"
 
 #include <algorithm>
 
@@ -13,9 +14,11 @@ using namespace vantrel;
 int CalculateSpectralXDensity(const double *refl, const double *paper, int request, double *density,
                               int *band)
 {
-    if (request == VISUAL_RESPONSE)
-        return ReflToDensity(refl, paper, T_STATUS, VISUAL_RESPONSE, density);
-    VANTREL_REQUIRE(refl, "0");
+    VANTREL_REQUIRE(refl && (density || request != VISUAL_RESPONSE), "0");
+    if (request == VISUAL_RESPONSE) {
+        *density = weighted_density(spectrum(refl), vantrel::paper(paper), T_STATUS, request);
+        return 1;
+    }
     const int read = band_to_read(spectrum(refl), request);
     if (density)
         *density = band_density(spectrum(refl), vantrel::paper(paper), read);

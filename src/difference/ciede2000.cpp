@@ -4,9 +4,7 @@
 #include "base/require.h"
 #include "difference/de2000.h"
 
-#include <cmath>
-
-CIEDE2000::CIEDE2000() : pow25To7(std::pow(25, 7)) {}
+CIEDE2000::CIEDE2000() : pow25To7(vantrel::kPow25To7) {}
 
 CIEDE2000::~CIEDE2000() {}
 
@@ -29,12 +27,14 @@ int LabToDE2000Ex(const CIELABCOORD *first, const CIELABCOORD *second, double kL
                   double kH, double *deltaE)
 {
     VANTREL_REQUIRE(first && second && deltaE, "0");
-    *deltaE = CIEDE2000().Calculate(*first, *second, kL, kC, kH);
+    *deltaE = vantrel::delta_e2000(*first, *second, {kL, kC, kH}, vantrel::kPow25To7);
     return 1;
 }
 
 int LabToDE2000(const CIELABCOORD *first, const CIELABCOORD *second, double kL, double kC,
                 double *deltaE)
 {
-    return LabToDE2000Ex(first, second, kL, kC, 1.0, deltaE);
+    VANTREL_REQUIRE(first && second && deltaE, "0");
+    *deltaE = vantrel::delta_e2000(*first, *second, {kL, kC, 1}, vantrel::kPow25To7);
+    return 1;
 }

@@ -6,6 +6,8 @@
 
 namespace vantrel {
 
+inline constexpr double kPow25To7 = 6103515625;
+
 /// The parametric factors of CIEDE2000.
 struct Factors {
     double kL, kC, kH;

@@ -79,29 +79,29 @@ static bool are_percentages(Percentages percent)
     return std::ranges::all_of(percent, is_percentage);
 }
 
+// The four estimates, as the function of that name.
+static int store_estimate(const char *function, int n, const double *inks, const int *percent,
+                          const double *paper, TintModel tint, double *refl)
+{
+    VANTREL_REQUIRE_OF(function, paper, "pdPaperRefls");
+    VANTREL_REQUIRE_OF(function, percent, "piPercent");
+    VANTREL_REQUIRE_OF(function, refl, "pdEstimatedRefls");
+    VANTREL_REQUIRE_OF(function, inks && is_ink_count(n), "0");
+    const Percentages percentages(percent, n);
+    VANTREL_REQUIRE_OF(function, are_percentages(percentages), "0");
+    store(estimate(inks, percentages, spectrum(paper), tint), refl);
+    return 1;
+}
+
 int EstimateRefls(int n, const double *inks, const int *percent, const double *paper, double *refl)
 {
-    VANTREL_REQUIRE(paper, "pdPaperRefls");
-    VANTREL_REQUIRE(percent, "piPercent");
-    VANTREL_REQUIRE(refl, "pdEstimatedRefls");
-    VANTREL_REQUIRE(inks && is_ink_count(n), "0");
-    const Percentages percentages(percent, n);
-    VANTREL_REQUIRE(are_percentages(percentages), "0");
-    store(estimate(inks, percentages, spectrum(paper), halftone_tint), refl);
-    return 1;
+    return store_estimate(__func__, n, inks, percent, paper, halftone_tint, refl);
 }
 
 int EstimateReflsForBestVisualColor(int n, const double *inks, const int *percent,
                                     const double *paper, double *refl)
 {
-    VANTREL_REQUIRE(paper, "pdPaperRefls");
-    VANTREL_REQUIRE(percent, "piPercent");
-    VANTREL_REQUIRE(refl, "pdEstimatedRefls");
-    VANTREL_REQUIRE(inks && is_ink_count(n), "0");
-    const Percentages percentages(percent, n);
-    VANTREL_REQUIRE(are_percentages(percentages), "0");
-    store(estimate(inks, percentages, spectrum(paper), film_tint), refl);
-    return 1;
+    return store_estimate(__func__, n, inks, percent, paper, film_tint, refl);
 }
 
 using PackedInks = std::array<double, std::size_t{kMostInks} * kBands>;
@@ -122,7 +122,8 @@ int EstimateReflsEx(int n, const double *first, const double *second, const doub
                     const int *percent, const double *paper, double *refl)
 {
     VANTREL_REQUIRE(first, "0");
-    return EstimateRefls(n, packed(n, first, second, third).data(), percent, paper, refl);
+    const PackedInks inks = packed(n, first, second, third);
+    return store_estimate(__func__, n, inks.data(), percent, paper, halftone_tint, refl);
 }
 
 int EstimateReflsExForBestVisualColor(int n, const double *first, const double *second,
@@ -130,8 +131,8 @@ int EstimateReflsExForBestVisualColor(int n, const double *first, const double *
                                       double *refl)
 {
     VANTREL_REQUIRE(first, "0");
-    return EstimateReflsForBestVisualColor(n, packed(n, first, second, third).data(), percent,
-                                           paper, refl);
+    const PackedInks inks = packed(n, first, second, third);
+    return store_estimate(__func__, n, inks.data(), percent, paper, film_tint, refl);
 }
 
 int EstimateColor(int n, const double *inks, const int *percent, const double *paper, double *lab)

@@ -1,6 +1,6 @@
 # One variant of use: shared, static (installed, then moved) or subproject.
 
-cmake_minimum_required(VERSION 3.25)
+cmake_minimum_required(VERSION 3.21)
 
 function(run)
   execute_process(COMMAND ${ARGV} COMMAND_ERROR_IS_FATAL ANY)

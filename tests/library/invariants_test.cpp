@@ -9,13 +9,9 @@
 
 namespace {
 
-struct Report {
-    std::string reporter, expression;
-};
-
 struct Invariants {
     std::string file;
-    std::vector<Report> reports;
+    std::vector<std::string> expressions;
 };
 
 std::map<std::string, Invariants> read_invariants()
@@ -29,14 +25,9 @@ std::map<std::string, Invariants> read_invariants()
         std::istringstream names(line.substr(colon + 1));
         for (std::string name; names >> name;) {
             std::istringstream words(line.substr(0, colon));
-            std::string reporter = name;
             words >> all[name].file >> std::ws;
-            for (std::string expression; std::getline(words, expression, '|');) {
-                if (expression.starts_with("as "))
-                    reporter = expression.substr(3);
-                else
-                    all[name].reports.push_back({reporter, expression});
-            }
+            for (std::string expression; std::getline(words, expression, '|');)
+                all[name].expressions.push_back(expression);
         }
     }
     return all;
@@ -68,19 +59,19 @@ TEST(CheckingBuild, ReportsEveryRefusedArgumentInOneLine)
                 continue;
             const auto row = invariants.find(good.function->name);
             ASSERT_NE(row, invariants.end()) << good.function->name;
-            const auto &[file, reports] = row->second;
-            const auto &[reporter, expression] =
-                reports.size() == 1 ? reports[0] : reports.at(checked);
+            const auto &[file, expressions] = row->second;
+            const std::string &expression =
+                expressions.size() == 1 ? expressions[0] : expressions.at(checked);
             ++checked;
             for (auto &slots : calls) {
                 EXPECT_EQ(reported_by(*good.function, slots),
-                          expression == "-" ? "" : line(reporter, file, expression))
+                          expression == "-" ? "" : line(good.function->name, file, expression))
                     << good.function->name << " argument " << i;
             }
         }
         const auto row = invariants.find(good.function->name);
-        EXPECT_TRUE(row == invariants.end() || row->second.reports.size() == 1 ||
-                    row->second.reports.size() == checked)
+        EXPECT_TRUE(row == invariants.end() || row->second.expressions.size() == 1 ||
+                    row->second.expressions.size() == checked)
             << good.function->name << " has other arguments than its row";
     }
 }
@@ -90,13 +81,10 @@ TEST(CheckingBuild, ReportsWhatTheGoldenTablesSay)
     const auto invariants = read_invariants();
     for (GoldenCase &golden : read_all_golden()) {
         const std::string said = reported_by(*golden.function, golden.slots);
-        const std::string &wanted = golden.reported;
-        const std::size_t colon = wanted.find(": ");
-        const auto reporter =
-            colon < wanted.size() ? wanted.substr(0, colon) : golden.function->name;
-        const auto expression = colon < wanted.size() ? wanted.substr(colon + 2) : wanted;
-        EXPECT_EQ(said,
-                  wanted.empty() ? "" : line(reporter, invariants.at(reporter).file, expression))
+        const std::string &name = golden.function->name;
+        EXPECT_EQ(said, golden.reported.empty()
+                            ? ""
+                            : line(name, invariants.at(name).file, golden.reported))
             << golden.where;
     }
 }

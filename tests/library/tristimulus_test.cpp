@@ -6,7 +6,7 @@
 #include <cstring>
 #include <random>
 
-#ifdef __x86_64__
+#ifdef VANTREL_AVX2
 TEST(Tristimulus, EveryVariantGivesTheSameBits)
 {
     if (!__builtin_cpu_supports("avx2"))
