@@ -9,14 +9,6 @@
 namespace vantrel::sheets {
 namespace {
 
-// In the order of ILLUM_OBS.
-constexpr std::string_view illuminants[] = {
-    "A_2DEG",   "A_10DEG",   "C_2DEG",   "C_10DEG",   "D50_2DEG", "D50_10DEG",
-    "D65_2DEG", "D65_10DEG", "F2_2DEG",  "F2_10DEG",  "F7_2DEG",  "F7_10DEG",
-    "F11_2DEG", "F11_10DEG", "F12_2DEG", "F12_10DEG", "D75_2DEG", "D75_10DEG",
-};
-static_assert(std::size(illuminants) == NUM_ILLUM_OBS);
-
 // In the order of the statuses.
 constexpr std::string_view statuses[] = {
     "A_STATUS",         "E_STATUS",    "I_STATUS",          "T_STATUS",    "SPECTRAL_STATUS",
@@ -38,18 +30,6 @@ static_assert(std::size(responses) == NUM_RESPONSES);
 bool is_band(int status, int response) { return status == SPECTRALX_STATUS && response != 0; }
 
 } // namespace
-
-std::optional<ILLUM_OBS> illuminant_named(std::string_view name)
-{
-    for (int i = 0; i < NUM_ILLUM_OBS; ++i)
-        if (equal_ignoring_case(illuminants[i], name))
-            return static_cast<ILLUM_OBS>(i);
-    return std::nullopt;
-}
-
-std::string_view name_of(ILLUM_OBS illuminant) { return illuminants[illuminant]; }
-
-std::string illuminant_names() { return fmt::format("{}", fmt::join(illuminants, ", ")); }
 
 std::optional<int> status_named(std::string_view name)
 {

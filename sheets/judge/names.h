@@ -1,7 +1,7 @@
 // The names under which a user picks what the library knows by number.
 #pragma once
 
-#include <vantrel.h>
+#include "read/illuminant.h"
 
 #include <optional>
 #include <string>
@@ -10,10 +10,6 @@
 namespace vantrel::sheets {
 
 // All names come separated by ", "; each is looked up in any case.
-
-std::optional<ILLUM_OBS> illuminant_named(std::string_view name);
-std::string_view name_of(ILLUM_OBS illuminant);
-std::string illuminant_names();
 
 std::optional<int> status_named(std::string_view name); // E_STATUS, or E for short
 std::string_view status_name(int status);

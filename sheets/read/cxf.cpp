@@ -275,7 +275,9 @@ void Reader::read_object(const Node &object)
     Patch patch{.id = printable(trimmed(attribute(object, "Id"))),
                 .name = printable(trimmed(attribute(object, "Name"))),
                 .refl = {},
-                .device = device_values(object)};
+                .device = device_values(object),
+                .lab = {},
+                .line = 0};
     sheet.named = sheet.named || !patch.id.empty() || !patch.name.empty();
     if (patch.id.empty())
         patch.id = std::to_string(sheet.patches.size() + 1);

@@ -5,6 +5,7 @@
 
 #include <array>
 #include <cstddef>
+#include <optional>
 #include <string>
 #include <string_view>
 #include <utility>
@@ -17,10 +18,12 @@ using Spectrum = std::array<double, VANTREL_BANDS>; // 400, 410, … 700 nm in p
 struct Patch {
     std::string id;
     std::string name;
-    Spectrum refl{};
+    Spectrum refl{}; // without meaning where the sheet is of Kind::colours
     // CMYK_M, … in percent, by field name; empty where the file has none for this patch. Inks that
     // other patches name and this one does not are at 0.
     std::vector<std::pair<std::string, double>> device;
+    std::optional<CIELABCOORD> lab; // what the file itself says, under Measurement::colours
+    std::size_t line = 0;           // where it stands in the file
 };
 
 // What the spectra looked like in the file.
@@ -35,18 +38,44 @@ struct Source {
     std::string condition; // M0 to M3 (ISO 13655), empty where the file does not say
 };
 
+// What the L*a*b* that a file itself holds were computed for.
+struct Colours {
+    std::optional<ILLUM_OBS> illuminant; // where it is one of the library's
+    std::string stated;                  // by the file, in its words; empty where it does not say
+};
+
+// Who measured what and when, in the words of the file; empty where it does not say.
+struct Origin {
+    std::string originator;
+    std::string descriptor;
+    std::string created; // date and time
+    std::string instrument;
+    std::string job;
+};
+
+enum class Kind {
+    reflectance,
+    transmission, // of film, say: there is no paper
+    colours,      // L*a*b* alone, no spectra
+};
+
 // How a file is to be read.
 enum class Scale { automatic, percent, fraction };
 struct Reading {
     Scale scale = Scale::automatic;
     std::string condition; // M0 to M3; empty for the one that the file has, or M1 of several
+    bool colours = false;  // L*a*b* alone will do; otherwise a file without spectra is refused
 };
 
 struct Measurement {
     std::string file;           // its name, safe to print
     std::vector<Patch> patches; // at least one
     bool named = false;         // the file has names or ids; without any, places stand for them
+    Kind kind = Kind::reflectance;
+    bool collection = false; // of colours, a spot library, say: no paper among them
     Source source;
+    Colours colours; // where patches have a lab
+    Origin origin;
     std::vector<std::string> warnings; // one line each, without the file name
 };
 

@@ -60,9 +60,9 @@ void Sheet::add(Patch patch, Condition condition, std::size_t line)
 {
     if (patches.empty())
         origin = bands->source();
+    patch.line = line;
     patches.push_back(std::move(patch));
     conditions.push_back(condition);
-    lines.push_back(line);
 }
 
 void Sheet::set_full_scale(double value, std::string_view keyword, std::size_t line)
@@ -102,7 +102,7 @@ void Sheet::choose_condition()
         if (conditions[i] == chosen) {
             if (kept != i)
                 patches[kept] = std::move(patches[i]);
-            lines[kept++] = lines[i];
+            ++kept;
         }
     patches.resize(kept);
     if (chosen)
@@ -127,12 +127,12 @@ void Sheet::bring_to_percent()
     origin.scale_by = scale_by;
     origin.scaled = *full_scale != 100;
     const double factor = 100 / *full_scale;
-    for (std::size_t i = 0; i < patches.size(); ++i)
-        for (double &value : patches[i].refl) {
+    for (Patch &patch : patches)
+        for (double &value : patch.refl) {
             if (origin.scaled)
                 value *= factor;
             if (!(std::abs(value) <= kLargestPercent))
-                throw InputError{lines[i], "a value is too large in percent"};
+                throw InputError{patch.line, "a value is too large in percent"};
         }
 }
 
@@ -159,7 +159,11 @@ Measurement Sheet::measurement()
     return {.file = {},
             .patches = std::move(patches),
             .named = named,
+            .kind = Kind::reflectance,
+            .collection = false,
             .source = std::move(origin),
+            .colours = {},
+            .origin = {},
             .warnings = std::move(warnings)};
 }
 

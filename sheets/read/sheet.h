@@ -52,7 +52,6 @@ private:
     Source origin; // that of the first patch
     std::vector<std::string> warnings;
     std::vector<Condition> conditions; // of each patch
-    std::vector<std::size_t> lines;
     std::optional<Bands> bands;
     std::optional<double> full_scale;
     std::string scale_by;

@@ -229,8 +229,10 @@ void Table::add(const Row &row, Condition given, std::size_t line)
         for (std::size_t i = 0; i < fields.size() && name == kNone; ++i)
             if (!trimmed(row[i]).empty() && !number_in(row[i])) // the first column of words
                 name = i;
-    Patch patch{
-        .id = text_at(row, id), .name = text_at(row, name), .refl = at.of(refl), .device = {}};
+    Patch patch;
+    patch.id = text_at(row, id);
+    patch.name = text_at(row, name);
+    patch.refl = at.of(refl);
     sheet.named = sheet.named || ink != kNone || !patch.id.empty() || !patch.name.empty();
     if (patch.id.empty())
         patch.id = std::to_string(sheet.patches.size() + 1);
