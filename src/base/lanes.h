@@ -1,0 +1,170 @@
+// Doubles side by side: one type for the mathematics of one row, or of two, four or eight of them.
+//
+// A function template over the number type V runs with V = double and with V = Lanes<N>. Each lane
+// holds the bits that the double would: only + - * / and the square root are used, which round
+// alike everywhere, and select() takes one of two results that are both computed.
+#pragma once
+
+#include <bit>
+#include <cstddef>
+#include <cstdint>
+#include <type_traits>
+
+#if defined(__AVX__) || defined(__SSE2__)
+#include <immintrin.h>
+#elif defined(__aarch64__)
+#include <arm_neon.h>
+#elif defined(__wasm_simd128__)
+#include <wasm_simd128.h>
+#endif
+
+// Vectors wider than the registers of the processor stay within the inlined functions here.
+#if defined(__GNUC__) && !defined(__clang__)
+#pragma GCC diagnostic push
+#pragma GCC diagnostic ignored "-Wpsabi"
+#endif
+
+namespace vantrel {
+
+/// The compiler's vectors of N doubles, of their bits, and of what comparing them yields.
+template <int N> struct Vector;
+template <> struct Vector<2> {
+    using Doubles = double __attribute__((vector_size(16)));
+    using Bits = std::uint64_t __attribute__((vector_size(16)));
+    using Truths = std::int64_t __attribute__((vector_size(16)));
+};
+template <> struct Vector<4> {
+    using Doubles = double __attribute__((vector_size(32)));
+    using Bits = std::uint64_t __attribute__((vector_size(32)));
+    using Truths = std::int64_t __attribute__((vector_size(32)));
+};
+template <> struct Vector<8> {
+    using Doubles = double __attribute__((vector_size(64)));
+    using Bits = std::uint64_t __attribute__((vector_size(64)));
+    using Truths = std::int64_t __attribute__((vector_size(64)));
+};
+
+/// In which lanes a condition holds.
+template <int N> struct Mask {
+    typename Vector<N>::Truths m;
+
+    friend Mask operator&(Mask a, Mask b) { return {a.m & b.m}; }
+    friend Mask operator|(Mask a, Mask b) { return {a.m | b.m}; }
+    friend Mask operator^(Mask a, Mask b) { return {a.m ^ b.m}; }
+    friend Mask operator!(Mask a) { return {~a.m}; }
+};
+
+/// N doubles, N = 2, 4 or 8: as many as fit a vector register.
+template <int N> struct Lanes {
+    using Doubles = typename Vector<N>::Doubles;
+
+    Doubles v;
+
+    Lanes() = default;
+    Lanes(Doubles values) : v(values) {}
+    Lanes(double value) : v(value - Doubles{}) {} // a zero keeps its sign
+
+    double operator[](int i) const { return v[i]; }
+
+    friend Lanes operator+(Lanes a, Lanes b) { return a.v + b.v; }
+    friend Lanes operator-(Lanes a, Lanes b) { return a.v - b.v; }
+    friend Lanes operator*(Lanes a, Lanes b) { return a.v * b.v; }
+    friend Lanes operator/(Lanes a, Lanes b) { return a.v / b.v; }
+    friend Lanes operator-(Lanes a) { return -a.v; }
+    friend Mask<N> operator<(Lanes a, Lanes b) { return {a.v < b.v}; }
+    friend Mask<N> operator<=(Lanes a, Lanes b) { return {a.v <= b.v}; }
+    friend Mask<N> operator>(Lanes a, Lanes b) { return {a.v > b.v}; }
+    friend Mask<N> operator>=(Lanes a, Lanes b) { return {a.v >= b.v}; }
+    friend Mask<N> operator==(Lanes a, Lanes b) { return {a.v == b.v}; }
+    friend Mask<N> operator!=(Lanes a, Lanes b) { return {a.v != b.v}; }
+    Lanes &operator+=(Lanes b) { return *this = *this + b; }
+    Lanes &operator-=(Lanes b) { return *this = *this - b; }
+};
+
+inline std::uint64_t bits(double x) { return std::bit_cast<std::uint64_t>(x); }
+inline double from_bits(std::uint64_t x) { return std::bit_cast<double>(x); }
+template <int N> typename Vector<N>::Bits bits(Lanes<N> x)
+{
+    return std::bit_cast<typename Vector<N>::Bits>(x.v);
+}
+template <class Bits> auto from_bits(Bits x)
+{
+    using Result = Lanes<sizeof(Bits) / sizeof(double)>;
+    return Result(std::bit_cast<typename Result::Doubles>(x));
+}
+
+/// a where the condition holds, otherwise b.
+inline double select(bool condition, double a, double b) { return condition ? a : b; }
+template <int N>
+Lanes<N> select(Mask<N> condition, std::type_identity_t<Lanes<N>> a,
+                std::type_identity_t<Lanes<N>> b)
+{
+    return condition.m ? a.v : b.v;
+}
+
+inline bool any(bool condition) { return condition; }
+template <int N> bool any(Mask<N> condition)
+{
+#if defined(__AVX512DQ__)
+    if constexpr (N == 8)
+        return _mm512_movepi64_mask((__m512i)condition.m) != 0;
+#endif
+#if defined(__AVX__)
+    if constexpr (N == 4)
+        return _mm256_movemask_pd((__m256d)condition.m) != 0;
+#endif
+#if defined(__SSE2__)
+    if constexpr (N == 2)
+        return _mm_movemask_pd((__m128d)condition.m) != 0;
+#endif
+    for (int i = 0; i < N; ++i)
+        if (condition.m[i])
+            return true;
+    return false;
+}
+
+/// The square root by the processor's instruction, which is IEEE's at every level of optimisation.
+inline double sqrt(double x) { return __builtin_sqrt(x); }
+template <int N> Lanes<N> sqrt(Lanes<N> x)
+{
+#if defined(__AVX512F__)
+    if constexpr (N == 8)
+        return _mm512_sqrt_pd(x.v);
+#endif
+#if defined(__AVX__)
+    if constexpr (N == 4)
+        return _mm256_sqrt_pd(x.v);
+#endif
+#if defined(__SSE2__)
+    if constexpr (N == 2)
+        return _mm_sqrt_pd(x.v);
+#elif defined(__aarch64__)
+    if constexpr (N == 2)
+        return vsqrtq_f64(x.v);
+#elif defined(__wasm_simd128__)
+    if constexpr (N == 2)
+        return wasm_f64x2_sqrt(x.v);
+#endif
+    Lanes<N> roots;
+    for (int i = 0; i < N; ++i)
+        roots.v[i] = sqrt(x[i]);
+    return roots;
+}
+
+inline constexpr std::uint64_t kSignBit = 0x8000000000000000;
+
+template <class V> V abs(V x) { return from_bits(bits(x) & ~kSignBit); }
+template <class V> V copysign(V size, V sign)
+{
+    return from_bits((bits(size) & ~kSignBit) | (bits(sign) & kSignBit));
+}
+
+/// The larger and the smaller one; a where b is not a number.
+template <class V> V larger(V a, V b) { return select(a < b, b, a); }
+template <class V> V smaller(V a, V b) { return select(b < a, b, a); }
+
+} // namespace vantrel
+
+#if defined(__GNUC__) && !defined(__clang__)
+#pragma GCC diagnostic pop
+#endif
