@@ -1105,7 +1105,7 @@ VANTREL_API double UnSaunderson(double refl, double k1, double k2);
  * Spectrum of an ink printed as a thinner or thicker film: Beer-Lambert between Saunderson
  * corrections with k1 = 0 and k2 = 0.6. Where the ink is lighter than the paper the result is the
  * paper; a band in which the ink is below 0.0001 keeps the value of the ink, and over a paper of 0
- * a band is 0 (not a number at thickness 0).
+ * a band is 0.
  * @param[in]  ink        spectrum of the solid on the paper, 31 values in percent
  * @param[in]  thickness  relative to the solid: 0 is the paper, 1 the solid
  * @param[in]  paper      spectrum of the paper

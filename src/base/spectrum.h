@@ -35,10 +35,10 @@ inline SpectrumOut spectrum_out(double *refl) { return SpectrumOut(refl, kBands)
 inline Bands bands(Spectrum refl)
 {
     Bands copy;
-    std::ranges::copy(refl, copy.begin());
+    std::copy(refl.begin(), refl.end(), copy.begin());
     return copy;
 }
-inline void store(const Bands &values, double *out) { std::ranges::copy(values, out); }
+inline void store(const Bands &values, double *out) { std::copy_n(values.begin(), kBands, out); }
 
 inline Paper paper(const double *refl) { return refl ? Paper(spectrum(refl)) : std::nullopt; }
 

@@ -38,7 +38,7 @@ void build_row(std::span<std::int64_t, kBands> row, int centre, Shape shape)
     const double scale = sum == 0 ? 0 : 100000 / sum;
     if (!std::isfinite(sum) || !std::isfinite(scale))
         return;
-    std::ranges::fill(row, 0);
+    std::fill(row.begin(), row.end(), 0);
     if (sum == 0)
         return;
     std::int64_t left = 100000;

@@ -92,7 +92,7 @@ constexpr bool well_formed(const StatusResponses &responses)
             return false;
     return responses.ids[0] == VISUAL_RESPONSE;
 }
-static_assert(std::ranges::all_of(kStatusResponses, well_formed));
+static_assert(std::all_of(std::begin(kStatusResponses), std::end(kStatusResponses), well_formed));
 
 } // namespace
 

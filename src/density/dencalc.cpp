@@ -112,8 +112,8 @@ int CalculateCCRDensities(const double *refl, const double *paper, int status, d
 {
     VANTREL_REQUIRE(refl && densities, "0");
     VANTREL_REQUIRE(status == CCR1_STATUS || status == CCR2_STATUS, "0");
-    std::ranges::copy(ccr_densities(spectrum(refl), vantrel::paper(paper), status).density,
-                      densities);
+    const Densities set = ccr_densities(spectrum(refl), vantrel::paper(paper), status);
+    std::copy_n(set.density, NUM_RESPONSES, densities);
     return 1;
 }
 
@@ -125,7 +125,7 @@ static std::optional<Shape> shape(const double *values)
 static void store_shape(int response, double *values)
 {
     if (values)
-        std::ranges::copy(band_shape(response), values);
+        std::copy_n(band_shape(response).begin(), kShape, values);
 }
 
 void SetHiFiConstants(const double *wavelengths, const double *shape1, const double *shape2,

@@ -47,12 +47,12 @@ std::optional<Densities> densities(Spectrum refl, Paper paper, int status)
     case CCR2_STATUS:
         return ccr_densities(refl, paper, status);
     case SPECTRAL_STATUS:
-        std::ranges::fill(set.density,
-                          *density(refl, paper, status, darkest_wavelength(refl, paper)));
+    case SPECTRALX_STATUS: {
+        const int response =
+            status == SPECTRAL_STATUS ? darkest_wavelength(refl, paper) : VISUAL_RESPONSE;
+        std::fill_n(set.density, NUM_RESPONSES, *density(refl, paper, status, response));
         return set;
-    case SPECTRALX_STATUS:
-        std::ranges::fill(set.density, *density(refl, paper, status, VISUAL_RESPONSE));
-        return set;
+    }
     default:
         for (const int response : responses_of(status))
             set.density[response] = weighted_density(refl, paper, status, response);

@@ -41,8 +41,8 @@ int ChooseBPWavelen(const double *refl, const DENSITYPOINT *points, int count)
     VANTREL_REQUIRE(refl && points && count > 0, "0");
     const std::span peaks(points, static_cast<std::size_t>(count));
     VANTREL_REQUIRE(
-        std::ranges::all_of(
-            peaks, [](int band) { return band >= 0 && band < kBands; }, &DENSITYPOINT::band),
+        std::all_of(peaks.begin(), peaks.end(),
+                    [](const DENSITYPOINT &p) { return p.band >= 0 && p.band < kBands; }),
         "0");
     return choose_peak(spectrum(refl), peaks);
 }

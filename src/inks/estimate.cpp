@@ -31,7 +31,8 @@ Lab estimate_colour(const double *inks, Percentages percent, const Lab &paper)
     if (percent.size() == 2)
         return mean(layer(0), layer(1));
     const Lab printed = mean(layer(0), layer(1), layer(2));
-    const bool all_tints = std::ranges::all_of(percent, [](int p) { return p < 100; });
+    const bool all_tints =
+        std::all_of(percent.begin(), percent.end(), [](int p) { return p < 100; });
     return all_tints ? Lab{printed.L, 0, 0} : printed;
 }
 

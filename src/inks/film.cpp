@@ -22,7 +22,7 @@ Bands film(Spectrum ink, double thickness, Spectrum paper)
             continue;
         }
         const double Dp = absorbance(paper[i]);
-        double Di = (absorbance(ink[i]) - Dp) * thickness;
+        double Di = thickness == 0 ? 0 : (absorbance(ink[i]) - Dp) * thickness;
         if (Di < 0)
             Di = 0;
         refl[i] = unsaunderson(std::exp(2 - Di - Dp), kSurface, kInside);

@@ -76,7 +76,7 @@ static bool is_percentage(int percent) { return percent >= 0 && percent <= 100; 
 
 static bool are_percentages(Percentages percent)
 {
-    return std::ranges::all_of(percent, is_percentage);
+    return std::all_of(percent.begin(), percent.end(), is_percentage);
 }
 
 // The four estimates, as the function of that name.

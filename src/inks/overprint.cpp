@@ -10,7 +10,12 @@ namespace {
 constexpr double kStrong = 0.6;      // from here on the lighter ink adds to the denser one,
 constexpr double kLargestGain = 0.5; // by this density in the band where it absorbs most
 
-double band_density(double refl) { return refl == 0 ? 999 : std::log10(100 / refl); }
+double band_density(double refl)
+{
+    constexpr double kOpaque = 999;
+    const double density = std::log10(100 / refl);
+    return refl == 0 || density > kOpaque ? kOpaque : density;
+}
 
 /// The densities of two inks in one band.
 struct Pair {

@@ -6,6 +6,8 @@ namespace vantrel {
 
 Bands halftone_tint(Spectrum ink, int percent, Spectrum paper)
 {
+    if (percent == 0)
+        return bands(paper);
     const double bare = 100.0 - percent;
     Bands refl;
     for (int i = 0; i < kBands; ++i)

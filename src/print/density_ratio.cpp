@@ -9,6 +9,7 @@
 namespace vantrel {
 
 static constexpr double kLargestRatio = 1000;
+static constexpr double kBlack = 1000; ///< K/S of a reflectance of 0
 
 double density_ratio(Spectrum reference, Spectrum sample, int status)
 {
@@ -26,8 +27,10 @@ double at_equivalent_density(double refl, double ratio)
     if (ratio <= 0)
         return refl;
     const double R = refl / 100;
-    const double ks = R == 0 ? 1000 : square(1 - R) / (2 * R) * 100 / ratio;
-    return 100 * (1 + ks - std::sqrt(square(ks) + 2 * ks));
+    const double ks = R == 0 ? kBlack : square(1 - R) / (2 * R) * 100 / ratio;
+    const double root = std::sqrt(square(ks) + 2 * ks);
+    // Beyond black the difference of two large numbers has lost its digits; this is its equal.
+    return 100 * (ks > kBlack ? 1 / (1 + ks + root) : 1 + ks - root);
 }
 
 } // namespace vantrel

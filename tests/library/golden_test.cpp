@@ -3,6 +3,7 @@
 
 #include <gtest/gtest.h>
 
+#include <cfenv>
 #include <climits>
 #include <cmath>
 #include <cxxabi.h>
@@ -64,6 +65,25 @@ TEST(Golden, EveryLine)
         for (const Slot &slot : golden.slots)
             if (slot.output)
                 check_output(slot, golden.outputs[next++], golden.tolerance);
+    }
+}
+
+// A host that rounds upward gets other last places, or the other branch where two meet (those of L*
+// to 0.00001 of its value).
+TEST(Golden, AnotherRoundingModeChangesLastPlaces)
+{
+    for (GoldenCase &golden : one_good_call_each()) {
+        SCOPED_TRACE(golden.where + " " + golden.function->name);
+        std::vector<Slot> upward = golden.slots;
+        golden.function->call(golden.slots);
+        std::fesetround(FE_UPWARD);
+        golden.function->call(upward);
+        EXPECT_EQ(std::fegetround(), FE_UPWARD);
+        std::fesetround(FE_TONEAREST);
+        for (std::size_t i = 0; i < upward.size(); ++i)
+            for (std::size_t e = 0; e < upward[i].values.size(); ++e)
+                EXPECT_PRED3(agrees, upward[i].values[e], golden.slots[i].values[e],
+                             1e-5 * std::fmax(1, std::fabs(golden.slots[i].values[e])));
     }
 }
 
