@@ -92,9 +92,9 @@ Bands roughly_adjusted(Spectrum refl, Spectrum paper)
 std::optional<int> firm_response(Spectrum refl, int status)
 {
     constexpr double kLightnessMargin = 1e-9;
-    constexpr double kChromaMargin = 0.02; // more than a rounding step of both a* and b*
+    constexpr double kChromaMargin = 0.02; // more than to round both a* and b* can change it
     constexpr double kDensityMargin = 1e-6;
-    const Lab lab = rounded(lab_from_spectrum(refl, D65_10DEG));
+    const Lab lab = lab_from_spectrum(refl, D65_10DEG);
     const double C = chroma(lab);
     const bool chromatic = is_chromatic(lab.L, C);
     for (const double L : {lab.L - kLightnessMargin, lab.L + kLightnessMargin})
