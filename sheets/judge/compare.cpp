@@ -1,6 +1,5 @@
 #include "judge/compare.h"
 
-#include "read/progress.h"
 #include "read/text.h"
 
 #include <fmt/format.h>
@@ -246,10 +245,10 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
                    .worst = {},
                    .only_reference = names_of(reference, pairs.only_reference),
                    .only_sample = names_of(sample, pairs.only_sample)};
-    Progress progress("Comparing", pairs.matched.size());
+    const Work work{request.tell, "Comparing", pairs.matched.size()};
     for (const auto &[first, second] : pairs.matched) {
-        progress.done(out.pairs.size());
         out.pairs.push_back(pair_report(reference.patches[first], sample.patches[second], request));
+        work.done(out.pairs.size());
     }
     for (std::size_t metric = 0; metric < request.metrics.size(); ++metric)
         out.statistics.push_back(statistics_of(out.pairs, metric));

@@ -56,6 +56,7 @@ struct CompareRequest {
     std::optional<double> tolerance;
     const Patch *reference_paper = nullptr; // densities are over these
     const Patch *sample_paper = nullptr;
+    Tell tell{};
 };
 
 // One side of a pair.
@@ -104,9 +105,9 @@ struct Comparison {
 Comparison compare(const Measurement &reference, const Measurement &sample,
                    const CompareRequest &request);
 
-// The output formats; each gives the whole text.
-std::string as_table(const Comparison &comparison, bool colour);
-std::string as_json(const Comparison &comparison);
+// The output formats.
+void write_table(const Comparison &comparison, const Sink &sink, bool colour);
+void write_json(const Comparison &comparison, const Sink &sink);
 std::vector<Flat> flat_of(const Comparison &comparison);
 
 } // namespace vantrel::sheets

@@ -49,9 +49,9 @@ struct PatchStudy {
 PatchStudy study_of(const Measurement &sheet, const Inks &inks, const Request &request,
                     const Patch &patch, const Patch *other);
 
-// The output formats; each gives the whole text.
-std::string as_table(const PatchStudy &study, bool colour);
-std::string as_json(const PatchStudy &study);
+// The output formats.
+void write_table(const PatchStudy &study, const Sink &sink, bool colour);
+void write_json(const PatchStudy &study, const Sink &sink);
 std::vector<Flat> flat_of(const PatchStudy &study);
 
 } // namespace vantrel::sheets

@@ -137,7 +137,7 @@ List list_weights(int status, const std::optional<int> &wanted)
     return list_of(std::string(status_name(status)), std::move(fields), std::move(rows));
 }
 
-std::string as_table(const List &list, bool)
+void write_table(const List &list, const Sink &sink, bool)
 {
     const Flat &flat = list.flat;
     std::vector<Row> rows(1);
@@ -151,7 +151,7 @@ std::string as_table(const List &list, bool)
             row[i] = shown(row[i], flat.fields[i].text);
             widths[i] = std::max(widths[i], characters(row[i]));
         }
-    Lines lines;
+    Lines lines(sink);
     for (const Row &row : rows) {
         std::string line;
         for (std::size_t i = 0; i < widths.size(); ++i) {
@@ -160,10 +160,9 @@ std::string as_table(const List &list, bool)
         }
         lines.add(line);
     }
-    return lines.out;
 }
 
-std::string as_json(const List &list)
+void write_json(const List &list, const Sink &sink)
 {
     const Json head = {{"command", "list"}, {"list", list.what}};
     const auto row_json = [&](std::size_t i) {
@@ -174,7 +173,8 @@ std::string as_json(const List &list)
                 list.flat.fields[k].text ? Json(row[k]) : Json::parse(row[k]);
         return out;
     };
-    return with_array(head, "rows", list.flat.rows, row_json) + '\n';
+    write_with_array(head, "rows", list.flat.rows, row_json, sink);
+    sink.write("\n");
 }
 
 std::vector<Flat> flat_of(const List &list) { return {list.flat}; }

@@ -21,9 +21,9 @@ List list_responses(const std::optional<int> &wanted); // of one status, or of a
 // Filters scaled to a peak of 100, all of a status or one; throws RequestError where there is none.
 List list_weights(int status, const std::optional<int> &wanted);
 
-// The output formats; each gives the whole text.
-std::string as_table(const List &list, bool colour);
-std::string as_json(const List &list);
+// The output formats.
+void write_table(const List &list, const Sink &sink, bool colour);
+void write_json(const List &list, const Sink &sink);
 std::vector<Flat> flat_of(const List &list);
 
 } // namespace vantrel::sheets

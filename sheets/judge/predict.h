@@ -60,9 +60,9 @@ Predictions predict_overprints(const Measurement &sheet, const Inks &inks, const
 // "Magenta 100 40 % + Yellow 100 70 %", each name cut to a number of characters.
 std::string inks_of(const Prediction &prediction, std::size_t kWidestName);
 
-// The output formats; each gives the whole text.
-std::string as_table(const Predictions &predictions, bool colour);
-std::string as_json(const Predictions &predictions);
+// The output formats.
+void write_table(const Predictions &predictions, const Sink &sink, bool colour);
+void write_json(const Predictions &predictions, const Sink &sink);
 std::vector<Flat> flat_of(const Predictions &predictions);
 
 } // namespace vantrel::sheets

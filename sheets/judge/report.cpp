@@ -2,7 +2,6 @@
 
 #include "judge/densitometer.h"
 #include "judge/names.h"
-#include "read/progress.h"
 
 #include <fmt/format.h>
 
@@ -155,10 +154,10 @@ Report report_of(const Measurement &sheet, const Inks &inks, const Request &requ
                   .tone_curves = {}};
     if (request.second_paper)
         report.metamerism = metamerism_of(request);
-    Progress progress("Measuring", sheet.patches.size());
+    const Work work{request.tell, "Measuring", sheet.patches.size()};
     for (const Patch &patch : sheet.patches) {
-        progress.done(report.patches.size());
         report.patches.push_back(patch_report(patch, inks, request, report.paper.lab));
+        work.done(report.patches.size());
     }
     report.tone_curves = tone_curves(sheet, inks, report.patches);
     return report;

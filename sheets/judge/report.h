@@ -21,6 +21,7 @@ struct Request {
     double n_factor = 1;
     const Patch *second_paper = nullptr; // metamerism is measured against it; may be null
     ILLUM_OBS second_illuminant = A_2DEG;
+    Tell tell{};
 };
 
 // Percentages and densities are missing where they make no sense.
@@ -91,9 +92,9 @@ PaperReport paper_report(const Patch &paper, ILLUM_OBS illuminant);
 
 Report report_of(const Measurement &sheet, const Inks &inks, const Request &request);
 
-// The output formats; each gives the whole text.
-std::string as_table(const std::vector<Report> &sheets, bool colour);
-std::string as_json(const std::vector<Report> &sheets);
+// The output formats.
+void write_table(const std::vector<Report> &sheets, const Sink &sink, bool colour);
+void write_json(const std::vector<Report> &sheets, const Sink &sink);
 std::vector<Flat> flat_of(const std::vector<Report> &sheets);
 
 } // namespace vantrel::sheets

@@ -1,7 +1,6 @@
 #include "read/cgats.h"
 
 #include "read/lines.h"
-#include "read/progress.h"
 #include "read/table.h"
 #include "read/text.h"
 
@@ -197,7 +196,7 @@ void Reader::end_rows()
 
 void Reader::read(std::string_view text)
 {
-    Progress progress("Reading", text.size());
+    const Work work{sheet.tell(), "Reading", text.size()};
     while (!text.empty()) {
         ++line;
         const std::string_view whole = next_line(text);
@@ -210,8 +209,9 @@ void Reader::read(std::string_view text)
             name_fields(whole);
         else
             row(whole);
-        progress.left(text.size());
+        work.left(text.size());
     }
+    work.left(0);
     if (place == Place::rows)
         throw InputError{line, "the file ends before END_DATA"};
     if (place == Place::fields)

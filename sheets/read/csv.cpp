@@ -1,7 +1,6 @@
 #include "read/csv.h"
 
 #include "read/lines.h"
-#include "read/progress.h"
 #include "read/table.h"
 #include "read/text.h"
 
@@ -84,7 +83,7 @@ void read_csv(std::string_view text, Sheet &sheet)
 {
     std::size_t line = 0;
     std::optional<Header> header;
-    Progress progress("Reading", text.size());
+    const Work work{sheet.tell(), "Reading", text.size()};
     while (!header && !text.empty()) {
         ++line;
         header = header_in(next_line(text));
@@ -108,8 +107,9 @@ void read_csv(std::string_view text, Sheet &sheet)
             throw InputError{at, fmt::format("{} values in a row of {} fields", row->size(),
                                              table.fields.size())};
         table.add(*row, std::nullopt, at);
-        progress.left(text.size());
+        work.left(text.size());
     }
+    work.left(0);
     table.finish();
 }
 

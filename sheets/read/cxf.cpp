@@ -1,6 +1,5 @@
 #include "read/cxf.h"
 
-#include "read/progress.h"
 #include "read/text.h"
 
 #include <fmt/format.h>
@@ -317,12 +316,13 @@ void Reader::read()
         all_settings.try_emplace(attribute(node, "Id"), settings_of(node));
     read_tints(child(root, "CustomResources"));
 
-    Progress progress("Reading", text.size());
+    const Work work{sheet.tell(), "Reading", text.size()};
     for (const Node &object : child(resources, "ObjectCollection").children())
         if (is(object, "Object")) {
             read_object(object);
-            progress.done(counted);
+            work.done(counted);
         }
+    work.left(0);
     if (without > 0 && !sheet.patches.empty())
         sheet.warn(0, fmt::format("objects without a reflectance spectrum: {}", without));
     if (repeated > 0)

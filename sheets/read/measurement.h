@@ -1,6 +1,8 @@
 // What a measurement file holds, whatever its format.
 #pragma once
 
+#include "read/tell.h"
+
 #include <vantrel.h>
 
 #include <array>
@@ -65,6 +67,7 @@ struct Reading {
     Scale scale = Scale::automatic;
     std::string condition; // M0 to M3; empty for the one that the file has, or M1 of several
     bool colours = false;  // L*a*b* alone will do; otherwise a file without spectra is refused
+    Tell tell{};
 };
 
 struct Measurement {

@@ -35,6 +35,7 @@ public:
     // Without a keyword it is 1 or 100; up to this largest reflectance it is 1.
     double largest_fraction = 2; // paper with optical brightener reads up to 1.4
 
+    const Tell &tell() const { return reading.tell; }
     void warn(std::size_t line, const std::string &text);
 
     std::vector<Patch> patches;

@@ -129,12 +129,12 @@ Json pair_json(const PairReport &pair, const Comparison &comparison)
 
 } // namespace
 
-std::string as_table(const Comparison &comparison, bool colour)
+void write_table(const Comparison &comparison, const Sink &sink, bool colour)
 {
     std::string paper = cut(comparison.reference_paper, kWidestInText);
     if (comparison.sample_paper != comparison.reference_paper)
         paper += ", the sample over " + cut(comparison.sample_paper, kWidestInText);
-    Lines lines;
+    Lines lines(sink);
     lines.add(fmt::format("{} against {}: {} {} by {}", comparison.sample, comparison.reference,
                           comparison.pairs.size(), comparison.pairs.size() == 1 ? "pair" : "pairs",
                           name_of(comparison.paired_by)));
@@ -154,10 +154,9 @@ std::string as_table(const Comparison &comparison, bool colour)
     add_unpaired(lines, comparison.reference, comparison.only_reference);
     add_unpaired(lines, comparison.sample, comparison.only_sample);
     add_verdict(lines, comparison);
-    return lines.out;
 }
 
-std::string as_json(const Comparison &comparison)
+void write_json(const Comparison &comparison, const Sink &sink)
 {
     Json names = Json::array(), weights = Json::object(), statistics = Json::object();
     for (std::size_t i = 0; i < comparison.metrics.size(); ++i) {
@@ -189,9 +188,10 @@ std::string as_json(const Comparison &comparison)
         {"unpaired",
          {{"reference", comparison.only_reference}, {"sample", comparison.only_sample}}},
     };
-    return with_array(head, "pairs", comparison.pairs.size(),
-                      [&](std::size_t i) { return pair_json(comparison.pairs[i], comparison); }) +
-           '\n';
+    write_with_array(
+        head, "pairs", comparison.pairs.size(),
+        [&](std::size_t i) { return pair_json(comparison.pairs[i], comparison); }, sink);
+    sink.write("\n");
 }
 
 std::vector<Flat> flat_of(const Comparison &comparison)

@@ -1,6 +1,5 @@
 #include "write/flat.h"
 
-#include "read/progress.h"
 #include "read/text.h"
 
 #include <fmt/format.h>
@@ -75,32 +74,34 @@ std::vector<Field> all_fields(const std::vector<Flat> &tables)
     return all;
 }
 
-void add_csv_rows(std::string &out, const Flat &table, const std::vector<Field> &fields)
+void write_rows(const Flat &table, const std::vector<Field> &fields, const Sink &sink)
 {
     std::map<std::string_view, std::size_t> own;
     for (std::size_t i = 0; i < table.fields.size(); ++i)
         own.emplace(table.fields[i].name, i);
-    Progress progress("Writing", table.rows);
+    const Work work{sink.tell, "Writing", table.rows};
     for (std::size_t i = 0; i < table.rows; ++i) {
-        progress.done(i);
         const Row row = table.row(i);
+        std::string out;
         for (const Field &field : fields) {
             if (const auto found = own.find(field.name); found != own.end())
                 out += field.text ? csv_text(row[found->second]) : row[found->second];
             out += ',';
         }
         out.back() = '\n';
+        sink.write(out);
+        work.done(i + 1);
     }
 }
 
-void add_cgats_table(std::string &out, const Flat &table)
+void write_table(const Flat &table, const Sink &sink)
 {
     std::vector<std::size_t> columns;
     for (std::size_t i = 0; i < table.fields.size(); ++i)
         if (!table.fields[i].cgats.empty())
             columns.push_back(i);
 
-    out += fmt::format("DESCRIPTOR\t{}\n", cgats_text(table.description));
+    std::string out = fmt::format("DESCRIPTOR\t{}\n", cgats_text(table.description));
     if (table.spectra)
         out += "SPECTRAL_NORM\t\"100\"\n";
     for (const std::size_t column : columns)
@@ -111,9 +112,10 @@ void add_cgats_table(std::string &out, const Flat &table)
         out += identifier(table.fields[column].cgats) + '\t';
     out.back() = '\n';
     out += fmt::format("END_DATA_FORMAT\nNUMBER_OF_SETS\t{}\nBEGIN_DATA\n", table.rows);
-    Progress progress("Writing", table.rows);
+    sink.write(out);
+    const Work work{sink.tell, "Writing", table.rows};
     for (std::size_t i = 0; i < table.rows; ++i) {
-        progress.done(i);
+        out.clear();
         const Row row = table.row(i);
         for (const std::size_t column : columns) {
             const bool quoted = table.fields[column].text || row[column].empty();
@@ -121,30 +123,31 @@ void add_cgats_table(std::string &out, const Flat &table)
             out += '\t';
         }
         out.back() = '\n';
+        sink.write(out);
+        work.done(i + 1);
     }
-    out += "END_DATA\n";
+    sink.write("END_DATA\n");
 }
 
 } // namespace
 
-std::string as_csv(const std::vector<Flat> &tables)
+void write_csv(const std::vector<Flat> &tables, const Sink &sink)
 {
     const std::vector<Field> fields = all_fields(tables);
     std::string out;
     for (const Field &field : fields)
         out += csv_text(field.name) + ',';
     out.back() = '\n';
+    sink.write(out);
     for (const Flat &table : tables)
-        add_csv_rows(out, table, fields);
-    return out;
+        write_rows(table, fields, sink);
 }
 
-std::string as_cgats(const std::vector<Flat> &tables)
+void write_cgats(const std::vector<Flat> &tables, const Sink &sink)
 {
-    std::string out = "CGATS.17\nORIGINATOR\t\"vantrel " VANTREL_VERSION "\"\n";
+    sink.write("CGATS.17\nORIGINATOR\t\"vantrel " VANTREL_VERSION "\"\n");
     for (const Flat &table : tables)
-        add_cgats_table(out, table);
-    return out;
+        write_table(table, sink);
 }
 
 std::string cell(const std::optional<double> &value)

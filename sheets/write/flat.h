@@ -2,6 +2,7 @@
 #pragma once
 
 #include "judge/colour.h"
+#include "write/sink.h"
 
 #include <cstddef>
 #include <functional>
@@ -30,10 +31,10 @@ struct Flat {
 
 // RFC 4180. Tables of different fields share one header, with a column for every name. Text that a
 // spreadsheet would take for a formula gets an apostrophe in front.
-std::string as_csv(const std::vector<Flat> &tables);
+void write_csv(const std::vector<Flat> &tables, const Sink &sink);
 
 // CGATS text (ISO 28178), one table after the other.
-std::string as_cgats(const std::vector<Flat> &tables);
+void write_cgats(const std::vector<Flat> &tables, const Sink &sink);
 
 // Cells: with four decimals, to the last bit, empty where there is no value.
 std::string cell(const std::optional<double> &value);

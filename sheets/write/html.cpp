@@ -7,9 +7,11 @@ namespace vantrel::sheets {
 namespace {
 
 // JSON as the text of a script element: no sequence in it ends the element or opens a comment, and
-// no space stands between its tokens. `<`, U+2028 and U+2029 occur in strings alone.
-void append_script_data(std::string &out, std::string_view json)
+// no space stands between its tokens. `<`, U+2028 and U+2029 occur in strings alone. Each piece of
+// the document ends outside of its strings.
+std::string script_data(std::string_view json)
 {
+    std::string out;
     bool in_string = false;
     for (std::size_t i = 0; i < json.size(); ++i) {
         const char c = json[i];
@@ -27,22 +29,21 @@ void append_script_data(std::string &out, std::string_view json)
             out += c;
         }
     }
+    return out;
 }
 
 } // namespace
 
-std::string as_html(std::string_view json)
+void write_html(const std::function<void(const Sink &)> &write_document, const Sink &sink)
 {
     if (page_before_data.empty())
         throw RequestError{
             "--format html: this program was built without the page, which takes npm"};
-    std::string out;
     for (const std::string_view part : page_before_data)
-        out += part;
-    append_script_data(out, json);
+        sink.write(part);
+    write_document({[&](std::string_view json) { sink.write(script_data(json)); }, sink.tell});
     for (const std::string_view part : page_after_data)
-        out += part;
-    return out;
+        sink.write(part);
 }
 
 } // namespace vantrel::sheets

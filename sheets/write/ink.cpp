@@ -253,17 +253,16 @@ Flat colours(const PatchStudy &study)
 
 } // namespace
 
-std::string as_table(const PatchStudy &study, bool colour)
+void write_table(const PatchStudy &study, const Sink &sink, bool colour)
 {
-    Lines lines;
+    Lines lines(sink);
     add_summary(lines, study, colour);
     add_densities(lines, study);
     add_illuminants(lines, study, colour);
     add_bands(lines, study);
-    return lines.out;
 }
 
-std::string as_json(const PatchStudy &study)
+void write_json(const PatchStudy &study, const Sink &sink)
 {
     Json illuminants = Json::array(), statuses = Json::array(), against;
     for (int i = 0; i < NUM_ILLUM_OBS; ++i)
@@ -289,7 +288,7 @@ std::string as_json(const PatchStudy &study)
     out["statuses"] = statuses;
     out["illuminants"] = illuminants;
     out["against"] = against;
-    return out.dump(2) + '\n';
+    sink.write(out.dump(2) + '\n');
 }
 
 std::vector<Flat> flat_of(const PatchStudy &study)

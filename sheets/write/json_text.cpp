@@ -1,7 +1,6 @@
 #include "write/json_text.h"
 
 #include "judge/names.h"
-#include "read/progress.h"
 
 #include <fmt/format.h>
 
@@ -15,18 +14,18 @@ void add_reading(Json &object, const DensityReading &reading, int status)
     object["density"] = or_null(reading.density);
 }
 
-std::string with_array(const Json &object, std::string_view name, std::size_t count,
-                       const std::function<Json(std::size_t)> &element)
+void write_with_array(const Json &object, std::string_view name, std::size_t count,
+                      const std::function<Json(std::size_t)> &element, const Sink &sink)
 {
-    std::string out = object.dump(2);
-    out.erase(out.rfind("\n}"));
-    out += fmt::format(",\n  \"{}\": [", name);
-    Progress progress("Writing", count);
+    std::string head = object.dump(2);
+    head.erase(head.rfind("\n}"));
+    sink.write(fmt::format("{},\n  \"{}\": [", head, name));
+    const Work work{sink.tell, "Writing", count};
     for (std::size_t i = 0; i < count; ++i) {
-        progress.done(i);
-        out += (i ? ",\n" : "\n") + element(i).dump();
+        sink.write((i ? ",\n" : "\n") + element(i).dump());
+        work.done(i + 1);
     }
-    return out + "\n  ]\n}";
+    sink.write("\n  ]\n}");
 }
 
 } // namespace vantrel::sheets

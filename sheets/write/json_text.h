@@ -3,6 +3,7 @@
 
 #include "judge/colour.h"
 #include "judge/densitometer.h"
+#include "write/sink.h"
 
 #include <nlohmann/json.hpp>
 
@@ -30,9 +31,9 @@ void add_reading(Json &object, const DensityReading &reading, int status);
 
 Json patch_json(const PatchReport &patch, int status);
 
-// The object with one more member, an array whose elements never stand in memory together: each is
-// a line.
-std::string with_array(const Json &object, std::string_view name, std::size_t count,
-                       const std::function<Json(std::size_t)> &element);
+// Writes the object with one more member, an array whose elements never stand in memory together:
+// each is a line.
+void write_with_array(const Json &object, std::string_view name, std::size_t count,
+                      const std::function<Json(std::size_t)> &element, const Sink &sink);
 
 } // namespace vantrel::sheets

@@ -50,7 +50,7 @@ Json tone_values_json(const Report &report)
     return out;
 }
 
-std::string sheet_json(const Report &report)
+void write_sheet(const Report &report, const Sink &sink)
 {
     const Json head = {
         {"file", report.file},
@@ -70,8 +70,9 @@ std::string sheet_json(const Report &report)
         {"paper", paper_json(report)},
         {"tone_values", tone_values_json(report)},
     };
-    return with_array(head, "patches", report.patches.size(),
-                      [&](std::size_t i) { return patch_json(report.patches[i], report.status); });
+    write_with_array(
+        head, "patches", report.patches.size(),
+        [&](std::size_t i) { return patch_json(report.patches[i], report.status); }, sink);
 }
 
 Json prediction_json(const Prediction &prediction, int status)
@@ -118,15 +119,17 @@ Json patch_json(const PatchReport &patch, int status)
             {"refl", patch.refl}};
 }
 
-std::string as_json(const std::vector<Report> &sheets)
+void write_json(const std::vector<Report> &sheets, const Sink &sink)
 {
-    std::string out = "{\n\"command\": \"report\",\n\"sheets\": [\n";
-    for (const Report &report : sheets)
-        out += (&report == sheets.data() ? "" : ",\n") + sheet_json(report);
-    return out + "\n]\n}\n";
+    sink.write("{\n\"command\": \"report\",\n\"sheets\": [\n");
+    for (const Report &report : sheets) {
+        sink.write(&report == sheets.data() ? "" : ",\n");
+        write_sheet(report, sink);
+    }
+    sink.write("\n]\n}\n");
 }
 
-std::string as_json(const Predictions &predictions)
+void write_json(const Predictions &predictions, const Sink &sink)
 {
     const Json head = {
         {"command", "predict"},
@@ -136,11 +139,11 @@ std::string as_json(const Predictions &predictions)
         {"paper", predictions.paper},
         {"left_out", predictions.left_out},
     };
-    return with_array(head, "predictions", predictions.all.size(),
-                      [&](std::size_t i) {
-                          return prediction_json(predictions.all[i], predictions.status);
-                      }) +
-           '\n';
+    write_with_array(
+        head, "predictions", predictions.all.size(),
+        [&](std::size_t i) { return prediction_json(predictions.all[i], predictions.status); },
+        sink);
+    sink.write("\n");
 }
 
 } // namespace vantrel::sheets

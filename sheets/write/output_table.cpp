@@ -175,12 +175,11 @@ std::string summary(const Predictions &predictions, const char *name, Estimate P
                        fixed(sum / static_cast<double>(predictions.all.size())), fixed(largest));
 }
 
-std::string as_table(const Report &report, bool colour)
+void write_table(const Report &report, Lines &lines, bool colour)
 {
     std::size_t width = 10;
     for (const PatchReport &patch : report.patches)
         width = std::max(width, characters(cut(patch.name, kWidestName)));
-    Lines lines;
     add_head(lines, report);
     add_patches(lines, report, width, colour);
     add_paper(lines, report);
@@ -193,20 +192,21 @@ std::string as_table(const Report &report, bool colour)
     add_tone_values(lines, report);
     if (report.inks.size() > 1)
         lines.add(fmt::format("\nInks print in the order {}", fmt::join(report.inks, ", ")));
-    return lines.out;
 }
 
 } // namespace
 
-std::string as_table(const std::vector<Report> &sheets, bool colour)
+void write_table(const std::vector<Report> &sheets, const Sink &sink, bool colour)
 {
-    std::string out;
-    for (const Report &report : sheets)
-        out += (out.empty() ? "" : "\n\n") + as_table(report, colour);
-    return out;
+    Lines lines(sink);
+    for (const Report &report : sheets) {
+        if (&report != sheets.data())
+            lines.add("\n");
+        write_table(report, lines, colour);
+    }
 }
 
-std::string as_table(const Predictions &predictions, bool colour)
+void write_table(const Predictions &predictions, const Sink &sink, bool colour)
 {
     const std::size_t widest = colour ? 26 : 38; // 120 columns in all
     const auto title = [&](const Prediction &prediction) {
@@ -217,7 +217,7 @@ std::string as_table(const Predictions &predictions, bool colour)
     std::size_t width = 11;
     for (const Prediction &prediction : predictions.all)
         width = std::max(width, characters(title(prediction)));
-    Lines lines;
+    Lines lines(sink);
     lines.add(fmt::format("{}: {}, on {}", predictions.file, name_of(predictions.illuminant),
                           cut(predictions.paper, kWidestName)));
     if (predictions.all.size() == 1)
@@ -248,7 +248,6 @@ std::string as_table(const Predictions &predictions, bool colour)
         lines.add(fmt::format("Left out: {} overprints of more than three inks, of fractions of a "
                               "percent, or without a solid",
                               predictions.left_out));
-    return lines.out;
 }
 
 } // namespace vantrel::sheets

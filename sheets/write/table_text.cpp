@@ -34,7 +34,7 @@ std::string swatch(const Rgb &rgb)
 void Lines::add(std::string line)
 {
     line.resize(line.find_last_not_of(' ') + 1);
-    out += line + '\n';
+    sink.write(line + '\n');
 }
 
 } // namespace vantrel::sheets

@@ -2,6 +2,7 @@
 #pragma once
 
 #include "judge/colour.h"
+#include "write/sink.h"
 
 #include <cstddef>
 #include <optional>
@@ -19,11 +20,14 @@ std::string fixed(const CIELABCOORD &lab); // L*, a*, b* with spaces between
 std::size_t characters(const std::string &text);
 std::string swatch(const Rgb &rgb);
 
-// Collects lines, none of them with spaces at its end.
+// Writes lines, none of them with spaces at its end.
 class Lines {
 public:
+    explicit Lines(const Sink &sink) : sink(sink) {}
     void add(std::string line);
-    std::string out;
+
+private:
+    const Sink &sink;
 };
 
 } // namespace vantrel::sheets

@@ -2,6 +2,7 @@
 
 #include "judge/compare.h"
 #include "options.h"
+#include "progress.h"
 #include "read/text.h"
 
 #include <fmt/format.h>
@@ -100,6 +101,7 @@ Outcome run(CompareOptions &options)
     request.status = status_of(options.status);
     request.words_of_hue = options.words == "hue";
     request.tolerance = options.tolerance;
+    request.tell = progress_bar();
     const Measurement reference = sheet_of(options.reference, options);
     const Measurement sample = sheet_of(options.sample, options);
     request.reference_paper = &paper_of(reference, options);
@@ -113,8 +115,9 @@ Outcome run(CompareOptions &options)
             options.warnings.push_back(fmt::format("{}: {} of {} patches have no partner",
                                                    sheet->file, names->size(),
                                                    sheet->patches.size()));
-    Outcome outcome = outcome_of(comparison, options);
-    outcome.within_tolerance = comparison.passed();
+    const bool passed = comparison.passed();
+    Outcome outcome = outcome_of(std::move(comparison), options);
+    outcome.within_tolerance = passed;
     return outcome;
 }
 

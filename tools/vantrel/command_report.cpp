@@ -2,6 +2,7 @@
 
 #include "judge/report.h"
 #include "options.h"
+#include "progress.h"
 
 #include <cmath>
 #include <memory>
@@ -37,10 +38,11 @@ Outcome run(ReportOptions &options)
     request.second_illuminant = options.second_illuminant.empty()
                                     ? usual_second(request.illuminant)
                                     : illuminant_of(options.second_illuminant);
+    request.tell = progress_bar();
     std::vector<Report> sheets;
     for (const std::string &file : options.files)
         sheets.push_back(report_of_file(file, request, options));
-    return outcome_of(sheets, options);
+    return outcome_of(std::move(sheets), options);
 }
 
 constexpr const char *kFooter =

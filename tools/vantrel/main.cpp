@@ -5,6 +5,7 @@
 
 #include "options.h"
 #include "output_file.h"
+#include "progress.h"
 #include "read/text.h"
 
 #include <csignal>
@@ -12,6 +13,7 @@
 #include <exception>
 #include <new>
 #include <sstream>
+#include <unistd.h>
 
 using namespace vantrel::program;
 
@@ -35,7 +37,7 @@ Outcome run(CLI::App &app, int count, char **words)
     } catch (const CLI::Success &wish) { // --help, --version
         std::ostringstream text, unused;
         app.exit(wish, text, unused);
-        return {text.str(), "", {}};
+        return {[text = text.str()](const Sink &sink) { sink.write(text); }, "", {}};
     } catch (const CLI::RequiredError &) {
         if (!app.get_subcommands().empty()) // one of its own arguments
             throw;
@@ -50,6 +52,15 @@ Outcome run(CLI::App &app, int count, char **words)
     return {};
 }
 
+void write(const Outcome &outcome)
+{
+    OutputFile file(outcome.output);
+    const bool on_terminal = outcome.output.empty() && isatty(STDOUT_FILENO) != 0;
+    outcome.write(
+        {[&](std::string_view text) { file.write(text); }, on_terminal ? Tell() : progress_bar()});
+    file.finish();
+}
+
 int exit_status(int count, char **words)
 {
     CLI::App app("Colour measurement for the graphic arts.", "vantrel");
@@ -57,13 +68,15 @@ int exit_status(int count, char **words)
         const Outcome outcome = run(app, count, words);
         for (const std::string &warning : outcome.warnings)
             complain(warning);
-        const std::string problem = write_output(outcome.output, outcome.text);
-        if (problem.empty())
-            return outcome.within_tolerance ? done : out_of_tolerance;
-        complain((outcome.output.empty() || outcome.output == "-" ? "standard output"
-                                                                  : printable(outcome.output)) +
-                 ": " + problem);
-        return not_written;
+        try {
+            write(outcome);
+        } catch (const OutputError &error) {
+            const bool to_file = !outcome.output.empty() && outcome.output != "-";
+            complain((to_file ? printable(outcome.output) : "standard output") + ": " +
+                     error.reason);
+            return not_written;
+        }
+        return outcome.within_tolerance ? done : out_of_tolerance;
     } catch (const RequestError &error) {
         complain(error.message);
     } catch (const CLI::ParseError &error) {

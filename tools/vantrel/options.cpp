@@ -2,6 +2,7 @@
 
 #include "file.h"
 #include "judge/names.h"
+#include "progress.h"
 #include "read/reader.h"
 #include "read/text.h"
 
@@ -135,6 +136,7 @@ Measurement sheet_of(const std::string &path, Options &options)
         if (options.scale != "auto")
             reading.scale = options.scale == "percent" ? Scale::percent : Scale::fraction;
         reading.condition = options.condition;
+        reading.tell = progress_bar();
         Measurement sheet = read_measurement(read_file(path), reading);
         sheet.file = file;
         for (const std::string &warning : sheet.warnings)
@@ -156,6 +158,7 @@ bool shows_colour(const Options &options)
 
 void complain(const std::string &message)
 {
+    wipe_bar();
     static_cast<void>(std::fputs(("vantrel: " + message + "\n").c_str(), stderr));
 }
 

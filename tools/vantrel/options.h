@@ -9,6 +9,7 @@
 
 #include <functional>
 #include <string>
+#include <utility>
 #include <vector>
 
 namespace vantrel::program {
@@ -29,8 +30,8 @@ struct Options {
 
 // What a command has to say.
 struct Outcome {
-    std::string text;
-    std::string output; // as in Options
+    std::function<void(const Sink &)> write; // throws RequestError
+    std::string output;                      // as in Options
     std::vector<std::string> warnings;
     bool within_tolerance = true;
 };
@@ -72,18 +73,22 @@ bool shows_colour(const Options &options);
 void complain(const std::string &message);
 
 // A result in the format that the options ask for.
-template <typename Result> Outcome outcome_of(const Result &result, const Options &options)
+template <typename Result> Outcome outcome_of(Result result, const Options &options)
 {
-    const auto text = [&]() -> std::string {
-        if (options.format == "json")
-            return as_json(result);
-        if (options.format == "html")
-            return as_html(as_json(result));
-        if (options.format == "table")
-            return as_table(result, shows_colour(options));
-        return options.format == "csv" ? as_csv(flat_of(result)) : as_cgats(flat_of(result));
+    const auto write = [result = std::move(result), format = options.format,
+                        colour = shows_colour(options)](const Sink &sink) {
+        if (format == "json")
+            write_json(result, sink);
+        else if (format == "html")
+            write_html([&](const Sink &page) { write_json(result, page); }, sink);
+        else if (format == "table")
+            write_table(result, sink, colour);
+        else if (format == "csv")
+            write_csv(flat_of(result), sink);
+        else
+            write_cgats(flat_of(result), sink);
     };
-    return {text(), options.output, options.warnings};
+    return {write, options.output, options.warnings};
 }
 
 } // namespace vantrel::program

@@ -11,29 +11,9 @@
 namespace vantrel::program {
 namespace {
 
-std::string reason() { return std::strerror(errno); }
+constexpr std::size_t kBlock = 1u << 16;
 
-bool write_all(int file, std::string_view text)
-{
-    while (!text.empty()) {
-        const ssize_t written = write(file, text.data(), text.size());
-        if (written < 0 && errno != EINTR)
-            return false;
-        text.remove_prefix(static_cast<std::size_t>(written < 0 ? 0 : written));
-    }
-    return true;
-}
-
-std::string write_straight(const std::string &path, std::string_view text)
-{
-    const int file = open(path.c_str(), O_WRONLY | O_NOCTTY | O_CLOEXEC);
-    if (file < 0)
-        return reason();
-    std::string problem = write_all(file, text) ? "" : reason();
-    if (close(file) != 0 && problem.empty())
-        problem = reason();
-    return problem;
-}
+OutputError error_now() { return {std::strerror(errno)}; }
 
 // The permissions of a new file.
 mode_t usual_mode()
@@ -43,47 +23,85 @@ mode_t usual_mode()
     return 0666 & ~mask;
 }
 
-std::string replace_file(const std::string &path, mode_t mode, std::string_view text)
-{
-    std::string temporary = path + ".XXXXXX";
-    const int file = mkostemp(temporary.data(), O_CLOEXEC);
-    if (file < 0)
-        return reason();
-    // On the disk before it takes the name, so that a crash of the machine leaves no empty file.
-    bool done = write_all(file, text) && fchmod(file, mode) == 0 && fsync(file) == 0;
-    std::string problem = done ? "" : reason();
-    if (close(file) != 0 && problem.empty())
-        problem = reason();
-    if (problem.empty() && std::rename(temporary.c_str(), path.c_str()) != 0)
-        problem = reason();
-    if (!problem.empty())
-        unlink(temporary.c_str());
-    return problem;
-}
-
 } // namespace
 
-std::string write_output(const std::string &path, std::string_view text)
+OutputFile::~OutputFile()
 {
-    const auto to_standard_output = [&] { return write_all(STDOUT_FILENO, text) ? "" : reason(); };
+    if (file >= 0 && file != STDOUT_FILENO)
+        static_cast<void>(close(file));
+    if (!temporary.empty())
+        static_cast<void>(unlink(temporary.c_str()));
+}
+
+void OutputFile::write(std::string_view text)
+{
+    buffer += text;
+    if (buffer.size() >= kBlock)
+        flush();
+}
+
+void OutputFile::finish()
+{
+    flush();
+    if (file == STDOUT_FILENO)
+        return;
+    // On the disk before it takes the name, so that a crash of the machine leaves no empty file.
+    if (!temporary.empty() && (fchmod(file, mode) != 0 || fsync(file) != 0))
+        throw error_now();
+    if (close(std::exchange(file, -1)) != 0)
+        throw error_now();
+    if (!temporary.empty() && std::rename(temporary.c_str(), replaced.c_str()) != 0)
+        throw error_now();
+    temporary.clear();
+}
+
+void OutputFile::flush()
+{
+    if (file < 0)
+        open();
+    for (std::string_view rest = buffer; !rest.empty();) {
+        const ssize_t written = ::write(file, rest.data(), rest.size());
+        if (written < 0 && errno != EINTR)
+            throw error_now();
+        rest.remove_prefix(static_cast<std::size_t>(written < 0 ? 0 : written));
+    }
+    buffer.clear();
+}
+
+void OutputFile::open()
+{
     struct stat standard_output {
-    }, file{};
-    if (path.empty() || path == "-")
-        return to_standard_output();
-    if (stat(path.c_str(), &file) != 0) // a link to nothing is refused: it names no file yet
-        return errno == ENOENT && lstat(path.c_str(), &file) != 0
-                   ? replace_file(path, usual_mode(), text)
-                   : reason();
-    if (fstat(STDOUT_FILENO, &standard_output) == 0 && standard_output.st_dev == file.st_dev &&
-        standard_output.st_ino == file.st_ino)
-        return to_standard_output();
-    if (!S_ISREG(file.st_mode))
-        return write_straight(path, text);
-    if (access(path.c_str(), W_OK) != 0)
-        return reason();
-    const std::unique_ptr<char, decltype(&std::free)> target(realpath(path.c_str(), nullptr),
-                                                             std::free);
-    return target ? replace_file(target.get(), file.st_mode & 07777, text) : reason();
+    }, target{};
+    const bool exists = !path.empty() && path != "-" && stat(path.c_str(), &target) == 0;
+    if (path.empty() || path == "-" ||
+        (exists && fstat(STDOUT_FILENO, &standard_output) == 0 &&
+         standard_output.st_dev == target.st_dev && standard_output.st_ino == target.st_ino)) {
+        file = STDOUT_FILENO;
+    } else if (!exists) { // a link to nothing is refused: it names no file yet
+        if (errno != ENOENT || lstat(path.c_str(), &target) == 0)
+            throw error_now();
+        open_beside(path, usual_mode());
+    } else if (!S_ISREG(target.st_mode)) {
+        file = ::open(path.c_str(), O_WRONLY | O_NOCTTY | O_CLOEXEC);
+    } else {
+        const std::unique_ptr<char, decltype(&std::free)> real(realpath(path.c_str(), nullptr),
+                                                               std::free);
+        if (access(path.c_str(), W_OK) != 0 || !real)
+            throw error_now();
+        open_beside(real.get(), target.st_mode & 07777);
+    }
+    if (file < 0)
+        throw error_now();
+}
+
+void OutputFile::open_beside(const std::string &target, mode_t of_target)
+{
+    replaced = target;
+    mode = of_target;
+    std::string name = target + ".XXXXXX";
+    file = mkostemp(name.data(), O_CLOEXEC);
+    if (file >= 0)
+        temporary = name;
 }
 
 } // namespace vantrel::program

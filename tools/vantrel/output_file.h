@@ -3,13 +3,40 @@
 
 #include <string>
 #include <string_view>
+#include <sys/types.h>
+#include <utility>
 
 namespace vantrel::program {
 
-// Writes all of the text to the file, or to standard output where the path is empty or "-". A file
-// has either its old content or all of the new one: it is written under a temporary name beside its
-// own and renamed. What is no regular file (a device, a pipe) is written straight. Gives nothing,
-// or the reason why the text could not be written.
-std::string write_output(const std::string &path, std::string_view text);
+// Why text could not be written.
+struct OutputError {
+    std::string reason;
+};
+
+// Takes text for a file, or for standard output where the path is empty or "-". A file has either
+// its old content or all of the new one: it is written under a temporary name beside its own and
+// renamed. What is no regular file (a device, a pipe) is written straight.
+class OutputFile {
+public:
+    explicit OutputFile(std::string path) : path(std::move(path)) {}
+    ~OutputFile(); // leaves the old file in place unless finish() was called
+    OutputFile(const OutputFile &) = delete;
+    OutputFile &operator=(const OutputFile &) = delete;
+
+    // These throw OutputError. Nothing is opened before there is text for it.
+    void write(std::string_view text);
+    void finish();
+
+private:
+    void open();
+    void open_beside(const std::string &target, mode_t of_target);
+    void flush();
+
+    std::string path;
+    std::string buffer;
+    int file = -1;
+    std::string temporary, replaced; // both empty where the file is written straight
+    mode_t mode = 0;                 // of the replaced file
+};
 
 } // namespace vantrel::program
