@@ -1,9 +1,12 @@
 // The extension module: makes the ufuncs, and carries what is not one.
+#include "guard.h"
 #include "rows.h"
+#include "settings.h"
 
 #include <numpy/arrayobject.h>
 #include <numpy/ufuncobject.h>
 
+#include <cstring>
 #include <string>
 
 namespace {
@@ -14,6 +17,7 @@ template <class... P, void (*function)(P...)> struct Constants<function> {
     template <std::size_t... I>
     static void call(PyArrayObject *const (&arrays)[sizeof...(P)], std::index_sequence<I...>)
     {
+        const Exclusive exclusive;
         function(arrays[I] ? static_cast<P>(PyArray_DATA(arrays[I])) : nullptr...);
     }
 
@@ -44,6 +48,41 @@ template <int (*function)()> PyObject *number(PyObject *, PyObject *)
     return PyLong_FromLong(function());
 }
 
+PyObject *get_settings(PyObject *, PyObject *)
+{
+    const Settings settings = process_settings();
+    return PyBytes_FromStringAndSize(reinterpret_cast<const char *>(&settings), sizeof settings);
+}
+
+/// Takes what get_settings() gave, here or in another process.
+bool settings_of(PyObject *bytes, Settings &settings)
+{
+    if (!PyBytes_Check(bytes) || PyBytes_GET_SIZE(bytes) != sizeof settings) {
+        PyErr_SetString(PyExc_ValueError, "these are settings of another version of Vantrel");
+        return false;
+    }
+    std::memcpy(&settings, PyBytes_AS_STRING(bytes), sizeof settings);
+    return true;
+}
+
+PyObject *set_settings(PyObject *, PyObject *bytes)
+{
+    Settings settings;
+    if (!settings_of(bytes, settings))
+        return nullptr;
+    set_process_settings(settings);
+    Py_RETURN_NONE;
+}
+
+PyObject *use_settings(PyObject *, PyObject *bytes)
+{
+    Settings settings;
+    if (bytes != Py_None && !settings_of(bytes, settings))
+        return nullptr;
+    use_settings(bytes == Py_None ? nullptr : &settings);
+    Py_RETURN_NONE;
+}
+
 PyMethodDef methods[] = {
     {"get_num_illuminant_observers", number<GetNumIlluminantObservers>, METH_NOARGS,
      "get_num_illuminant_observers()\n--\n\nThe number of illuminant/observer combinations, 18."},
@@ -59,37 +98,45 @@ PyMethodDef methods[] = {
     {"get_spectralx_constants", Constants<GetSpectralXConstants>::method, METH_VARARGS, nullptr},
     {"set_achromatic_constants", Constants<SetAChromaticConstants>::method, METH_VARARGS, nullptr},
     {"get_achromatic_constants", Constants<GetAChromaticConstants>::method, METH_VARARGS, nullptr},
+    {"get_settings", get_settings, METH_NOARGS, "All that can be set, as bytes."},
+    {"set_settings", set_settings, METH_O, "Sets what get_settings() gave."},
+    {"use_settings", use_settings, METH_O,
+     "Lets this thread compute under what get_settings() gave, or as all (None)."},
     {nullptr, nullptr, 0, nullptr},
 };
 
 /// Everything that NumPy keeps pointers to; lives as long as the process.
 struct Ufunc {
-    std::string name, signature, types;
-    PyUFuncGenericFunction loop;
-    Layout layout;
-    void *data = &layout;
+    std::string name, signature;
+    Guard guard = {};
+    PyUFuncGenericFunction loop = guarded;
+    void *data = &guard;
 };
 
 /// Adds the ufunc of a row, or its second one, whose last output tells which rows succeeded.
 bool add_ufunc(PyObject *module, const Row &row, bool flags)
 {
-    auto *kept = new Ufunc{
-        row.name, row.signature, {row.types, size_t(row.inputs + row.outputs)}, row.loop, {}};
+    auto *kept = new Ufunc{row.name, row.signature};
+    Guard &guard = kept->guard;
+    guard.loop = row.loop;
+    guard.inputs = row.inputs;
+    guard.types = {row.types, size_t(row.inputs + row.outputs)};
     if (flags) {
         kept->name += "_ok";
         kept->signature += ",()";
-        kept->types += static_cast<char>(NPY_BOOL);
+        guard.types += static_cast<char>(NPY_BOOL);
     }
     PyObject *object = PyUFunc_FromFuncAndDataAndSignature(
-        &kept->loop, &kept->data, kept->types.data(), 1, row.inputs, row.outputs + flags,
+        &kept->loop, &kept->data, guard.types.data(), 1, row.inputs, row.outputs + flags,
         PyUFunc_None, kept->name.c_str(), row.c_name, 0, kept->signature.c_str());
     if (!object)
         return false;
     const auto *ufunc = reinterpret_cast<const PyUFuncObject *>(object);
-    kept->layout.flags = flags;
+    guard.layout.flags = flags;
+    guard.core_dimensions = ufunc->core_enabled ? ufunc->core_num_dim_ix : 0;
     int stride = ufunc->nargs;
     for (int i = 0; ufunc->core_enabled && i < ufunc->nargs; ++i) {
-        Layout::Core &core = kept->layout.cores[i];
+        Layout::Core &core = guard.layout.cores[i];
         core.dimensions = ufunc->core_num_dims[i];
         core.stride = stride;
         stride += core.dimensions;

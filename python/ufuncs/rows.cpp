@@ -2,6 +2,9 @@
 #include "rows.h"
 #include "many_xyz.h"
 
+#include "difference/cie76.h"
+#include "difference/cmc.h"
+
 #include <cwchar>
 
 namespace {
@@ -28,6 +31,33 @@ int verbal_color_difference(const double *standard, const double *sample, ILLUM_
     *lightness = word_number(words[0]);
     *colour1 = word_number(words[1]);
     *colour2 = word_number(words[2]);
+    return 1;
+}
+
+// The same differences of a* and b* as they are, where the exported functions round them.
+
+int lab_to_dh(const CIELABCOORD *first, const CIELABCOORD *second, int rounded, double *delta_h)
+{
+    if (rounded)
+        return LabToDH(first, second, delta_h);
+    *delta_h = vantrel::delta_h(*first, *second, false);
+    return 1;
+}
+int lab_to_de_cmc(const CIELABCOORD *sample, const CIELABCOORD *reference, double l, double c,
+                  int rounded, double *delta_e)
+{
+    if (rounded || l == 0 || c == 0)
+        return LabToDEcmc(sample, reference, l, c, delta_e);
+    *delta_e = vantrel::delta_e_cmc(*sample, *reference, l, c, false);
+    return 1;
+}
+
+int unpack_rgb(int packed, int *rgb)
+{
+    if (packed < 0 || packed > 0xFFFFFF)
+        return 0;
+    for (int i = 0; i < 3; ++i)
+        rgb[i] = packed >> 8 * i & 0xFF;
     return 1;
 }
 
@@ -91,14 +121,15 @@ constexpr Row kRows[] = {
     ROW(LabToXYZ, "lab_to_xyz", "(3),()->(3)"),
     ROW(ReflToRGB, "refl_to_rgb", "(31),()->()"),
     ROW(XYZtoRGB, "xyz_to_rgb", "(3)->()"),
+    row<unpack_rgb>("", "unpack_rgb", "()->(3)"),
     ROW(CalcLabch, "calc_labch", "(31),()->(5)"),
     ROW(LabToDElab, "lab_to_de_lab", "(3),(3)->()"),
-    ROW(LabToDH, "lab_to_dh", "(3),(3)->()"),
+    row<lab_to_dh>("LabToDH", "lab_to_dh", "(3),(3),()->()"),
     ROW(LabToDE94, "lab_to_de94", "(3),(3),(),()->()"),
     ROW(CIELChToDE94, "cielch_to_de94", "(3),(3),(),()->()"),
     ROW(LabToDE2000, "lab_to_de2000", "(3),(3),(),()->()"),
     ROW(LabToDE2000Ex, "lab_to_de2000_ex", "(3),(3),(),(),()->()"),
-    ROW(LabToDEcmc, "lab_to_de_cmc", "(3),(3),(),()->()"),
+    row<lab_to_de_cmc>("LabToDEcmc", "lab_to_de_cmc", "(3),(3),(),(),()->()"),
     ROW(ReflToDIN6172, "refl_to_din6172", "(31),(31),(),()->()"),
     row<verbal_color_difference>("VerbalColorDifference", "verbal_color_difference",
                                  "(31),(31),(),()->(),(),()"),

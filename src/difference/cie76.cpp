@@ -13,10 +13,10 @@ double delta_e76(const Lab &first, const Lab &second)
                      square(first.b - second.b));
 }
 
-double delta_h(const Lab &first, const Lab &second)
+double delta_h(const Lab &first, const Lab &second, bool round)
 {
-    const Lch lch1 = lch_from_lab(rounded(first));
-    const Lch lch2 = lch_from_lab(rounded(second));
+    const Lch lch1 = lch_from_lab(round ? rounded(first) : first);
+    const Lch lch2 = lch_from_lab(round ? rounded(second) : second);
     const double dH = std::sqrt(std::fabs(square(second.a - first.a) + square(second.b - first.b) -
                                           square(lch2.C - lch1.C)));
     double dh = lch2.h - lch1.h;

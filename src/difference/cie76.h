@@ -8,7 +8,7 @@ namespace vantrel {
 double delta_e76(const Lab &first, const Lab &second);
 
 /// Signed CIE 1976 ΔH*ab (CIE 15): positive when the second hue lies counter-clockwise of the
-/// first.
-double delta_h(const Lab &first, const Lab &second);
+/// first. Chroma and hue are those of rounded a* and b*, or of a* and b* as they are.
+double delta_h(const Lab &first, const Lab &second, bool round = true);
 
 } // namespace vantrel

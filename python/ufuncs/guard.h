@@ -1,0 +1,19 @@
+// What stands around the loop of every function: the settings of its thread, and the rows that hold
+// what is no reading.
+#pragma once
+
+#include "loop.h"
+
+#include <string>
+
+struct Guard {
+    decltype(Row::loop) loop = nullptr;
+    Layout layout = {};
+    int inputs = 0;
+    int core_dimensions = 0; ///< of different names
+    std::string types = {};  ///< of every operand
+};
+
+/// A row with a not-a-number among its inputs is missing in every output, and so is one with an
+/// infinity that would give a finite result. `data` is the Guard.
+void guarded(char **rows, const npy_intp *dimensions, const npy_intp *steps, void *data);
