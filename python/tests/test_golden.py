@@ -122,6 +122,20 @@ def as_tuple(result):
     return result if isinstance(result, tuple) else (result,)
 
 
+def is_missing(output):
+    output = np.asarray(output)
+    mark = {"f": np.isnan(output), "b": output == 0, "u": output == 2**32 - 1, "U": output == ""}
+    return bool(np.all(mark.get(output.dtype.kind, output == -1)))
+
+
+def is_no_reading(given, expected, names):
+    """Whether the package gives no result: of a NaN, and of an infinity where one is finite."""
+    numbers = np.concatenate([np.ravel(v).astype(float) for v in given if v is not None])
+    found = [e for e in expected if e not in ("*", "null", "unwritten")]
+    finite = any(e[0] == '"' or np.any(np.isfinite(values(e, names))) for e in found)
+    return np.any(np.isnan(numbers)) or finite and np.any(np.isinf(numbers))
+
+
 def check_line(words, names):
     tolerance = None
     if words[-2] == "~":
@@ -139,6 +153,8 @@ def check_line(words, names):
     )
     if words[verb] == "=" or result_wanted:
         if c_name.startswith("Set"):
+            if c_name.startswith("SetH") and any(v is None for v in given):  # they move shapes along
+                function = getattr(vantrel.ufuncs, function.__name__)
             try:
                 function(*given)
             except ValueError:
@@ -149,6 +165,10 @@ def check_line(words, names):
         except ValueError:
             assert expected[0] == "0" and result_wanted, "refused"
             return
+        if not c_name.startswith("Get") and is_no_reading(given, expected, names):
+            assert all(map(is_missing, outputs)), f"{outputs} and not missing"
+            assert result_wanted or not function(*given, ok=True)[-1]
+            return
         check_outputs(outputs, expected, tolerance, names)
         if not result_wanted and not c_name.startswith("Get"):
             assert function(*given, ok=True)[-1]
@@ -158,12 +178,10 @@ def check_line(words, names):
         except ValueError:
             return
         assert not ok
-        for output in outputs:
-            assert (
-                np.all(np.isnan(output)) if np.asarray(output).dtype.kind == "f" else output == -1
-            )
+        assert all(map(is_missing, outputs))
 
 
+@pytest.mark.filterwarnings("ignore:all reflectances are at most")
 def test_every_line():
     failures, count = [], 0
     for where, words, names in lines():

@@ -28,6 +28,7 @@ from ._colour import (
     refl_to_rgb,
     refl_to_xyz,
     refl_to_xyzs,
+    unpack_rgb,
     xyz_to_cie_yxy,
     xyz_to_cielab,
     xyz_to_cielch,
@@ -133,7 +134,9 @@ from ._constants import (
     set_hexachrome_constants,
     set_hifi_constants,
     set_spectralx_constants,
+    settings,
 )
+from ._wavelengths import resample
 
 __version__ = ufuncs.version
 __all__ = [name for name in dir() if not name.startswith("_")]  # what help() lists

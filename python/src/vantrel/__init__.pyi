@@ -58,10 +58,10 @@ __all__ = [
     "refl_to_din6172", "refl_to_dot_area", "refl_to_dot_gain", "refl_to_hue_gray",
     "refl_to_hunter_lab", "refl_to_pol_intercept", "refl_to_print_contrast",
     "refl_to_refl_density", "refl_to_rgb", "refl_to_trap", "refl_to_white_e313_98",
-    "refl_to_xyz", "refl_to_xyzs", "saunderson", "set_achromatic_constants",
-    "set_hexachrome_constants", "set_hifi_constants", "set_spectralx_constants", "ufuncs",
-    "un_saunderson", "verbal_color_difference", "xyz_to_cie_yxy", "xyz_to_cielab",
-    "xyz_to_cielch", "xyz_to_cieluv", "xyz_to_rgb", "xyz_to_xyz"
+    "refl_to_xyz", "refl_to_xyzs", "resample", "saunderson", "set_achromatic_constants",
+    "set_hexachrome_constants", "set_hifi_constants", "set_spectralx_constants", "settings",
+    "ufuncs", "un_saunderson", "unpack_rgb", "verbal_color_difference", "xyz_to_cie_yxy",
+    "xyz_to_cielab", "xyz_to_cielch", "xyz_to_cieluv", "xyz_to_rgb", "xyz_to_xyz"
 ]
 
 class IllumObs(IntEnum):
@@ -255,13 +255,16 @@ def lab_to_de94(
     None, ok: bool = False
 ) -> Any: ...
 def lab_to_de_cmc(
-    sample: _Colours, reference: _Colours, l: _Numbers = 2, c: _Numbers = 1, *, out: Any = None,
-    ok: bool = False
+    sample: _Colours, reference: _Colours, l: _Numbers = 2, c: _Numbers = 1, rounded: _Integers
+    = True, *, out: Any = None, ok: bool = False
 ) -> Any: ...
 def lab_to_de_lab(
     lab1: _Colours, lab2: _Colours, *, out: Any = None, ok: bool = False
 ) -> Any: ...
-def lab_to_dh(lab1: _Colours, lab2: _Colours, *, out: Any = None, ok: bool = False) -> Any: ...
+def lab_to_dh(
+    lab1: _Colours, lab2: _Colours, rounded: _Integers = True, *, out: Any = None, ok: bool =
+    False
+) -> Any: ...
 def lab_to_xyz(
     lab: _Colours, illum_obs: _Illuminant = 'D50_2DEG', *, out: Any = None, ok: bool = False
 ) -> Any: ...
@@ -395,6 +398,7 @@ def refl_to_xyz(
 def refl_to_xyzs(
     spectra: _Spectra, illum_obs: _Illuminant = 'D50_2DEG', *, out: Any = None, ok: bool = False
 ) -> Any: ...
+def resample(values: Any, wavelengths: Any) -> Any: ...
 def saunderson(refl: _Numbers, k1: _Numbers, k2: _Numbers, *, out: Any = None) -> Any: ...
 def set_achromatic_constants(L1: Any, L2: Any, C1: Any, C2: Any) -> None: ...
 def set_hexachrome_constants(
@@ -406,7 +410,11 @@ def set_hifi_constants(
 def set_spectralx_constants(
     tolerance: Any, reserved: Any, centre: Any, inner: Any, outer: Any
 ) -> None: ...
+def settings(
+    *, hifi: Any = None, hexachrome: Any = None, spectralx: Any = None, achromatic: Any = None
+) -> Any: ...
 def un_saunderson(refl: _Numbers, k1: _Numbers, k2: _Numbers, *, out: Any = None) -> Any: ...
+def unpack_rgb(packed: _Integers, *, out: Any = None, ok: bool = False) -> Any: ...
 def verbal_color_difference(
     standard: _Spectra, sample: _Spectra, illum_obs: _Illuminant = 'D50_2DEG', selector:
     _Integers = 0, *, ok: bool = False

@@ -1,14 +1,17 @@
 """What each kind of argument accepts, and how it is handed to a ufunc.
 
-A declaration names the kind of an argument as its annotation. Arrays of other libraries are handed
-on as they are; what has not been computed yet is not looked into.
+Arrays of other libraries are handed on as they are; what has not been computed yet is not looked
+into.
 """
 
+import difflib
+import warnings
 from enum import IntEnum
 
 import numpy as np
 
 from ._enums import IllumObs, Response, Status
+from ._wavelengths import bands_of_pandas, bands_of_xarray, numbers_of_pandas
 
 BANDS = 31
 MISSING = np.empty(0)  # what a ufunc takes for a spectrum that is not there
@@ -34,12 +37,18 @@ def as_array(value, name):
     """An array of numbers."""
     if isinstance(value, (int, float)):
         return value
-    value = as_numpy(value)
+    if library_of(value) == "pint":
+        raise ValueError(
+            f"{name}: quantities with units are not taken; hand over their magnitude, of spectra "
+            "in percent: quantity.to('percent').magnitude"
+        )
+    value = numbers_of_pandas(value) if library_of(value) == "pandas" else as_numpy(value)
     dtype = getattr(value, "dtype", type(value).__name__)
     if getattr(dtype, "kind", None) not in tuple("fiub"):
         raise ValueError(f"{name}: numbers are needed, not {dtype}")
-    if isinstance(value, np.ma.MaskedArray):
-        if np.ma.is_masked(value):
+    inside = value.variable.data if library_of(value) == "xarray" else value
+    if isinstance(getattr(inside, "_meta", inside), np.ma.MaskedArray):
+        if is_lazy(value) or np.ma.is_masked(value):
             raise ValueError(f"{name}: masked values have no result; fill them first")
         value = value.data
     return value.astype(np.float64) if dtype.itemsize > 8 else value
@@ -59,47 +68,78 @@ def as_integers(value, name):
     return value.astype(np.int64) if hasattr(value, "astype") else int(value)
 
 
+FRACTION = 1.5  # paper with optical brightener reads up to 1.4
+
+
+def _reaches(values):
+    """Whether any value is above what fractions are; looks at a few first."""
+    some = values.flat[:4096], values.flat[-1:]
+    return any(np.any(v > FRACTION) for v in (*some, values)) or not np.any(values > 0)
+
+
+def warn_of_fractions(spectra, level):
+    """Where all spectra of a call look like fractions of 1."""
+    known = [np.asarray(s) for s in spectra if s is not MISSING and not is_lazy(s)]
+    if len(known) == len(spectra) and known and not any(map(_reaches, known)):
+        warnings.warn(
+            f"all reflectances are at most {FRACTION}: they are in percent here; multiply "
+            "fractions by 100",
+            stacklevel=level,
+        )
+
+
+# The response that reads an ink.
+_INKS = {"CYAN": "RED", "MAGENTA": "GREEN", "YELLOW": "BLUE", "BLACK": "VISUAL", "KEY": "VISUAL"}
+
+
 class Index:
     """A member of an enumeration, its name, its number, or an array of these."""
 
     def __init__(self, enumeration, allowed=None):
         self.members = enumeration
-        self.allowed = frozenset(enumeration if allowed is None else allowed)
+        self.allowed = sorted(enumeration if allowed is None else allowed)
         self.numbers = {member.name: int(member) for member in enumeration}
         for name, number in list(self.numbers.items()):
             self.numbers.setdefault(name.removesuffix("_STATUS").removesuffix("_RESPONSE"), number)
 
+    def hint(self, item):
+        """The name that was meant, where that is plain."""
+        word = str(item).strip().upper().replace("-", "_").replace(" ", "_")
+        if word in self.numbers:
+            return f"; {word!r} is meant?"
+        if self.members is Response and word in _INKS:
+            return f"; {word.lower()} is read through {_INKS[word]!r}"
+        begun = [m.name for m in self.members if word and m.name.startswith(word + "_")]
+        close = begun or difflib.get_close_matches(word, self.numbers, 2)
+        return f"; {' or '.join(map(repr, close))} is meant?" if close else ""
+
     def number(self, item, name):
-        foreign = isinstance(item, IntEnum) and not isinstance(item, self.members)
         if isinstance(item, str) and item in self.numbers:
             return self.numbers[item]
-        if isinstance(item, (int, np.integer)) and not foreign:
+        foreign = isinstance(item, IntEnum) and not isinstance(item, self.members)
+        number = isinstance(item, (int, np.integer)) or isinstance(item, float) and item % 1 == 0
+        if number and not foreign and not isinstance(item, (bool, np.bool_)):
             return int(item)
-        known = ", ".join(member.name for member in self.members)
-        raise ValueError(f"{name}: there is no {item!r} among {known}")
+        hint = self.hint(item) if isinstance(item, str) else ""
+        known = ", ".join(self.members(number).name for number in self.allowed)
+        raise ValueError(f"{name}: there is no {item!r}{hint} among {known}")
 
     def convert(self, value, name):
-        if isinstance(value, (str, int, np.integer)):
+        if isinstance(value, (str, int, np.integer, np.bool_)):
             return self.number(value, name)
-        array = as_numpy(value)
-        if isinstance(array, np.ndarray) and array.dtype.kind in "UTO":
-            items = np.asarray(value, dtype=object)  # a list may hold names and numbers
-            numbers = [self.number(item, name) for item in items.flat]
-            array = np.array(numbers, dtype=np.int64).reshape(items.shape)
+        # what is in a list keeps its type: a member of another enumeration, say
+        array = as_numpy(value) if hasattr(value, "dtype") else np.array(value, dtype=object)
+        if isinstance(array, np.ndarray) and array.dtype.kind in "UTOb":
+            numbers = [self.number(item, name) for item in array.astype(object).flat]
+            array = np.array(numbers, dtype=np.int64).reshape(array.shape)
         return as_integers(array, name)
 
     def check(self, value, name):
-        if isinstance(value, int):
-            unknown = value not in self.allowed
-            wrong = value
-        else:
-            numbers = np.asarray(value)
-            bad = ~np.isin(numbers, list(self.allowed))
-            unknown = bad.any()
-            wrong = numbers[bad].flat[0] if unknown else None
-        if unknown:
-            members = [str(int(member)) for member in sorted(self.allowed)]
-            raise ValueError(f"{name}: {wrong} is not one of {', '.join(members)}")
+        numbers = np.asarray(value)
+        bad = ~np.isin(numbers, self.allowed)
+        if bad.any():
+            known = ", ".join(f"{self.members(number).name} ({number})" for number in self.allowed)
+            raise ValueError(f"{name}: {numbers[bad].flat[0]} is not one of {known}")
 
 
 RESPONSES = Index(Response)
@@ -143,7 +183,11 @@ def check_inks(value, name):
         raise ValueError(f"{name}: one to three inks are needed, not {value.shape[-2]}")
 
 
-def convert(kind, value, name):
+def is_spectral(kind, core):
+    return kind in ("Spectra", "OptionalSpectra") or kind == "Inks" and core[-1] == str(BANDS)
+
+
+def convert(kind, core, value, name):
     """An argument as its ufunc takes it."""
     if value is None:
         if kind == "OptionalSpectra":
@@ -158,6 +202,10 @@ def convert(kind, value, name):
         return value
     if kind == "Integers":
         return as_integers(value, name)
+    if is_spectral(kind, core):
+        by_wavelength = {"xarray": bands_of_xarray, "pandas": bands_of_pandas}
+        bands = by_wavelength.get(library_of(value))
+        value = bands(value, name) if bands else value
     value = as_array(value, name)
     if kind == "Inks":
         check_inks(value, name)

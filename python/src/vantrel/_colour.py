@@ -4,6 +4,7 @@ XYZ has Y = 100 for the perfect white; angles are in degrees.
 """
 
 from ._function import function
+from ._kinds import Colours, Illuminant, Integers, Spectra
 
 
 @function("xyz")
@@ -106,6 +107,11 @@ def refl_to_rgb(spectra: "Spectra", illum_obs: "Illuminant" = "D50_2DEG"):
 @function("rgb")
 def xyz_to_rgb(xyz: "Colours"):
     """Screen preview of XYZ: red | green << 8 | blue << 16 of one fixed display, clipped."""
+
+
+@function("rgb")
+def unpack_rgb(packed: "Integers"):
+    """Red, green and blue, 0 to 255 each, of packed colours such as refl_to_rgb() gives."""
 
 
 @function("labch")

@@ -1,4 +1,6 @@
-"""What can be set, in this process, for all threads: do not set it while others compute."""
+"""What can be set, in this process, for all threads."""
+
+import contextlib
 
 import numpy as np
 
@@ -23,19 +25,28 @@ def _read(getter, *sizes):
     return tuple(arrays)
 
 
+def _place(setter, getter, wavelengths, shapes):
+    """Places bands; the C function would leave the weights where they were without a shape."""
+    if wavelengths is None:
+        raise ValueError("wavelengths: None is not accepted")
+    wavelengths = _doubles(wavelengths, len(shapes), "wavelengths")
+    given = [_doubles(shape, 7, name) for name, shape in shapes.items()]
+    before, *had = getter()
+    setter(wavelengths, *given)
+    now = getter()[0]
+    moved = (now != before) & [shape is None for shape in given]
+    setter(now, *[shape if m and np.isfinite(shape).all() else None for m, shape in zip(moved, had)])
+
+
 def set_hifi_constants(wavelengths, shape1=None, shape2=None, shape3=None):
     """Places the three HiFi bands and rebuilds their rows of `den_weight`.
 
     `wavelengths`: three centres in nm, cut to their band; one outside 430 to below 680, or NaN,
     leaves its band as it was. `shape1` to `shape3`: seven relative weights around each centre in
-    steps of 10 nm; None moves the centre alone.
+    steps of 10 nm; None takes the shape that the band has along to the new centre.
     """
-    if wavelengths is None:
-        raise ValueError("wavelengths: None is not accepted")
-    shapes = zip((shape1, shape2, shape3), ("shape1", "shape2", "shape3"))
-    _ufuncs.set_hifi_constants(
-        _doubles(wavelengths, 3, "wavelengths"), *[_doubles(s, 7, name) for s, name in shapes]
-    )
+    shapes = {"shape1": shape1, "shape2": shape2, "shape3": shape3}
+    _place(_ufuncs.set_hifi_constants, get_hifi_constants, wavelengths, shapes)
 
 
 def get_hifi_constants():
@@ -45,13 +56,8 @@ def get_hifi_constants():
 
 def set_hexachrome_constants(wavelengths, shape1=None, shape2=None):
     """Places the two Hexachrome bands; as set_hifi_constants()."""
-    if wavelengths is None:
-        raise ValueError("wavelengths: None is not accepted")
-    _ufuncs.set_hexachrome_constants(
-        _doubles(wavelengths, 2, "wavelengths"),
-        _doubles(shape1, 7, "shape1"),
-        _doubles(shape2, 7, "shape2"),
-    )
+    shapes = {"shape1": shape1, "shape2": shape2}
+    _place(_ufuncs.set_hexachrome_constants, get_hexachrome_constants, wavelengths, shapes)
 
 
 def get_hexachrome_constants():
@@ -105,3 +111,27 @@ def set_achromatic_constants(L1, L2, C1, C2):
 def get_achromatic_constants():
     """The line of is_chromatic(): (L1, L2, C1, C2)."""
     return _numbers(_ufuncs.get_achromatic_constants, 4)
+
+
+@contextlib.contextmanager
+def settings(*, hifi=None, hexachrome=None, spectralx=None, achromatic=None):
+    """Sets constants for the calls inside of a `with`, and all as they were after it.
+
+    Each takes the arguments of its set_ function, in a tuple. `den_weight` is restored too. They
+    hold for all threads of the process, and for what Dask arrays are asked inside, wherever and
+    whenever it is computed.
+    """
+    kept = _ufuncs.get_settings()
+    asked = {
+        set_hifi_constants: hifi,
+        set_hexachrome_constants: hexachrome,
+        set_spectralx_constants: spectralx,
+        set_achromatic_constants: achromatic,
+    }
+    try:
+        for set_constants, values in asked.items():
+            if values is not None:
+                set_constants(*values)
+        yield
+    finally:
+        _ufuncs.set_settings(kept)

@@ -5,16 +5,32 @@ import operator
 
 import numpy as np
 
+from . import _ufuncs
 from ._declared import evaluate
 
+_DEFAULTS = _ufuncs.get_settings()
 
-def _on_block(name, ok, missing, *blocks):
-    """What evaluate() gives for one block, as a tuple; a core arrives in lists of its one piece."""
+
+def _settings():
+    """The settings that a block is made under; b"" for the defaults."""
+    now = _ufuncs.get_settings()
+    return b"" if now == _DEFAULTS else now
+
+
+def _on_block(name, ok, missing, settings, *blocks):
+    """What evaluate() gives for one block, as a tuple; a core arrives in lists of its one piece.
+
+    The settings are those of the process that asked for the block, which may be far away.
+    """
 
     def only(block):
         return only(block[0]) if isinstance(block, list) else block
 
-    results = evaluate(name, ok, *map(only, blocks), missing=missing)
+    _ufuncs.use_settings(settings or _DEFAULTS)
+    try:
+        results = evaluate(name, ok, *map(only, blocks), missing=missing)
+    finally:
+        _ufuncs.use_settings(None)
     return results if isinstance(results, tuple) else (results,)
 
 
@@ -37,7 +53,7 @@ def on_dask(declared, values, ok):
     names = [f"loop{d}" for d in range(depth)]
     indices = [(*names[depth - loop :], *core) for loop, core in zip(loops, cores)]
     tuples = da.blockwise(
-        functools.partial(_on_block, declared.name, ok, missing),
+        functools.partial(_on_block, declared.name, ok, missing, _settings()),
         names,
         *(part for pair in zip(arrays, indices) for part in pair),
         concatenate=False,

@@ -5,6 +5,18 @@ is given, its own density is subtracted; None measures absolutely.
 """
 
 from ._function import function
+from ._kinds import (
+    CCRStatus,
+    Colours,
+    Illuminant,
+    Integers,
+    Numbers,
+    OptionalSpectra,
+    Reading,
+    ResponseName,
+    Spectra,
+    StatusName,
+)
 
 
 @function("number")

@@ -1,6 +1,7 @@
 """Colour differences."""
 
 from ._function import function
+from ._kinds import Colours, Illuminant, Integers, Numbers, Spectra
 
 
 @function("delta_e")
@@ -9,11 +10,13 @@ def lab_to_de_lab(lab1: "Colours", lab2: "Colours"):
 
 
 @function("delta_h")
-def lab_to_dh(lab1: "Colours", lab2: "Colours"):
+def lab_to_dh(lab1: "Colours", lab2: "Colours", rounded: "Integers" = True):
     """Signed CIE 1976 hue difference (CIE 15).
 
     Positive when the second hue lies from 0 up to and including 180 degrees counter-clockwise of
-    the first; chroma and hue are those of cielab_to_cielch().
+    the first. Chroma and hue are those of cielab_to_cielch(), of a* and b* rounded to two decimals,
+    which moves the difference of close colours by up to 0.23; with `rounded=False` of a* and b* as
+    they are.
     """
 
 
@@ -44,10 +47,17 @@ def lab_to_de2000_ex(
 
 
 @function("delta_e")
-def lab_to_de_cmc(sample: "Colours", reference: "Colours", l: "Numbers" = 2, c: "Numbers" = 1):
+def lab_to_de_cmc(
+    sample: "Colours",
+    reference: "Colours",
+    l: "Numbers" = 2,
+    c: "Numbers" = 1,
+    rounded: "Integers" = True,
+):
     """CMC(l:c) (ISO 105-J03); every weight follows the reference alone.
 
-    2:1 is for acceptability, 1:1 for perceptibility. A weight of 0 is refused.
+    2:1 is for acceptability, 1:1 for perceptibility. A weight of 0 is refused. Chroma and hue are
+    those of a* and b* rounded to two decimals; with `rounded=False` of a* and b* as they are.
     """
 
 

@@ -33,8 +33,14 @@ def function(*outputs):
     def make(declaration):
         declared = DECLARED[declaration.__name__] = Declared(declaration, list(outputs))
 
+        plain = declared.name not in WORDS
+
         @functools.wraps(declaration)
         def call(*args, out=None, ok=False, **kwargs):
+            if out is None and ok is False and not kwargs and plain:
+                values = declared.prepare_again(args)
+                if values is not None:
+                    return declared.ufunc(*values)
             if ok and declared.flagged is None:
                 raise TypeError(f"{declared.name}() refuses no row and has no ok=")
             values = declared.prepare(declared.bind(args, kwargs))
@@ -43,7 +49,8 @@ def function(*outputs):
         text = inspect.cleandoc(declaration.__doc__ or "")  # python -OO drops them
         subject = (declaration.__globals__["__doc__"] or "").partition("\n\n")[2].strip()
         shapes = f"Shapes: {declared.signature}, broadcast as NumPy does."
-        source = f"C function: {_ufuncs.c_names[declared.name]}."
+        c_name = _ufuncs.c_names[declared.name]
+        source = f"C function: {c_name}." if c_name else ""
         keywords = {"out": (None, _OUT), "ok": (False, _OK)}
         if declared.name in WORDS:
             del keywords["out"]

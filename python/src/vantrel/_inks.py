@@ -5,6 +5,7 @@ order of printing. Spectra are in percent.
 """
 
 from ._function import function
+from ._kinds import Colours, Illuminant, Inks, Integers, Numbers, OptionalSpectra, Spectra
 
 
 @function("refl")

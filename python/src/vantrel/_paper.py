@@ -1,6 +1,7 @@
 """What a paper looks like, and how far a pair moves apart with the light."""
 
 from ._function import function
+from ._kinds import Colours, Illuminant, Spectra, WhitenessIlluminant
 
 
 @function("brightness")

@@ -7,6 +7,17 @@ refused: a filter adds no light.
 """
 
 from ._function import function
+from ._kinds import (
+    HueStatus,
+    Integers,
+    Numbers,
+    OptionalSpectra,
+    OptionalTargets,
+    Reading,
+    ResponseName,
+    Spectra,
+    StatusName,
+)
 
 
 @function("refl")

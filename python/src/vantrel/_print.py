@@ -6,6 +6,16 @@ None, absolutely.
 """
 
 from ._function import function
+from ._kinds import (
+    HueStatus,
+    InkResponse,
+    Integers,
+    Numbers,
+    OptionalSpectra,
+    Reading,
+    Spectra,
+    StatusName,
+)
 
 
 @function("dot_area")

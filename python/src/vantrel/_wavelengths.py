@@ -1,0 +1,171 @@
+"""Spectra at wavelengths of their own, brought to 400, 410, ... 700 nm."""
+
+import re
+
+import numpy as np
+
+NM = np.arange(400.0, 701.0, 10.0)
+_HALF_WIDTH = 10  # of the triangle that a band is
+_TOLERANCE = 0.001  # of a wavelength, in nm
+_NAMES = {"nm", "wavelength", "wavelengths", "wl", "lambda", "band", "bands"}
+_LABEL = re.compile(r"(?:[A-Za-z_ ]*[A-Za-z_ ])?(\d{3,4}(?:\.\d+)?) ?(?:nm)?", re.IGNORECASE)
+
+
+def _fault(nm):
+    """Why ascending wavelengths do not give every band; None where they do."""
+    if not len(nm) or nm[0] > 400 + _TOLERANCE or nm[-1] < 700 - _TOLERANCE:
+        return "the range is too short"
+    steps = np.diff(nm)
+    wide = int(np.argmax(steps))
+    if steps[wide] > _HALF_WIDTH + _TOLERANCE:
+        return f"no value between {nm[wide]:g} and {nm[wide + 1]:g} nm"
+    if steps.max() - steps.min() > 1 + _TOLERANCE:  # names may be rounded: 380, 383, 387, 390 nm
+        return f"the steps are uneven, {steps.min():g} to {steps.max():g} nm"
+    off = nm[0] % 10
+    if steps.max() > _HALF_WIDTH - _TOLERANCE and min(off, 10 - off) > _TOLERANCE:
+        return f"no value at 400 nm, but at {nm[0]:g} and {nm[1]:g} nm"
+    return None
+
+
+def _parts(wavelengths, name):
+    """For each band the values that it is a mean of and their weights: two arrays (parts, 31)."""
+    nm = np.asarray(wavelengths, dtype=np.float64)
+    if nm.ndim != 1:
+        raise ValueError(f"{name}: wavelengths are a list of numbers, not of shape {nm.shape}")
+    order = np.argsort(nm, kind="stable")
+    twice = np.diff(nm[order]) < _TOLERANCE
+    if np.any(twice):
+        raise ValueError(f"{name}: {nm[order][1:][twice][0]:g} nm occurs twice")
+    reach = _HALF_WIDTH - _TOLERANCE
+    order = order[(nm[order] > 400 - reach) & (nm[order] < 700 + reach)]
+    fault = _fault(nm[order])
+    if fault or not np.all(np.isfinite(nm)):
+        raise ValueError(
+            f"{name}: {fault or 'a wavelength is not a number'} among the {nm.size} wavelengths; "
+            "every 10 nm from 400 to 700 is needed, or finer steps"
+        )
+    weights = 1 - np.abs(nm[order, None] - NM) / _HALF_WIDTH
+    weights[weights > 1 - _TOLERANCE / _HALF_WIDTH] = 1
+    weights[weights < _TOLERANCE / _HALF_WIDTH] = 0
+    taken = [np.flatnonzero(w) for w in weights.T]
+    count = max(len(t) for t in taken)
+    indices = np.array([np.pad(order[t], (0, count - len(t)), "edge") for t in taken]).T
+    shares = np.array(
+        [np.pad(w[t] / np.sum(w[t]), (0, count - len(t))) for t, w in zip(taken, weights.T)]
+    ).T
+    return indices, shares
+
+
+def to_bands(values, wavelengths, name):
+    """The bands of an array whose last dimension lies at these wavelengths."""
+    if np.shape(values)[-1:] != np.shape(wavelengths):
+        raise ValueError(
+            f"{name}: {np.shape(values)[-1:]} values do not lie at {np.size(wavelengths)} wavelengths"
+        )
+    indices, shares = _parts(wavelengths, name)
+    if len(indices) == 1:
+        return values[..., indices[0]]
+    return sum(values[..., i] * share for i, share in zip(indices, shares))
+
+
+def wavelengths_of(labels):
+    """The wavelengths in nm that labels carry: numbers, or "400", "R400", "SPECTRAL_NM400"; or None.
+
+    0, 1, 2, ... are places, and no wavelengths.
+    """
+    labels = np.asarray(labels)
+    if labels.ndim != 1 or not labels.size:
+        return None
+    if labels.dtype.kind in "OUT":
+        found = [_LABEL.fullmatch(str(label).strip()) for label in labels]
+        return np.array([float(m.group(1)) for m in found]) if all(found) else None
+    if labels.dtype.kind not in "fiu" or np.array_equal(labels, np.arange(labels.size)):
+        return None
+    return labels.astype(np.float64)
+
+
+def _is_spectral(name, labels):
+    nm = None if labels is None else wavelengths_of(labels)
+    several = nm is not None and nm.size > 1 and 300 <= nm.min() and nm.max() <= 1100
+    return several and nm.max() > 600 or str(name).lower() in _NAMES
+
+
+def _refuse_turned(dims, last, name):
+    """Spectra that lie along another dimension than the last one."""
+    if not _is_spectral(*last):
+        for dim, labels in dims:
+            if _is_spectral(dim, labels):
+                raise ValueError(
+                    f"{name}: the wavelengths lie along {dim!r}; spectra are the last dimension: "
+                    "transpose the array"
+                )
+
+
+def bands_of_xarray(value, name):
+    """A labelled array of spectra, at 400, 410, ... 700 nm where it has wavelengths."""
+    labels = [(d, value.coords[d].values if d in value.coords else None) for d in value.dims]
+    if not labels:
+        return value
+    _refuse_turned(labels[:-1], labels[-1], name)
+    dim, last = labels[-1]
+    nm = None if last is None else wavelengths_of(last)
+    if nm is None or np.array_equal(nm, NM):
+        return value
+    kept = {c: v for c, v in value.coords.items() if dim not in v.dims}
+    bands = to_bands(value.variable.data, nm, name)
+    return type(value)(bands, {**kept, dim: NM}, value.dims, name=value.name)
+
+
+def bands_of_pandas(value, name):
+    """The array of a table whose columns, or of a series whose index, may be wavelengths."""
+    axes = value.axes
+    _refuse_turned([("index", axis) for axis in axes[:-1]], ("columns", axes[-1]), name)
+    nm = wavelengths_of(axes[-1])
+    array = numbers_of_pandas(value)
+    return array if nm is None or np.array_equal(nm, NM) else to_bands(array, nm, name)
+
+
+def numbers_of_pandas(value):
+    array = np.asarray(value)
+    if array.dtype.kind != "O":
+        return array
+    try:
+        return value.to_numpy(dtype=np.float64, na_value=np.nan)  # of the types with missing values
+    except (TypeError, ValueError):
+        return array
+
+
+def resample(values, wavelengths):
+    """Spectra at 400, 410, ... 700 nm out of values at wavelengths of their own.
+
+    The wavelengths, in nm and in any order, are evenly spaced, 10 nm apart or finer, from 400 to
+    700 nm at least. A band is the mean of the values less than 10 nm away, weighted by a triangle,
+    the passband of spectral data at 10 nm (ISO 13655); of steps of 10 nm it is the value itself.
+
+    Parameters
+    ----------
+    values : array_like (..., n)
+        Spectra, in percent.
+    wavelengths : array_like (n,)
+        Where they lie, in nm.
+
+    Returns
+    -------
+    spectra : array (..., 31)
+
+    Raises
+    ------
+    ValueError
+        Where the wavelengths do not give every band.
+
+    Examples
+    --------
+    >>> vantrel.resample(np.arange(36.0), np.arange(380, 731, 10))[:3]
+    array([2., 3., 4.])
+    """
+    from ._arguments import as_array, warn_of_fractions
+
+    array = as_array(values, "values")
+    array = to_bands(array if hasattr(array, "shape") else np.asarray(array), wavelengths, "values")
+    warn_of_fractions([array], 3)
+    return array
