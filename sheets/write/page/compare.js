@@ -38,21 +38,21 @@ function unpaired(result) {
 function pairColumns(result) {
   const labelOf = labeller(result);
   const lab = (side, short) => ['L*', 'a*', 'b*'].map((label, i) =>
-    ({ id: `${side}-${label}`, label: `${label} ${short}`, decimals: 2, title: `${label}, ${side}`,
+    ({ label: `${label} ${short}`, decimals: 2, title: `${label}, ${side}`,
       value: (pair) => pair[side].lab[i] }));
   return [
-    { id: 'name', label: 'Patch', value: (pair) => pair.name },
+    { label: 'Patch', value: (pair) => pair.name },
     ...result.formulas.map((formula) =>
-      ({ id: formula, label: labelOf(formula), decimals: 2, value: (pair) => pair[formula] })),
-    { id: 'verbal', label: 'Difference', value: (pair) => pair.verbal },
-    { id: 'metamerism', label: 'Metam.', decimals: 2, value: (pair) => pair.metamerism,
+      ({ label: labelOf(formula), decimals: 2, value: (pair) => pair[formula] })),
+    { label: 'Difference', value: (pair) => pair.verbal },
+    { label: 'Metam.', decimals: 2, value: (pair) => pair.metamerism,
       title: `Metamerism between ${result.illuminant} and ${result.second_illuminant}` },
     ...lab('reference', 'ref.'), ...lab('sample', 'sample'),
-    { id: 'response', label: 'Resp.', title: 'Response that reads the reference',
+    { label: 'Resp.', title: 'Response that reads the reference',
       value: (pair) => pair.response },
-    { id: 'density', label: 'D ref.', decimals: 3, title: 'Density over the paper, reference',
+    { label: 'D ref.', decimals: 3, title: 'Density over the paper, reference',
       value: (pair) => pair.reference.density },
-    { id: 'density_difference', label: 'ΔD', decimals: 3, title: 'Density, sample less reference',
+    { label: 'ΔD', decimals: 3, title: 'Density, sample less reference',
       value: (pair) => pair.density_difference },
   ];
 }

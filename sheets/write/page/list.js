@@ -15,8 +15,8 @@ export function listPage({ list, rows }) {
     searchTable({
       caption: 'All rows', noun: 'row', rows,
       columns: [
-        { id: first, label: label(first), value: (row) => String(row[first]) },
-        ...fields.map((field) => ({ id: field, label: label(field), value: (row) => row[field],
+        { label: label(first), value: (row) => String(row[first]) },
+        ...fields.map((field) => ({ label: label(field), value: (row) => row[field],
           decimals: rows.some((row) => typeof row[field] === 'number') ? digits(rows, field)
             : undefined })),
       ],

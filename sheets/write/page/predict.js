@@ -7,11 +7,11 @@ const nameOf = (prediction) => prediction.measured?.name ??
   prediction.inks.map((ink) => `${ink.name} ${ink.percent} %`).join(' + ');
 
 export function predictPage(result) {
-  const lab = (side) => ['L*', 'a*', 'b*'].map((label, i) => ({ id: `${side}-${label}`,
+  const lab = (side) => ['L*', 'a*', 'b*'].map((label, i) => ({
     label: `${label} ${side}`, decimals: 2, value: (row) => row[side]?.lab[i] }));
-  const density = (side) => ({ id: `${side}-density`, label: `D ${side}`, decimals: 3,
+  const density = (side) => ({ label: `D ${side}`, decimals: 3,
     title: `Density over the paper, ${side}`, value: (row) => row[side]?.density });
-  const difference = (side) => ({ id: `${side}-de`, label: `ΔE00 ${side}`, decimals: 2,
+  const difference = (side) => ({ label: `ΔE00 ${side}`, decimals: 2,
     title: 'CIEDE2000 to the measurement', value: (row) => row[side].de00_to_measured });
   return [
     h('h1', {}, 'Predicted overprints'),
@@ -23,7 +23,7 @@ export function predictPage(result) {
       caption: 'All combinations',
       noun: 'combination',
       columns: [
-        { id: 'name', label: 'Combination', value: nameOf },
+        { label: 'Combination', value: nameOf },
         ...['halftone', 'film', 'measured'].flatMap((side) => [...lab(side), density(side),
           ...(side === 'measured' ? [] : [difference(side)])]),
       ],

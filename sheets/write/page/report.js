@@ -13,6 +13,9 @@ const mostDevices = 16;
 const largest = (patches, field) => patches.reduce((best, patch) =>
   (patch[field] !== null && !(best && best[field] >= patch[field]) ? patch : best), null);
 
+// The percent of an ink that a patch names; an ink may have any name, that of a method too.
+const valueOf = ({ device }, ink) => (Object.hasOwn(device, ink) ? device[ink] : undefined);
+
 // The first patch of each ink by itself at 100 %. An ink that a patch does not name is at 0.
 function solidsOf(sheet) {
   const inks = new Set(sheet.inks);
@@ -27,9 +30,10 @@ function solidsOf(sheet) {
 }
 
 // The patch of a solid, and its ink where the name of the patch, a number say, does not tell it.
-const processInks = { CMYK_C: 'Cyan', CMYK_M: 'Magenta', CMYK_Y: 'Yellow', CMYK_K: 'Black' };
+const processInks = new Map([['CMYK_C', 'Cyan'], ['CMYK_M', 'Magenta'], ['CMYK_Y', 'Yellow'],
+  ['CMYK_K', 'Black']]);
 function solidName(ink, patch) {
-  const called = processInks[ink] ?? ink;
+  const called = processInks.get(ink) ?? ink;
   return patch.toLowerCase().includes(called.toLowerCase()) ? patch : `${patch} (${called})`;
 }
 
@@ -144,24 +148,24 @@ function attributeTables(sheet) {
 
 function columnsOf(sheet) {
   const number = (label, field, decimals, title) =>
-    ({ id: field, label, decimals, title, value: (patch) => patch[field] });
-  const part = (label, id, field, i) =>
-    ({ id, label, decimals: 2, value: (patch) => patch[field][i] });
+    ({ label, decimals, title, value: (patch) => patch[field] });
+  const part = (label, field, i) =>
+    ({ label, decimals: 2, value: (patch) => patch[field][i] });
   const devices = [...new Set(sheet.patches.flatMap((patch) => Object.keys(patch.device)))];
-  const whole = (field) => sheet.patches.every(({ device }) => Number.isInteger(device[field] ?? 0));
+  const whole = (field) => sheet.patches.every((patch) => Number.isInteger(valueOf(patch, field) ?? 0));
   const inks = ({ device }) => Object.entries(device).filter(([, percent]) => percent !== 0)
     .map(([ink, percent]) => `${ink} ${percent}`).join(', ') || null;
   return [
-    { id: 'name', label: 'Patch', value: (patch) => patch.name },
-    { id: 'id', label: 'Id', value: (patch) => patch.id },
-    ...devices.length > mostDevices ? [{ id: 'inks', label: 'Inks', value: inks }]
-      : devices.map((field) => ({ id: field, label: field.replace(/^CMYK_/, ''),
+    { label: 'Patch', value: (patch) => patch.name },
+    { label: 'Id', value: (patch) => patch.id },
+    ...devices.length > mostDevices ? [{ label: 'Inks', value: inks }]
+      : devices.map((field) => ({ label: field.replace(/^CMYK_/, ''),
         decimals: whole(field) ? 0 : 1, title: `${field}, percent`,
-        value: (patch) => patch.device[field] })),
-    part('L*', 'L', 'lab', 0), part('a*', 'a', 'lab', 1), part('b*', 'b', 'lab', 2),
-    part('C*', 'C', 'lch', 1), part('h', 'h', 'lch', 2),
+        value: (patch) => valueOf(patch, field) })),
+    part('L*', 'lab', 0), part('a*', 'lab', 1), part('b*', 'lab', 2),
+    part('C*', 'lch', 1), part('h', 'lch', 2),
     number('ΔE00', 'de00_to_paper', 2, 'Colour difference to the paper, CIEDE2000'),
-    { id: 'response', label: 'Resp.', title: 'Response that reads the patch',
+    { label: 'Resp.', title: 'Response that reads the patch',
       value: (patch) => patch.response },
     number('D', 'density', 3, 'Density over the paper'),
     number('Area', 'dot_area', 2, 'Dot area, percent'),

@@ -24,7 +24,7 @@ const features = () => tableFeatures({
   paginatedRowModel: createPaginatedRowModel(),
 });
 
-// columns: [{ id, label, title, value: (row) => text or number or null, decimals }, …], of which the
+// columns: [{ label, title, value: (row) => text or number or null, decimals }, …], of which the
 // first names the row; `rgb` and `text` give the row's swatch and what the search looks into. With
 // `onChoose` the rows can be chosen.
 export function searchTable({ caption, noun, columns, rows, rgb, text, onChoose }) {
@@ -33,24 +33,24 @@ export function searchTable({ caption, noun, columns, rows, rgb, text, onChoose 
   const table = constructTable({
     features: features(),
     data: rows,
-    columns: used.map((column) => ({
-      id: column.id,
+    columns: used.map((column, i) => ({
+      id: String(i),
       accessorFn: (row) => column.value(row) ?? undefined,
       sortUndefined: 'last',
       sortFn: (a, b, id) => compare(a.getValue(id), b.getValue(id)),
       sortDescFirst: false,
     })),
-    getColumnCanGlobalFilter: (column) => column.id === used[0].id,
+    getColumnCanGlobalFilter: (column) => column.id === '0',
     globalFilterFn: (row, id, wanted) => text(row.original).toLowerCase().includes(wanted),
     initialState: { pagination: { pageIndex: 0, pageSize } },
     autoResetPageIndex: false,
   });
   const chosen = new Set();
 
-  const heads = used.map((column) => h('th', { scope: 'col',
+  const heads = used.map((column, i) => h('th', { scope: 'col',
     class: typeof column.decimals === 'number' ? 'number' : null },
   h('button', { type: 'button', title: column.title ?? null,
-    onclick: () => { table.getColumn(column.id).toggleSorting(); table.firstPage(); show(); } },
+    onclick: () => { table.getColumn(String(i)).toggleSorting(); table.firstPage(); show(); } },
   column.label)));
   const body = h('tbody');
   const status = h('p', { class: 'count', role: 'status' });
@@ -85,7 +85,7 @@ export function searchTable({ caption, noun, columns, rows, rgb, text, onChoose 
     const page = printed && all.length <= mostPrinted ? all : table.getRowModel().rows;
     body.replaceChildren(...page.map((row) => rowOf(row.original)));
     used.forEach((column, i) => {
-      const order = table.getColumn(column.id).getIsSorted();
+      const order = table.getColumn(String(i)).getIsSorted();
       heads[i].setAttribute('aria-sort',
         order === 'asc' ? 'ascending' : order === 'desc' ? 'descending' : 'none');
     });

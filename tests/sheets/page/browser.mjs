@@ -1,15 +1,19 @@
-// Runs the program and opens what it writes in Chromium.
+// Runs commands as one types them, in a folder with the sheets, and opens the pages that they write
+// in Chromium.
 
-import { execFileSync } from 'node:child_process';
-import { mkdtempSync, rmSync, writeFileSync } from 'node:fs';
+import { spawnSync } from 'node:child_process';
+import { cpSync, mkdtempSync, rmSync, writeFileSync } from 'node:fs';
 import { createRequire } from 'node:module';
 import { tmpdir } from 'node:os';
-import { join, resolve } from 'node:path';
+import { delimiter, dirname, join, resolve } from 'node:path';
+import { fileURLToPath } from 'node:url';
 
 const { MODULES, VANTREL } = process.env; // node_modules and the program
 const { chromium } = createRequire(resolve(MODULES, 'any.js'))('playwright-core');
-export const example = process.env.EXAMPLE;
-export const folder = mkdtempSync(join(tmpdir(), 'vantrel_page_'));
+const root = fileURLToPath(new URL('../../..', import.meta.url));
+const folder = mkdtempSync(join(tmpdir(), 'vantrel_page_'));
+for (const sheets of ['tests/sheets/data', 'examples'])
+  cpSync(join(root, sheets), folder, { recursive: true });
 const browser = await chromium.launch({ executablePath: process.env.CHROMIUM ?? '/usr/bin/chromium' });
 
 export async function end() {
@@ -17,28 +21,17 @@ export async function end() {
   rmSync(folder, { recursive: true });
 }
 
-function vantrel(words, format) {
-  try {
-    return execFileSync(VANTREL, [...words, '--format', format], { encoding: 'utf8', maxBuffer: 1e9 });
-  } catch (failure) {
-    if (failure.status === 1 && failure.stdout) return failure.stdout; // out of tolerance
-    throw failure;
-  }
-}
-export const json = (words) => JSON.parse(vantrel(words, 'json'));
-
-export function file(name, text) {
-  const path = join(folder, name);
-  writeFileSync(path, text);
-  return path;
-}
-
 export const small = { width: 390, height: 844 };
 export const wide = { width: 1280, height: 900 };
 
-// Opens the page of a command; `page.complaints` gathers errors, console lines and requests.
-export async function open(words, viewport = wide, colorScheme = 'light') {
-  const url = `file://${file('page.html', vantrel(words, 'html'))}`;
+// `page.complaints` gathers errors, console lines and requests.
+export async function open(command, viewport = wide, colorScheme = 'light') {
+  const PATH = dirname(resolve(VANTREL)) + delimiter + process.env.PATH;
+  const { status, stdout, stderr } = spawnSync('sh', ['-c', `${command} --format html`],
+    { cwd: folder, encoding: 'utf8', maxBuffer: 1e9, env: { ...process.env, PATH } });
+  if (status > 1 || !stdout) throw new Error(`${command}: ${status} ${stderr}`);
+  writeFileSync(join(folder, 'page.html'), stdout);
+  const url = `file://${join(folder, 'page.html')}`;
   const page = await browser.newPage({ viewport, colorScheme, deviceScaleFactor: 1 });
   page.complaints = [];
   page.on('console', (line) => page.complaints.push(line.text()));
