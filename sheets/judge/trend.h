@@ -1,0 +1,49 @@
+// What a series of readings says about a process: its mean, its spread and its drift.
+#pragma once
+
+#include <cstddef>
+#include <optional>
+#include <vector>
+
+namespace vantrel::sheets {
+
+// A reading for each sheet, or nothing where the sheet has none.
+using Series = std::vector<std::optional<double>>;
+
+// Least squares through (sheet, reading), sheets counted from 0.
+struct Drift {
+    double slope = 0;       // a sheet
+    double uncertainty = 0; // of the slope: half the width of its 95 % interval
+    double first = 0;       // of the line, at the first sheet
+
+    double at(double sheet) const { return first + slope * sheet; }
+    bool significant() const { return slope > uncertainty || -slope > uncertainty; }
+};
+
+struct Trend {
+    std::size_t count = 0;
+    double mean = 0;
+    std::optional<double> deviation; // standard deviation of the sample; from two readings on
+    std::optional<Drift> drift;      // from three readings on
+};
+
+// Nothing where the series has no reading. NIST/SEMATECH e-Handbook of Statistical Methods, 1.3.5.1
+// and 4.1.4; intervals by Student's t.
+std::optional<Trend> trend_of(const Series &series);
+
+// What a reading may be; a missing limit does not bound it.
+struct Limits {
+    std::optional<double> low, high;
+
+    bool hold(double value) const { return !(low && value < *low) && !(high && value > *high); }
+};
+
+// The first sheet whose reading is outside, counted from 0.
+std::optional<std::size_t> first_outside(const Series &series, const Limits &limits);
+
+// The sheet at which the drift leaves the limits, of the next `ahead` after `sheets`; nothing where
+// it does not, is not significant, or is outside by the last sheet.
+std::optional<std::size_t> leaves_at(const Drift &drift, const Limits &limits, std::size_t sheets,
+                                     std::size_t ahead);
+
+} // namespace vantrel::sheets
