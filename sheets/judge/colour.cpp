@@ -3,6 +3,11 @@
 #include <fmt/format.h>
 
 namespace vantrel::sheets {
+namespace {
+
+bool has_ten_degrees(ILLUM_OBS illuminant) { return illuminant % 2 == 1; }
+
+} // namespace
 
 CIELABCOORD lab_of(const Spectrum &refl, ILLUM_OBS illuminant)
 {
@@ -13,8 +18,8 @@ CIELABCOORD lab_of(const Spectrum &refl, ILLUM_OBS illuminant)
 
 Colour colour_of(const Spectrum &refl, ILLUM_OBS illuminant)
 {
-    const bool ten_degrees = illuminant % 2 == 1;
-    return {lab_of(refl, illuminant), preview_of(refl, ten_degrees ? D65_10DEG : D65_2DEG)};
+    return {lab_of(refl, illuminant),
+            preview_of(refl, has_ten_degrees(illuminant) ? D65_10DEG : D65_2DEG)};
 }
 
 Rgb preview_of(const Spectrum &refl, ILLUM_OBS illuminant)
@@ -23,6 +28,13 @@ Rgb preview_of(const Spectrum &refl, ILLUM_OBS illuminant)
     ReflToRGB(refl.data(), illuminant, &rgb);
     const auto level = [&](int shift) { return static_cast<std::uint8_t>(rgb >> shift & 0xFF); };
     return {level(0), level(8), level(16)};
+}
+
+ILLUM_OBS usual_second(ILLUM_OBS first)
+{
+    if (first == A_2DEG || first == A_10DEG)
+        return has_ten_degrees(first) ? D65_10DEG : D65_2DEG;
+    return has_ten_degrees(first) ? A_10DEG : A_2DEG;
 }
 
 CIELCHCOORD lch_of(const CIELABCOORD &lab)

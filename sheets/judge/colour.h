@@ -27,6 +27,10 @@ Colour colour_of(const Spectrum &refl, ILLUM_OBS illuminant);
 // As it looks under this illuminant to an eye that is adapted to the display.
 Rgb preview_of(const Spectrum &refl, ILLUM_OBS illuminant);
 
+// The usual illuminant to tell metamerism beside another: A beside daylight and lamps, D65 beside
+// A, with the same observer.
+ILLUM_OBS usual_second(ILLUM_OBS first);
+
 CIELCHCOORD lch_of(const CIELABCOORD &lab);
 double delta_e00(const CIELABCOORD &first, const CIELABCOORD &second);
 std::string hex(const Rgb &rgb); // #rrggbb

@@ -1,7 +1,10 @@
 #include "judge/ink.h"
 
 #include "judge/densitometer.h"
+#include "judge/inks.h"
 #include "judge/names.h"
+
+#include <utility>
 
 namespace vantrel::sheets {
 namespace {
@@ -38,27 +41,32 @@ IlluminantReading under_illuminant(const Spectrum &refl, const Spectrum *other, 
 
 } // namespace
 
-PatchStudy study_of(const Measurement &sheet, const Inks &inks, const Request &request,
-                    const Patch &patch, const Patch *other)
+PatchStudy study_of(const Measurement &sheet, const InkRequest &request)
 {
-    const CIELABCOORD paper = lab_of(request.paper->refl, request.illuminant);
+    std::vector<std::string> warnings = reading_warnings(sheet);
+    const Paper paper = paper_of(sheet, request.paper, warnings);
+    const Patch &patch = patch_named(sheet, request.patch);
+    const Patch *other = request.against.empty() ? nullptr : &patch_named(sheet, request.against);
+    const Inks inks(sheet, request.order);
+    const Conditions conditions{inks, paper, request.illuminant, request.status};
     PatchStudy out{.file = sheet.file,
                    .illuminant = request.illuminant,
                    .status = request.status,
-                   .paper = request.paper->name,
-                   .patch = patch_report(patch, inks, request, paper),
-                   .as_paper = paper_report(patch, request.illuminant),
+                   .paper = paper.name,
+                   .patch = patch_report(patch, conditions),
+                   .as_paper = paper_report({patch.name, patch.refl}, request.illuminant),
                    .statuses = {},
                    .illuminants = {},
-                   .against = {}};
+                   .against = {},
+                   .warnings = std::move(warnings)};
     for (int status = 0; status < NUM_STATUSES; ++status)
-        out.statuses[status] = under_status(patch.refl, request.paper->refl, status);
+        out.statuses[status] = under_status(patch.refl, paper.refl, status);
     for (int i = 0; i < NUM_ILLUM_OBS; ++i)
         out.illuminants[i] = under_illuminant(patch.refl, other ? &other->refl : nullptr,
                                               request.illuminant, static_cast<ILLUM_OBS>(i));
     if (other) {
         out.against.emplace();
-        out.against->patch = patch_report(*other, inks, request, paper);
+        out.against->patch = patch_report(*other, conditions);
         out.against->de00 = delta_e00(out.against->patch.colour.lab, out.patch.colour.lab);
         ReflToABErrorWeights(other->refl.data(), patch.refl.data(), request.illuminant,
                              out.against->a.data(), out.against->b.data());

@@ -3,7 +3,6 @@
 
 #include "judge/densitometer.h"
 #include "judge/report.h"
-#include "write/flat.h"
 
 #include <array>
 #include <optional>
@@ -43,15 +42,19 @@ struct PatchStudy {
     std::array<StatusReading, NUM_STATUSES> statuses;
     std::array<IlluminantReading, NUM_ILLUM_OBS> illuminants;
     std::optional<Against> against;
+    std::vector<std::string> warnings;
 };
 
-// `other` may be null.
-PatchStudy study_of(const Measurement &sheet, const Inks &inks, const Request &request,
-                    const Patch &patch, const Patch *other);
+struct InkRequest {
+    std::string patch;   // by name or id
+    std::string against; // likewise; none where it is empty
+    ILLUM_OBS illuminant = D50_2DEG;
+    int status = E_STATUS;
+    std::string paper;              // by name or id; the usual one where it is empty
+    std::vector<std::string> order; // of printing, as Inks takes it
+};
 
-// The output formats.
-void write_table(const PatchStudy &study, const Sink &sink, bool colour);
-void write_json(const PatchStudy &study, const Sink &sink);
-std::vector<Flat> flat_of(const PatchStudy &study);
+// Throws RequestError.
+PatchStudy study_of(const Measurement &sheet, const InkRequest &request);
 
 } // namespace vantrel::sheets

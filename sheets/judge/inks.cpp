@@ -12,7 +12,7 @@ Inks::Inks(const Measurement &sheet, const std::vector<std::string> &order) : sh
 {
     for (const Patch &patch : sheet.patches)
         for (const auto &[field, percent] : patch.device)
-            if (!field.starts_with("RGB_") && numbers.emplace(field, fields.size()).second)
+            if (is_ink(field) && numbers.emplace(field, fields.size()).second)
                 fields.push_back(field);
 
     std::vector<std::size_t> sequence;

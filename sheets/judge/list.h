@@ -1,17 +1,26 @@
 // What `vantrel list` prints: the names that the program knows, and the library's tables.
 #pragma once
 
-#include "write/flat.h"
+#include <vantrel.h>
 
+#include <cstddef>
 #include <optional>
 #include <string>
+#include <variant>
 #include <vector>
 
 namespace vantrel::sheets {
 
+struct ListColumn {
+    std::string name;
+    std::string cgats;                                                  // its name in CGATS text
+    std::variant<std::vector<std::string>, std::vector<double>> values; // for each row
+};
+
 struct List {
     std::string what;
-    Flat flat;
+    std::vector<ListColumn> columns; // equally long
+    std::size_t rows() const;
 };
 
 List list_illuminants();
@@ -20,10 +29,5 @@ List list_statuses();
 List list_responses(const std::optional<int> &wanted); // of one status, or of all
 // Filters scaled to a peak of 100, all of a status or one; throws RequestError where there is none.
 List list_weights(int status, const std::optional<int> &wanted);
-
-// The output formats.
-void write_table(const List &list, const Sink &sink, bool colour);
-void write_json(const List &list, const Sink &sink);
-std::vector<Flat> flat_of(const List &list);
 
 } // namespace vantrel::sheets

@@ -1,16 +1,17 @@
 #include "judge/predict.h"
 
+#include "judge/inks.h"
+#include "judge/paper.h"
 #include "read/text.h"
 
 #include <fmt/format.h>
 
 #include <algorithm>
 #include <cmath>
+#include <utility>
 
 namespace vantrel::sheets {
 namespace {
-
-constexpr std::size_t kMostInks = 3;
 
 struct Layer {
     const Patch *solid;
@@ -38,7 +39,7 @@ Estimate estimate(Model *model, const std::vector<Layer> &layers, const Spectrum
     return out;
 }
 
-Prediction prediction_of(const std::vector<Layer> &layers, const Patch &paper, ILLUM_OBS illuminant,
+Prediction prediction_of(const std::vector<Layer> &layers, const Paper &paper, ILLUM_OBS illuminant,
                          int status, const Patch *patch)
 {
     Prediction out;
@@ -108,10 +109,8 @@ std::vector<Layer> layers_of(const Tints &tints, const Inks &inks)
     return layers;
 }
 
-} // namespace
-
-Predictions predict(const Measurement &sheet, const Inks &inks, const Patch &paper,
-                    ILLUM_OBS illuminant, int status, const std::vector<std::string> &wishes)
+std::vector<Layer> layers_named(const std::vector<std::string> &wishes, const Measurement &sheet,
+                                const Inks &inks)
 {
     if (wishes.size() > kMostInks)
         throw RequestError{fmt::format("{} inks; {} are the most", wishes.size(), kMostInks)};
@@ -124,21 +123,13 @@ Predictions predict(const Measurement &sheet, const Inks &inks, const Patch &pap
                     fmt::format("the ink {} is named twice", in_quotes(layer.solid->name))};
         layers.push_back(layer);
     }
-    return {.file = sheet.file,
-            .illuminant = illuminant,
-            .status = status,
-            .paper = paper.name,
-            .all = {prediction_of(layers, paper, illuminant, status, measured_of(layers, inks))}};
+    return layers;
 }
 
-Predictions predict_overprints(const Measurement &sheet, const Inks &inks, const Patch &paper,
-                               ILLUM_OBS illuminant, int status)
+// Every measured overprint of two or three inks.
+void predict_overprints(Predictions &out, const Measurement &sheet, const Inks &inks,
+                        const Paper &paper)
 {
-    Predictions out{.file = sheet.file,
-                    .illuminant = illuminant,
-                    .status = status,
-                    .paper = paper.name,
-                    .all = {}};
     for (const Patch &patch : sheet.patches) {
         const auto tints = inks.tints_of(patch);
         if (!tints || tints->size() < 2)
@@ -147,21 +138,34 @@ Predictions predict_overprints(const Measurement &sheet, const Inks &inks, const
         if (layers.empty())
             ++out.left_out;
         else
-            out.all.push_back(prediction_of(layers, paper, illuminant, status, &patch));
+            out.all.push_back(prediction_of(layers, paper, out.illuminant, out.status, &patch));
     }
     if (out.all.empty())
         throw RequestError{fmt::format(
             "{} holds no overprint of two or three inks beside their solids; name inks with --ink",
             sheet.file)};
-    return out;
 }
 
-std::string inks_of(const Prediction &prediction, std::size_t kWidestName)
+} // namespace
+
+Predictions predict(const Measurement &sheet, const PredictRequest &request)
 {
-    std::string out;
-    for (const InkTint &ink : prediction.inks)
-        out += fmt::format("{}{} {} %", out.empty() ? "" : " + ", cut(ink.name, kWidestName),
-                           ink.percent);
+    const Inks inks(sheet, request.order);
+    std::vector<std::string> warnings = reading_warnings(sheet);
+    const Paper paper = paper_of(sheet, request.paper, warnings);
+    Predictions out{.file = sheet.file,
+                    .illuminant = request.illuminant,
+                    .status = request.status,
+                    .paper = paper.name,
+                    .all = {},
+                    .warnings = std::move(warnings)};
+    if (request.inks.empty()) {
+        predict_overprints(out, sheet, inks, paper);
+    } else {
+        const std::vector<Layer> layers = layers_named(request.inks, sheet, inks);
+        out.all.push_back(prediction_of(layers, paper, request.illuminant, request.status,
+                                        measured_of(layers, inks)));
+    }
     return out;
 }
 

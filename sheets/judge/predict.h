@@ -3,15 +3,17 @@
 
 #include "judge/colour.h"
 #include "judge/densitometer.h"
-#include "judge/inks.h"
 #include "read/measurement.h"
-#include "write/flat.h"
 
+#include <cstddef>
 #include <optional>
 #include <string>
 #include <vector>
 
 namespace vantrel::sheets {
+
+// As many solids as the models take.
+constexpr std::size_t kMostInks = 3;
 
 struct InkTint {
     std::string name; // of the solid's patch
@@ -46,23 +48,20 @@ struct Predictions {
     std::string paper;
     std::vector<Prediction> all;
     std::size_t left_out = 0; // measured overprints that cannot be predicted
+    std::vector<std::string> warnings;
 };
 
-// The combination that `wishes` name, each NAME:PERCENT, in the order of printing; throws
-// RequestError.
-Predictions predict(const Measurement &sheet, const Inks &inks, const Patch &paper,
-                    ILLUM_OBS illuminant, int status, const std::vector<std::string> &wishes);
+struct PredictRequest {
+    ILLUM_OBS illuminant = D50_2DEG;
+    int status = E_STATUS;
+    std::string paper;              // by name or id; the usual one where it is empty
+    std::vector<std::string> order; // of printing, as Inks takes it
+    // The combination to predict, each NAME:PERCENT, in the order of printing; every measured
+    // overprint of two or three inks where it is empty.
+    std::vector<std::string> inks;
+};
 
-// Every measured overprint of two or three inks; throws RequestError where there is none.
-Predictions predict_overprints(const Measurement &sheet, const Inks &inks, const Patch &paper,
-                               ILLUM_OBS illuminant, int status);
-
-// "Magenta 100 40 % + Yellow 100 70 %", each name cut to a number of characters.
-std::string inks_of(const Prediction &prediction, std::size_t kWidestName);
-
-// The output formats.
-void write_table(const Predictions &predictions, const Sink &sink, bool colour);
-void write_json(const Predictions &predictions, const Sink &sink);
-std::vector<Flat> flat_of(const Predictions &predictions);
+// Throws RequestError.
+Predictions predict(const Measurement &sheet, const PredictRequest &request);
 
 } // namespace vantrel::sheets

@@ -6,6 +6,7 @@
 #include <fmt/format.h>
 
 #include <map>
+#include <utility>
 
 namespace vantrel::sheets {
 namespace {
@@ -48,65 +49,19 @@ void measure_inks(PatchReport &row, const Patch &patch, const Inks &inks,
     }
 }
 
-} // namespace
-
-PatchReport patch_report(const Patch &patch, const Inks &inks, const Request &request,
-                         const CIELABCOORD &paper)
+MetamerismReport metamerism_of(const Paper &paper, const Patch &second,
+                               const ReportRequest &request)
 {
-    PatchReport row;
-    row.id = patch.id;
-    row.name = patch.name;
-    row.device = patch.device;
-    row.refl = patch.refl;
-    row.colour = colour_of(patch.refl, request.illuminant);
-    row.to_paper = delta_e00(paper, row.colour.lab);
-    row.lch = lch_of(row.colour.lab);
-
-    const Densitometer densitometer(request.paper->refl, request.status);
-    const DensityReading reading = densitometer.read(patch.refl);
-    row.response = reading.response;
-    row.density = reading.density;
-    measure_inks(row, patch, inks, densitometer, request.n_factor);
-    return row;
-}
-
-PaperReport paper_report(const Patch &paper, ILLUM_OBS illuminant)
-{
-    PaperReport out{.name = paper.name,
-                    .lab = lab_of(paper.refl, illuminant),
-                    .brightness = 0,
-                    .whiteness = {},
-                    .no_whiteness = {}};
-    ReflToBrightness(paper.refl.data(), &out.brightness);
-    double whiteness = 0;
-    if (ReflToWhiteE313_98(paper.refl.data(), illuminant, &whiteness))
-        out.whiteness = whiteness;
-    else if (illuminant < C_2DEG || illuminant > D65_10DEG)
-        out.no_whiteness =
-            fmt::format("under {}: ASTM E313 has C, D50 and D65 alone", name_of(illuminant));
-    else
-        out.no_whiteness = "outside its limits, 40 < W < 5 Y - 280";
-    return out;
-}
-
-namespace {
-
-MetamerismReport metamerism_of(const Request &request)
-{
-    MetamerismReport out{.paper = request.second_paper->name,
-                         .illuminant = request.second_illuminant,
+    MetamerismReport out{.paper = second.name,
+                         .illuminant =
+                             request.second_illuminant.value_or(usual_second(request.illuminant)),
                          .sum = 0,
                          .din6172 = 0};
-    const double *first = request.paper->refl.data();
-    const double *second = request.second_paper->refl.data();
-    Metamerism(first, second, request.illuminant, out.illuminant, &out.sum);
-    ReflToDIN6172(first, second, request.illuminant, out.illuminant, &out.din6172);
+    Metamerism(paper.refl.data(), second.refl.data(), request.illuminant, out.illuminant, &out.sum);
+    ReflToDIN6172(paper.refl.data(), second.refl.data(), request.illuminant, out.illuminant,
+                  &out.din6172);
     return out;
 }
-
-} // namespace
-
-namespace {
 
 std::vector<ToneCurve> tone_curves(const Measurement &sheet, const Inks &inks,
                                    const std::vector<PatchReport> &rows)
@@ -140,23 +95,67 @@ std::vector<ToneCurve> tone_curves(const Measurement &sheet, const Inks &inks,
 
 } // namespace
 
-Report report_of(const Measurement &sheet, const Inks &inks, const Request &request)
+PatchReport patch_report(const Patch &patch, const Conditions &conditions)
 {
+    PatchReport row;
+    row.id = patch.id;
+    row.name = patch.name;
+    row.device = patch.device;
+    row.refl = patch.refl;
+    row.colour = colour_of(patch.refl, conditions.illuminant);
+    row.to_paper = delta_e00(lab_of(conditions.paper.refl, conditions.illuminant), row.colour.lab);
+    row.lch = lch_of(row.colour.lab);
+
+    const Densitometer densitometer(conditions.paper.refl, conditions.status);
+    const DensityReading reading = densitometer.read(patch.refl);
+    row.response = reading.response;
+    row.density = reading.density;
+    measure_inks(row, patch, conditions.inks, densitometer, conditions.n_factor);
+    return row;
+}
+
+PaperReport paper_report(const Paper &paper, ILLUM_OBS illuminant)
+{
+    PaperReport out{.name = paper.name,
+                    .lab = lab_of(paper.refl, illuminant),
+                    .brightness = 0,
+                    .whiteness = {},
+                    .no_whiteness = {}};
+    ReflToBrightness(paper.refl.data(), &out.brightness);
+    double whiteness = 0;
+    if (ReflToWhiteE313_98(paper.refl.data(), illuminant, &whiteness))
+        out.whiteness = whiteness;
+    else if (illuminant < C_2DEG || illuminant > D65_10DEG)
+        out.no_whiteness =
+            fmt::format("under {}: ASTM E313 has C, D50 and D65 alone", name_of(illuminant));
+    else
+        out.no_whiteness = "outside its limits, 40 < W < 5 Y - 280";
+    return out;
+}
+
+Report report_of(const Measurement &sheet, const ReportRequest &request)
+{
+    std::vector<std::string> warnings = reading_warnings(sheet);
+    const Paper paper = paper_of(sheet, request.paper, warnings);
+    std::optional<MetamerismReport> metamerism;
+    if (!request.second_paper.empty())
+        metamerism = metamerism_of(paper, patch_named(sheet, request.second_paper), request);
+    const Inks inks(sheet, request.order);
     Report report{.file = sheet.file,
                   .illuminant = request.illuminant,
                   .status = request.status,
                   .n_factor = request.n_factor,
                   .inks = inks.names(),
                   .source = sheet.source,
-                  .paper = paper_report(*request.paper, request.illuminant),
-                  .metamerism = {},
+                  .paper = paper_report(paper, request.illuminant),
+                  .metamerism = std::move(metamerism),
                   .patches = {},
-                  .tone_curves = {}};
-    if (request.second_paper)
-        report.metamerism = metamerism_of(request);
+                  .tone_curves = {},
+                  .warnings = std::move(warnings)};
+    const Conditions conditions{inks, paper, request.illuminant, request.status, request.n_factor};
     const Work work{request.tell, "Measuring", sheet.patches.size()};
     for (const Patch &patch : sheet.patches) {
-        report.patches.push_back(patch_report(patch, inks, request, report.paper.lab));
+        report.patches.push_back(patch_report(patch, conditions));
         work.done(report.patches.size());
     }
     report.tone_curves = tone_curves(sheet, inks, report.patches);

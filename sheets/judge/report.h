@@ -3,8 +3,8 @@
 
 #include "judge/colour.h"
 #include "judge/inks.h"
+#include "judge/paper.h"
 #include "read/measurement.h"
-#include "write/flat.h"
 
 #include <optional>
 #include <string>
@@ -13,14 +13,15 @@
 
 namespace vantrel::sheets {
 
-// What is asked of a sheet.
-struct Request {
+struct ReportRequest {
     ILLUM_OBS illuminant = D50_2DEG;
-    const Patch *paper = nullptr;
     int status = E_STATUS;
+    std::string paper; // by name or id; the usual one where it is empty
     double n_factor = 1;
-    const Patch *second_paper = nullptr; // metamerism is measured against it; may be null
-    ILLUM_OBS second_illuminant = A_2DEG;
+    std::vector<std::string> order; // of printing, as Inks takes it
+    // The patch that the paper's metamerism is told against, by name or id; none where it is empty.
+    std::string second_paper;
+    std::optional<ILLUM_OBS> second_illuminant; // the usual one where it is empty
     Tell tell{};
 };
 
@@ -83,18 +84,22 @@ struct Report {
     std::optional<MetamerismReport> metamerism;
     std::vector<PatchReport> patches;
     std::vector<ToneCurve> tone_curves; // of the inks that have measured tints
+    std::vector<std::string> warnings;
 };
 
-// One patch; `paper` is the colour of the paper.
-PatchReport patch_report(const Patch &patch, const Inks &inks, const Request &request,
-                         const CIELABCOORD &paper);
-PaperReport paper_report(const Patch &paper, ILLUM_OBS illuminant);
+// What the report of a patch rests on.
+struct Conditions {
+    const Inks &inks;
+    const Paper &paper;
+    ILLUM_OBS illuminant;
+    int status;
+    double n_factor = 1;
+};
+PatchReport patch_report(const Patch &patch, const Conditions &conditions);
 
-Report report_of(const Measurement &sheet, const Inks &inks, const Request &request);
+PaperReport paper_report(const Paper &paper, ILLUM_OBS illuminant);
 
-// The output formats.
-void write_table(const std::vector<Report> &sheets, const Sink &sink, bool colour);
-void write_json(const std::vector<Report> &sheets, const Sink &sink);
-std::vector<Flat> flat_of(const std::vector<Report> &sheets);
+// Throws RequestError.
+Report report_of(const Measurement &sheet, const ReportRequest &request);
 
 } // namespace vantrel::sheets

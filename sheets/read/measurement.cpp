@@ -6,6 +6,16 @@
 
 namespace vantrel::sheets {
 
+bool is_ink(std::string_view field) { return !field.starts_with("RGB_"); }
+
+std::vector<std::string> reading_warnings(const Measurement &sheet)
+{
+    std::vector<std::string> out;
+    for (const std::string &warning : sheet.warnings)
+        out.push_back(fmt::format("{}:{}", sheet.file, warning));
+    return out;
+}
+
 const Patch *find_patch(const Measurement &sheet, std::string_view name)
 {
     for (const Patch &patch : sheet.patches)

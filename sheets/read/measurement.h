@@ -93,6 +93,12 @@ struct RequestError {
     std::string message;
 };
 
+// Whether a device field is an ink: RGB is what a display or an image says.
+bool is_ink(std::string_view field);
+
+// The warnings with the file's name.
+std::vector<std::string> reading_warnings(const Measurement &sheet);
+
 // The first patch of this name, or else of this id; null where there is none.
 const Patch *find_patch(const Measurement &sheet, std::string_view name);
 

@@ -142,7 +142,7 @@ void Sheet::check_inks()
     double largest = 0;
     for (const Patch &patch : patches)
         for (const auto &[field, percent] : patch.device)
-            if (!field.starts_with("RGB_"))
+            if (is_ink(field))
                 largest = std::max(largest, percent);
     if (largest > 100 || (largest > 0 && largest <= 1))
         warn(0,

@@ -1,9 +1,9 @@
-// A comparison as table, JSON and rows.
+// A comparison as table, JSON and columns.
 
-#include "judge/compare.h"
 #include "judge/names.h"
 #include "read/text.h"
 #include "write/json_text.h"
+#include "write/result.h"
 #include "write/table_text.h"
 
 #include <fmt/format.h>
@@ -13,17 +13,6 @@
 
 namespace vantrel::sheets {
 namespace {
-
-// ΔE00, ΔE CMC(2:1), ΔE94 (kL 2, kC 1)
-std::string full_title(const Metric &metric)
-{
-    std::string title(title_of(metric.formula));
-    if (metric.formula == Formula::cmc)
-        return fmt::format("{}({:g}:{:g})", title, metric.lightness, metric.chroma);
-    if (metric.lightness == 1 && metric.chroma == 1)
-        return title;
-    return fmt::format("{} (kL {:g}, kC {:g})", title, metric.lightness, metric.chroma);
-}
 
 std::optional<double> density_difference(const PairReport &pair)
 {
@@ -42,7 +31,7 @@ void add_pairs(Lines &lines, const Comparison &comparison, const std::vector<std
         width = std::max(width, characters(cut(comparison.pairs[i].reference.name, widest - 1)));
     std::string head = fmt::format("{:<{}}{}", "Patch", width, colour ? "          " : "");
     for (const Metric &metric : comparison.metrics)
-        head += fmt::format("{:>7}", title_of(metric.formula));
+        head += fmt::format("{:>7}", names_of(metric.formula).title);
     lines.add(fmt::format("{}{:>7}{:>7}{:>7}{:>4}{:>7}{:>7}  {}", head, "ΔL*", "Δa*", "Δb*", "",
                           "ΔD", "Metam.", "Sample is"));
     for (const std::size_t i : chosen) {
@@ -68,7 +57,7 @@ void add_statistics(Lines &lines, const Comparison &comparison)
     lines.add(fmt::format("\n{:<22}{:>8}{:>8}{:>8}", "", "mean", "95 %", "largest"));
     for (std::size_t i = 0; i < comparison.metrics.size(); ++i) {
         const Statistics &all = comparison.statistics[i];
-        lines.add(fmt::format("{:<22}{:>8}{:>8}{:>8}  {}", full_title(comparison.metrics[i]),
+        lines.add(fmt::format("{:<22}{:>8}{:>8}{:>8}  {}", title_of(comparison.metrics[i]),
                               fixed(all.mean), fixed(all.p95), fixed(all.max),
                               cut(comparison.pairs[all.max_pair].reference.name, kWidestName)));
     }
@@ -94,7 +83,7 @@ void add_verdict(Lines &lines, const Comparison &comparison)
     const auto above = std::count_if(
         comparison.pairs.begin(), comparison.pairs.end(),
         [&](const PairReport &pair) { return !(pair.delta_e[0] <= *comparison.tolerance); });
-    const std::string title = full_title(comparison.metrics[0]);
+    const std::string title = title_of(comparison.metrics[0]);
     lines.add(comparison.passed()
                   ? fmt::format("\nPassed: no {} is above {:g}", title, *comparison.tolerance)
                   : fmt::format("\nFailed: {} of {} pairs are above {} {:g}", above,
@@ -117,7 +106,7 @@ Json pair_json(const PairReport &pair, const Comparison &comparison)
                 {"reference", side_json(pair.reference)},
                 {"sample", side_json(pair.sample)}};
     for (std::size_t i = 0; i < pair.delta_e.size(); ++i)
-        out[std::string(name_of(comparison.metrics[i].formula))] = pair.delta_e[i];
+        out[std::string(names_of(comparison.metrics[i].formula).key)] = pair.delta_e[i];
     out["verbal"] = pair.verbal;
     out["metamerism"] = pair.metamerism;
     out["din6172"] = pair.din6172;
@@ -129,7 +118,7 @@ Json pair_json(const PairReport &pair, const Comparison &comparison)
 
 } // namespace
 
-void write_table(const Comparison &comparison, const Sink &sink, bool colour)
+void write_table(const Comparison &comparison, const Sink &sink, const TableStyle &style)
 {
     std::string paper = cut(comparison.reference_paper, kWidestInText);
     if (comparison.sample_paper != comparison.reference_paper)
@@ -141,15 +130,15 @@ void write_table(const Comparison &comparison, const Sink &sink, bool colour)
     lines.add(fmt::format("{}, metamerism with {}; {} over {}", name_of(comparison.illuminant),
                           name_of(comparison.second_illuminant), status_name(comparison.status),
                           paper));
-    if (comparison.list_all) {
+    if (style.all_pairs) {
         std::vector<std::size_t> all(comparison.pairs.size());
         std::iota(all.begin(), all.end(), 0u);
         lines.add("");
-        add_pairs(lines, comparison, all, colour);
+        add_pairs(lines, comparison, all, style.colour);
     }
     lines.add(fmt::format("\nThe worst {} by {}", comparison.worst.size(),
-                          full_title(comparison.metrics[0])));
-    add_pairs(lines, comparison, comparison.worst, colour);
+                          title_of(comparison.metrics[0])));
+    add_pairs(lines, comparison, comparison.worst, style.colour);
     add_statistics(lines, comparison);
     add_unpaired(lines, comparison.reference, comparison.only_reference);
     add_unpaired(lines, comparison.sample, comparison.only_sample);
@@ -161,7 +150,7 @@ void write_json(const Comparison &comparison, const Sink &sink)
     Json names = Json::array(), weights = Json::object(), statistics = Json::object();
     for (std::size_t i = 0; i < comparison.metrics.size(); ++i) {
         const Metric &metric = comparison.metrics[i];
-        const std::string name(name_of(metric.formula));
+        const std::string name(names_of(metric.formula).key);
         const Statistics &all = comparison.statistics[i];
         names.push_back(name);
         if (metric.formula != Formula::de76)
@@ -196,44 +185,36 @@ void write_json(const Comparison &comparison, const Sink &sink)
 
 std::vector<Flat> flat_of(const Comparison &comparison)
 {
+    const std::vector<PairReport> &pairs = comparison.pairs;
     Flat flat;
     flat.description = fmt::format("{} against {}: {}, {}", comparison.sample, comparison.reference,
                                    name_of(comparison.illuminant), status_name(comparison.status));
-    flat.fields = {{"id", "SAMPLE_ID", true},
-                   {"name", "SAMPLE_NAME", true},
-                   {"reference_id", "REFERENCE_ID", true},
-                   {"reference_name", "REFERENCE_NAME", true}};
-    add_colour_fields(flat.fields, "");
-    add_colour_fields(flat.fields, "reference_");
-    constexpr const char *cgats[] = {"LAB_DE_2000", "LAB_DE_CMC", "LAB_DE_94", "LAB_DE"};
-    for (const Metric &metric : comparison.metrics)
-        flat.fields.push_back({std::string(name_of(metric.formula)),
-                               cgats[static_cast<std::size_t>(metric.formula)]});
-    flat.fields.push_back({"verbal", "VERBAL", true});
-    flat.fields.push_back({"metamerism", "METAMERISM"});
-    flat.fields.push_back({"din6172", "DIN6172"});
-    flat.fields.push_back({"response", "RESPONSE", true});
-    flat.fields.push_back({"density", "DENSITY"});
-    flat.fields.push_back({"reference_density", "REFERENCE_DENSITY"});
-    add_spectrum_fields(flat.fields);
-    flat.spectra = true;
-    flat.rows = comparison.pairs.size();
-    flat.row = [&comparison](std::size_t i) {
-        const PairReport &pair = comparison.pairs[i];
-        Row row = {pair.sample.id, pair.sample.name, pair.reference.id, pair.reference.name};
-        add_colour_cells(row, pair.sample.colour);
-        add_colour_cells(row, pair.reference.colour);
-        for (const double delta_e : pair.delta_e)
-            row.push_back(cell(delta_e));
-        row.push_back(pair.verbal);
-        row.push_back(cell(pair.metamerism));
-        row.push_back(cell(pair.din6172));
-        row.push_back(pair.response ? response_name(comparison.status, *pair.response) : "");
-        row.push_back(cell(pair.sample.density));
-        row.push_back(cell(pair.reference.density));
-        add_spectrum_cells(row, pair.sample.refl);
-        return row;
-    };
+    flat.rows = pairs.size();
+    flat.text("id", "SAMPLE_ID", [&pairs](std::size_t i) { return pairs[i].sample.id; });
+    flat.text("name", "SAMPLE_NAME", [&pairs](std::size_t i) { return pairs[i].sample.name; });
+    flat.text("reference_id", "REFERENCE_ID",
+              [&pairs](std::size_t i) { return pairs[i].reference.id; });
+    flat.text("reference_name", "REFERENCE_NAME",
+              [&pairs](std::size_t i) { return pairs[i].reference.name; });
+    flat.colour("", [&pairs](std::size_t i) { return &pairs[i].sample.colour; });
+    flat.colour("reference_", [&pairs](std::size_t i) { return &pairs[i].reference.colour; });
+    for (std::size_t k = 0; k < comparison.metrics.size(); ++k) {
+        const FormulaNames &names = names_of(comparison.metrics[k].formula);
+        flat.number(std::string(names.key), std::string(names.cgats),
+                    [&pairs, k](std::size_t i) { return pairs[i].delta_e[k]; });
+    }
+    flat.text("verbal", "VERBAL", [&pairs](std::size_t i) { return pairs[i].verbal; });
+    flat.number("metamerism", "METAMERISM",
+                [&pairs](std::size_t i) { return pairs[i].metamerism; });
+    flat.number("din6172", "DIN6172", [&pairs](std::size_t i) { return pairs[i].din6172; });
+    flat.text("response", "RESPONSE", [&comparison](std::size_t i) {
+        const auto &response = comparison.pairs[i].response;
+        return response ? response_name(comparison.status, *response) : "";
+    });
+    flat.number("density", "DENSITY", [&pairs](std::size_t i) { return pairs[i].sample.density; });
+    flat.number("reference_density", "REFERENCE_DENSITY",
+                [&pairs](std::size_t i) { return pairs[i].reference.density; });
+    flat.spectrum([&pairs](std::size_t i) -> const Spectrum & { return pairs[i].sample.refl; });
     return {flat};
 }
 

@@ -57,35 +57,41 @@ bool is_standard(const std::string &field)
            field.starts_with("RGB_") || (field.size() > 4 && field.substr(1, 4) == "CLR_");
 }
 
-// The fields of all tables, a new one behind the one that it follows in its own table.
-std::vector<Field> all_fields(const std::vector<Flat> &tables)
+// The columns of all tables, a new one behind the one that it follows in its own table.
+std::vector<const Column *> all_columns(const std::vector<Flat> &tables)
 {
-    std::vector<Field> all;
+    std::vector<const Column *> all;
     for (const Flat &table : tables) {
         std::size_t next = 0;
-        for (const Field &field : table.fields) {
-            auto place = std::find_if(all.begin(), all.end(),
-                                      [&](const Field &other) { return other.name == field.name; });
+        for (const Column &column : table.columns) {
+            auto place = std::find_if(all.begin(), all.end(), [&](const Column *other) {
+                return other->name == column.name;
+            });
             if (place == all.end())
-                place = all.insert(all.begin() + static_cast<std::ptrdiff_t>(next), field);
+                place = all.insert(all.begin() + static_cast<std::ptrdiff_t>(next), &column);
             next = static_cast<std::size_t>(place - all.begin()) + 1;
         }
     }
     return all;
 }
 
-void write_rows(const Flat &table, const std::vector<Field> &fields, const Sink &sink)
+void write_rows(const Flat &table, const std::vector<const Column *> &columns, const Sink &sink)
 {
-    std::map<std::string_view, std::size_t> own;
-    for (std::size_t i = 0; i < table.fields.size(); ++i)
-        own.emplace(table.fields[i].name, i);
+    std::map<std::string_view, const Column *> by_name;
+    for (const Column &column : table.columns)
+        by_name.emplace(column.name, &column);
+    std::vector<const Column *> own; // for each of the columns, null where there is none
+    for (const Column *column : columns) {
+        const auto found = by_name.find(column->name);
+        own.push_back(found == by_name.end() ? nullptr : found->second);
+    }
     const Work work{sink.tell, "Writing", table.rows};
+    std::string out;
     for (std::size_t i = 0; i < table.rows; ++i) {
-        const Row row = table.row(i);
-        std::string out;
-        for (const Field &field : fields) {
-            if (const auto found = own.find(field.name); found != own.end())
-                out += field.text ? csv_text(row[found->second]) : row[found->second];
+        out.clear();
+        for (const Column *column : own) {
+            if (column)
+                out += column->text ? csv_text(column->cell(i)) : column->cell(i);
             out += ',';
         }
         out.back() = '\n';
@@ -94,32 +100,31 @@ void write_rows(const Flat &table, const std::vector<Field> &fields, const Sink 
     }
 }
 
-void write_table(const Flat &table, const Sink &sink)
+void write_cgats_table(const Flat &table, const Sink &sink)
 {
-    std::vector<std::size_t> columns;
-    for (std::size_t i = 0; i < table.fields.size(); ++i)
-        if (!table.fields[i].cgats.empty())
-            columns.push_back(i);
+    std::vector<const Column *> columns;
+    for (const Column &column : table.columns)
+        if (!column.cgats.empty())
+            columns.push_back(&column);
 
     std::string out = fmt::format("DESCRIPTOR\t{}\n", cgats_text(table.description));
     if (table.spectra)
         out += "SPECTRAL_NORM\t\"100\"\n";
-    for (const std::size_t column : columns)
-        if (const std::string name = identifier(table.fields[column].cgats); !is_standard(name))
+    for (const Column *column : columns)
+        if (const std::string name = identifier(column->cgats); !is_standard(name))
             out += fmt::format("KEYWORD\t\"{}\"\n", name);
     out += fmt::format("NUMBER_OF_FIELDS\t{}\nBEGIN_DATA_FORMAT\n", columns.size());
-    for (const std::size_t column : columns)
-        out += identifier(table.fields[column].cgats) + '\t';
+    for (const Column *column : columns)
+        out += identifier(column->cgats) + '\t';
     out.back() = '\n';
     out += fmt::format("END_DATA_FORMAT\nNUMBER_OF_SETS\t{}\nBEGIN_DATA\n", table.rows);
     sink.write(out);
     const Work work{sink.tell, "Writing", table.rows};
     for (std::size_t i = 0; i < table.rows; ++i) {
         out.clear();
-        const Row row = table.row(i);
-        for (const std::size_t column : columns) {
-            const bool quoted = table.fields[column].text || row[column].empty();
-            out += quoted ? cgats_text(row[column]) : row[column];
+        for (const Column *column : columns) {
+            const std::string cell = column->cell(i);
+            out += column->text || cell.empty() ? cgats_text(cell) : cell;
             out += '\t';
         }
         out.back() = '\n';
@@ -129,28 +134,7 @@ void write_table(const Flat &table, const Sink &sink)
     sink.write("END_DATA\n");
 }
 
-} // namespace
-
-void write_csv(const std::vector<Flat> &tables, const Sink &sink)
-{
-    const std::vector<Field> fields = all_fields(tables);
-    std::string out;
-    for (const Field &field : fields)
-        out += csv_text(field.name) + ',';
-    out.back() = '\n';
-    sink.write(out);
-    for (const Flat &table : tables)
-        write_rows(table, fields, sink);
-}
-
-void write_cgats(const std::vector<Flat> &tables, const Sink &sink)
-{
-    sink.write("CGATS.17\nORIGINATOR\t\"vantrel " VANTREL_VERSION "\"\n");
-    for (const Flat &table : tables)
-        write_table(table, sink);
-}
-
-std::string cell(const std::optional<double> &value)
+std::string four_decimals(const std::optional<double> &value)
 {
     if (!value)
         return "";
@@ -158,49 +142,80 @@ std::string cell(const std::optional<double> &value)
     return out == "-0.0000" ? "0.0000" : out;
 }
 
-std::string exact_cell(double value) { return fmt::format("{}", value); }
+std::string all_digits(const std::optional<double> &value)
+{
+    return value ? fmt::to_string(*value) : "";
+}
 
-void add_device_fields(std::vector<Field> &fields, const std::vector<std::string> &names)
+} // namespace
+
+void Flat::text(std::string name, std::string cgats, std::function<std::string(std::size_t)> get)
+{
+    columns.push_back({std::move(name), std::move(cgats), true, std::move(get)});
+}
+
+void Flat::number(std::string name, std::string cgats,
+                  std::function<std::optional<double>(std::size_t)> get)
+{
+    columns.push_back({std::move(name), std::move(cgats), false,
+                       [get = std::move(get)](std::size_t i) { return four_decimals(get(i)); }});
+}
+
+void Flat::exact(std::string name, std::string cgats,
+                 std::function<std::optional<double>(std::size_t)> get)
+{
+    columns.push_back({std::move(name), std::move(cgats), false,
+                       [get = std::move(get)](std::size_t i) { return all_digits(get(i)); }});
+}
+
+void Flat::colour(const std::string &prefix, std::function<const Colour *(std::size_t)> get)
+{
+    text(prefix + "rgb", "", [get](std::size_t i) { return get(i) ? hex(get(i)->rgb) : ""; });
+    for (const auto &[axis, value] :
+         {std::pair{"L", &CIELABCOORD::L}, {"a", &CIELABCOORD::a}, {"b", &CIELABCOORD::b}})
+        number(prefix + axis, upper(prefix) + "LAB_" + upper(axis),
+               [get, value = value](std::size_t i) {
+                   return get(i) ? std::optional(get(i)->lab.*value) : std::nullopt;
+               });
+}
+
+void Flat::spectrum(std::function<const Spectrum &(std::size_t)> get)
+{
+    spectra = true;
+    for (int band = 0; band < VANTREL_BANDS; ++band)
+        exact(fmt::format("nm{}", 400 + 10 * band), fmt::format("SPECTRAL_NM{}", 400 + 10 * band),
+              [get, band](std::size_t i) { return get(i)[band]; });
+}
+
+void Flat::device(const std::vector<std::string> &names,
+                  std::function<const Device &(std::size_t)> get)
 {
     for (const std::string &name : names)
-        fields.push_back({name, name});
+        exact(name, name, [get, name](std::size_t i) {
+            const Device &device = get(i);
+            const auto own = std::find_if(device.begin(), device.end(),
+                                          [&](const auto &value) { return value.first == name; });
+            return own == device.end() ? std::nullopt : std::optional(own->second);
+        });
 }
 
-void add_device_cells(Row &row, const std::vector<std::string> &names, const Device &device)
+void write_csv(const std::vector<Flat> &tables, const Sink &sink)
 {
-    for (const std::string &name : names) {
-        const auto value = std::find_if(device.begin(), device.end(),
-                                        [&](const auto &own) { return own.first == name; });
-        row.push_back(value == device.end() ? "" : exact_cell(value->second));
-    }
+    const std::vector<const Column *> columns = all_columns(tables);
+    std::string head;
+    for (const Column *column : columns)
+        head += csv_text(column->name) + ',';
+    head.back() = '\n';
+    sink.write(head);
+    for (const Flat &table : tables)
+        write_rows(table, columns, sink);
 }
 
-void add_colour_fields(std::vector<Field> &fields, const std::string &prefix)
+void write_cgats(const std::vector<Flat> &tables, const Sink &sink)
 {
-    std::string upper_prefix = upper(prefix);
-    fields.push_back({prefix + "rgb", "", true});
-    for (const char *axis : {"L", "a", "b"})
-        fields.push_back({prefix + axis, upper_prefix + "LAB_" + upper(axis)});
-}
-
-void add_colour_cells(Row &row, const Colour &colour)
-{
-    row.push_back(hex(colour.rgb));
-    for (const double value : {colour.lab.L, colour.lab.a, colour.lab.b})
-        row.push_back(cell(value));
-}
-
-void add_spectrum_fields(std::vector<Field> &fields)
-{
-    for (int band = 0; band < VANTREL_BANDS; ++band)
-        fields.push_back(
-            {fmt::format("nm{}", 400 + 10 * band), fmt::format("SPECTRAL_NM{}", 400 + 10 * band)});
-}
-
-void add_spectrum_cells(Row &row, const Spectrum &refl)
-{
-    for (const double value : refl)
-        row.push_back(exact_cell(value));
+    sink.write("CGATS.17\nORIGINATOR\t\"vantrel " VANTREL_VERSION "\"\n");
+    for (const Flat &table : tables)
+        write_cgats_table(table, sink);
 }
 
 } // namespace vantrel::sheets

@@ -13,44 +13,40 @@
 
 namespace vantrel::sheets {
 
-struct Field {
+struct Column {
     std::string name;  // in CSV
     std::string cgats; // in CGATS text; empty where the column is left out there
-    bool text = false; // otherwise a number, or nothing
+    bool text;         // otherwise a number, or nothing
+    std::function<std::string(std::size_t)> cell; // of a row
 };
-
-using Row = std::vector<std::string>; // a cell for each field
 
 struct Flat {
     std::string description;
-    std::vector<Field> fields;
     std::size_t rows = 0;
-    std::function<Row(std::size_t)> row;
-    bool spectra = false; // among the fields, in percent
+    std::vector<Column> columns;
+    bool spectra = false; // among the columns, in percent
+
+    // Add columns, given what a row holds there. A number has four decimals, an exact one all that
+    // it takes; nothing makes an empty cell.
+    void text(std::string name, std::string cgats, std::function<std::string(std::size_t)> get);
+    void number(std::string name, std::string cgats,
+                std::function<std::optional<double>(std::size_t)> get);
+    void exact(std::string name, std::string cgats,
+               std::function<std::optional<double>(std::size_t)> get);
+    // Preview and L*a*b*; a null pointer makes empty cells.
+    void colour(const std::string &prefix, std::function<const Colour *(std::size_t)> get);
+    void spectrum(std::function<const Spectrum &(std::size_t)> get);
+    // Device values of these names.
+    using Device = std::vector<std::pair<std::string, double>>; // as in Patch
+    void device(const std::vector<std::string> &names,
+                std::function<const Device &(std::size_t)> get);
 };
 
-// RFC 4180. Tables of different fields share one header, with a column for every name. Text that a
+// RFC 4180. Tables of different columns share one header, with a column for every name. Text that a
 // spreadsheet would take for a formula gets an apostrophe in front.
 void write_csv(const std::vector<Flat> &tables, const Sink &sink);
 
 // CGATS text (ISO 28178), one table after the other.
 void write_cgats(const std::vector<Flat> &tables, const Sink &sink);
-
-// Cells: with four decimals, to the last bit, empty where there is no value.
-std::string cell(const std::optional<double> &value);
-std::string exact_cell(double value);
-
-// Columns of device values, in order, and their cells: empty where a patch does not have the value.
-using Device = std::vector<std::pair<std::string, double>>; // as in Patch
-void add_device_fields(std::vector<Field> &fields, const std::vector<std::string> &names);
-void add_device_cells(Row &row, const std::vector<std::string> &names, const Device &device);
-
-// Columns of a colour and its cells.
-void add_colour_fields(std::vector<Field> &fields, const std::string &prefix);
-void add_colour_cells(Row &row, const Colour &colour);
-
-// Columns of a spectrum and its cells.
-void add_spectrum_fields(std::vector<Field> &fields);
-void add_spectrum_cells(Row &row, const Spectrum &refl);
 
 } // namespace vantrel::sheets

@@ -1,14 +1,15 @@
-// A patch's study as table, JSON and rows.
+// A patch's study as table, JSON and columns.
 
-#include "judge/ink.h"
 #include "judge/names.h"
 #include "read/text.h"
 #include "write/json_text.h"
+#include "write/result.h"
 #include "write/table_text.h"
 
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <array>
 
 namespace vantrel::sheets {
 namespace {
@@ -152,28 +153,25 @@ std::vector<std::string> device_names(const PatchStudy &study)
 
 Flat spectra(const PatchStudy &study)
 {
+    const auto patch = [&study](std::size_t i) -> const PatchReport & {
+        return i == 0 ? study.patch : study.against->patch;
+    };
+    const auto of_first = [](std::optional<double> value) {
+        return [value](std::size_t i) { return i == 0 ? value : std::nullopt; };
+    };
     Flat flat;
     flat.description =
         fmt::format("{} of {}: {}", study.patch.name, study.file, name_of(study.illuminant));
-    flat.fields = {{"table", "", true}, {"id", "SAMPLE_ID", true}, {"name", "SAMPLE_NAME", true}};
-    const std::vector<std::string> inks = device_names(study);
-    add_device_fields(flat.fields, inks);
-    add_colour_fields(flat.fields, "");
-    flat.fields.push_back({"brightness", "BRIGHTNESS"});
-    flat.fields.push_back({"whiteness", "WHITENESS"});
-    add_spectrum_fields(flat.fields);
-    flat.spectra = true;
     flat.rows = study.against ? 2 : 1;
-    flat.row = [&study, inks](std::size_t i) {
-        const PatchReport &patch = i == 0 ? study.patch : study.against->patch;
-        Row row = {"spectra", patch.id, patch.name};
-        add_device_cells(row, inks, patch.device);
-        add_colour_cells(row, patch.colour);
-        row.push_back(i == 0 ? cell(study.as_paper.brightness) : "");
-        row.push_back(i == 0 ? cell(study.as_paper.whiteness) : "");
-        add_spectrum_cells(row, patch.refl);
-        return row;
-    };
+    flat.text("table", "", [](std::size_t) { return "spectra"; });
+    flat.text("id", "SAMPLE_ID", [patch](std::size_t i) { return patch(i).id; });
+    flat.text("name", "SAMPLE_NAME", [patch](std::size_t i) { return patch(i).name; });
+    flat.device(device_names(study),
+                [patch](std::size_t i) -> const Flat::Device & { return patch(i).device; });
+    flat.colour("", [patch](std::size_t i) { return &patch(i).colour; });
+    flat.number("brightness", "BRIGHTNESS", of_first(study.as_paper.brightness));
+    flat.number("whiteness", "WHITENESS", of_first(study.as_paper.whiteness));
+    flat.spectrum([patch](std::size_t i) -> const Spectrum & { return patch(i).refl; });
     return flat;
 }
 
@@ -182,15 +180,11 @@ Flat bands(const PatchStudy &study)
     Flat flat;
     flat.description =
         fmt::format("Error weights of {} against {}", study.patch.name, study.against->patch.name);
-    flat.fields = {{"table", "", true},
-                   {"nm", "WAVELENGTH"},
-                   {"a_weight", "A_WEIGHT"},
-                   {"b_weight", "B_WEIGHT"}};
     flat.rows = VANTREL_BANDS;
-    flat.row = [&study](std::size_t i) {
-        return Row{"bands", fmt::to_string(400 + 10 * i), cell(study.against->a[i]),
-                   cell(study.against->b[i])};
-    };
+    flat.text("table", "", [](std::size_t) { return "bands"; });
+    flat.exact("nm", "WAVELENGTH", [](std::size_t i) { return static_cast<double>(400 + 10 * i); });
+    flat.number("a_weight", "A_WEIGHT", [&study](std::size_t i) { return study.against->a[i]; });
+    flat.number("b_weight", "B_WEIGHT", [&study](std::size_t i) { return study.against->b[i]; });
     return flat;
 }
 
@@ -198,67 +192,57 @@ Flat densities(const PatchStudy &study)
 {
     Flat flat;
     flat.description = fmt::format("Densities of {} over {}", study.patch.name, study.paper);
-    flat.fields = {{"table", "", true},
-                   {"status", "STATUS", true},
-                   {"response", "RESPONSE", true},
-                   {"density", "DENSITY"}};
-    for (int response = 0; response < NUM_RESPONSES; ++response) {
-        const std::string code = response_code(E_STATUS, response);
-        flat.fields.push_back({"D_" + code, "D_" + code});
-    }
     flat.rows = NUM_STATUSES;
-    flat.row = [&study](std::size_t i) {
-        const StatusReading &reading = study.statuses[i];
-        const int status = static_cast<int>(i);
-        Row row = {"densities", std::string(status_name(status)),
-                   reading.reading.response ? response_name(status, *reading.reading.response) : "",
-                   cell(reading.reading.density)};
-        for (const auto &density : reading.densities)
-            row.push_back(cell(density));
-        return row;
-    };
+    flat.text("table", "", [](std::size_t) { return "densities"; });
+    flat.text("status", "STATUS",
+              [](std::size_t i) { return std::string(status_name(static_cast<int>(i))); });
+    flat.text("response", "RESPONSE", [&study](std::size_t i) {
+        const auto &response = study.statuses[i].reading.response;
+        return response ? response_name(static_cast<int>(i), *response) : "";
+    });
+    flat.number("density", "DENSITY",
+                [&study](std::size_t i) { return study.statuses[i].reading.density; });
+    for (int response = 0; response < NUM_RESPONSES; ++response) {
+        const std::string name = "D_" + response_code(E_STATUS, response);
+        flat.number(name, name, [&study, response](std::size_t i) {
+            return study.statuses[i].densities[response];
+        });
+    }
     return flat;
 }
 
 Flat colours(const PatchStudy &study)
 {
+    const std::array<IlluminantReading, NUM_ILLUM_OBS> &rows = study.illuminants;
     Flat flat;
     flat.description = fmt::format("Colours of {}", study.patch.name);
-    flat.fields = {{"table", "", true}, {"illuminant", "ILLUMINANT", true}};
-    add_colour_fields(flat.fields, "");
-    flat.fields.push_back({"C", "LAB_C"});
-    flat.fields.push_back({"h", "LAB_H"});
+    flat.rows = rows.size();
+    flat.text("table", "", [](std::size_t) { return "colours"; });
+    flat.text("illuminant", "ILLUMINANT",
+              [](std::size_t i) { return std::string(name_of(static_cast<ILLUM_OBS>(i))); });
+    flat.colour("", [&rows](std::size_t i) { return &rows[i].colour; });
+    flat.number("C", "LAB_C", [&rows](std::size_t i) { return rows[i].lch.C; });
+    flat.number("h", "LAB_H", [&rows](std::size_t i) { return rows[i].lch.h; });
     if (study.against) {
-        add_colour_fields(flat.fields, "against_");
-        flat.fields.push_back({"de2000", "LAB_DE_2000"});
-        flat.fields.push_back({"metamerism", "METAMERISM"});
-        flat.fields.push_back({"din6172", "DIN6172"});
+        const FormulaNames &de00 = names_of(Formula::de2000);
+        flat.colour("against_", [&rows](std::size_t i) { return &*rows[i].other; });
+        flat.number(std::string(de00.key), std::string(de00.cgats),
+                    [&rows](std::size_t i) { return rows[i].de00; });
+        flat.number("metamerism", "METAMERISM",
+                    [&rows](std::size_t i) { return rows[i].metamerism; });
+        flat.number("din6172", "DIN6172", [&rows](std::size_t i) { return rows[i].din6172; });
     }
-    flat.rows = NUM_ILLUM_OBS;
-    flat.row = [&study](std::size_t i) {
-        const IlluminantReading &reading = study.illuminants[i];
-        Row row = {"colours", std::string(name_of(static_cast<ILLUM_OBS>(i)))};
-        add_colour_cells(row, reading.colour);
-        row.push_back(cell(reading.lch.C));
-        row.push_back(cell(reading.lch.h));
-        if (reading.other) {
-            add_colour_cells(row, *reading.other);
-            for (const auto &value : {reading.de00, reading.metamerism, reading.din6172})
-                row.push_back(cell(value));
-        }
-        return row;
-    };
     return flat;
 }
 
 } // namespace
 
-void write_table(const PatchStudy &study, const Sink &sink, bool colour)
+void write_table(const PatchStudy &study, const Sink &sink, const TableStyle &style)
 {
     Lines lines(sink);
-    add_summary(lines, study, colour);
+    add_summary(lines, study, style.colour);
     add_densities(lines, study);
-    add_illuminants(lines, study, colour);
+    add_illuminants(lines, study, style.colour);
     add_bands(lines, study);
 }
 

@@ -1,6 +1,7 @@
 #include "write/json_text.h"
 
 #include "judge/names.h"
+#include "judge/report.h"
 
 #include <fmt/format.h>
 
@@ -12,6 +13,30 @@ void add_reading(Json &object, const DensityReading &reading, int status)
 {
     object["response"] = reading.response ? Json(response_name(status, *reading.response)) : Json();
     object["density"] = or_null(reading.density);
+}
+
+Json patch_json(const PatchReport &patch, int status)
+{
+    Json device = Json::object();
+    for (const auto &[field, value] : patch.device)
+        device[field] = value;
+    return {{"id", patch.id},
+            {"name", patch.name},
+            {"device", device},
+            {"rgb", hex(patch.colour.rgb)},
+            {"lab", lab_json(patch.colour.lab)},
+            {"lch", {patch.lch.L, patch.lch.C, patch.lch.h}},
+            {"de00_to_paper", patch.to_paper},
+            {"response", patch.response ? Json(response_name(status, *patch.response)) : Json()},
+            {"response_id", or_null(patch.response)},
+            {"density", or_null(patch.density)},
+            {"dot_area", or_null(patch.dot_area)},
+            {"dot_gain", or_null(patch.dot_gain)},
+            {"print_contrast", or_null(patch.print_contrast)},
+            {"hue_error", or_null(patch.hue_error)},
+            {"grayness", or_null(patch.grayness)},
+            {"trap", or_null(patch.trap)},
+            {"refl", patch.refl}};
 }
 
 void write_with_array(const Json &object, std::string_view name, std::size_t count,

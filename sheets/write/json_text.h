@@ -22,7 +22,7 @@ template <typename Value> Json or_null(const std::optional<Value> &value)
     return value ? Json(*value) : Json();
 }
 
-struct PatchReport;
+struct PatchReport; // judge/report.h
 
 Json lab_json(const CIELABCOORD &lab);
 

@@ -30,7 +30,7 @@ Formula formula_of(std::string_view name)
     const auto formula = formula_named(name);
     if (!formula)
         throw RequestError{
-            fmt::format("no formula {}; there are de2000, cmc, de94, de76", in_quotes(name))};
+            fmt::format("no formula {}; there are {}", in_quotes(name), formula_keys())};
     return *formula;
 }
 
@@ -65,7 +65,7 @@ std::vector<Metric> metrics_of(const CompareOptions &options)
     for (const std::string &name : options.formulas) {
         const Formula formula = formula_of(name);
         if (find(formula) != metrics.end())
-            throw RequestError{fmt::format("the formula {} is named twice", name_of(formula))};
+            throw RequestError{fmt::format("the formula {} is named twice", names_of(formula).key)};
         metrics.push_back(usual_metric(formula));
     }
     for (const std::string &wish : options.weights) {
@@ -73,7 +73,7 @@ std::vector<Metric> metrics_of(const CompareOptions &options)
         const auto metric = find(weighted.formula);
         if (metric == metrics.end())
             throw RequestError{fmt::format("--weights of {}, which --formula does not name",
-                                           name_of(weighted.formula))};
+                                           names_of(weighted.formula).key)};
         *metric = weighted;
     }
     return metrics;
@@ -87,36 +87,28 @@ Pairing pairing_of(const std::string &name)
     return Pairing::automatic;
 }
 
-Outcome run(CompareOptions &options)
+Outcome run(const CompareOptions &options)
 {
     if (options.tolerance && !(*options.tolerance >= 0 && std::isfinite(*options.tolerance)))
         throw RequestError{"--tolerance takes a number from 0 up"};
-    CompareRequest request;
-    request.pairing = pairing_of(options.pairing);
-    request.metrics = metrics_of(options);
-    request.illuminant = illuminant_of(options.illuminant);
-    request.second_illuminant = options.second_illuminant.empty()
-                                    ? usual_second(request.illuminant)
-                                    : illuminant_of(options.second_illuminant);
-    request.status = status_of(options.status);
-    request.words_of_hue = options.words == "hue";
-    request.tolerance = options.tolerance;
-    request.tell = progress_bar();
+    const CompareRequest request{
+        .pairing = pairing_of(options.pairing),
+        .metrics = metrics_of(options),
+        .illuminant = illuminant_of(options.illuminant),
+        .second_illuminant = optional_illuminant(options.second_illuminant),
+        .status = status_of(options.status),
+        .words_of_hue = options.words == "hue",
+        .tolerance = options.tolerance,
+        .paper = options.paper,
+        .tell = progress_bar(),
+    };
     const Measurement reference = sheet_of(options.reference, options);
     const Measurement sample = sheet_of(options.sample, options);
-    request.reference_paper = &paper_of(reference, options);
-    request.sample_paper = &paper_of(sample, options);
-
     Comparison comparison = compare(reference, sample, request);
-    comparison.list_all = options.all;
-    for (const auto &[sheet, names] : {std::pair{&reference, &comparison.only_reference},
-                                       std::pair{&sample, &comparison.only_sample}})
-        if (!names->empty())
-            options.warnings.push_back(fmt::format("{}: {} of {} patches have no partner",
-                                                   sheet->file, names->size(),
-                                                   sheet->patches.size()));
     const bool passed = comparison.passed();
-    Outcome outcome = outcome_of(std::move(comparison), options);
+    std::vector<std::string> warnings = comparison.warnings;
+    Outcome outcome =
+        outcome_of(std::move(comparison), std::move(warnings), options, {.all_pairs = options.all});
     outcome.within_tolerance = passed;
     return outcome;
 }
@@ -154,8 +146,8 @@ Command add_compare(CLI::App &app)
         ->capture_default_str();
     command
         ->add_option("--formula", options->formulas,
-                     "Colour differences, with commas between: de2000, cmc, de94, de76; the first "
-                     "decides on worst and tolerance")
+                     "Colour differences, with commas between: " + formula_keys() +
+                         "; the first decides on worst and tolerance")
         ->delimiter(',')
         ->allow_extra_args(false)
         ->capture_default_str();

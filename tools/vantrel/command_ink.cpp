@@ -14,16 +14,19 @@ struct InkOptions : Options {
     std::vector<std::string> order; // of printing
 };
 
-Outcome run(InkOptions &options)
+Outcome run(const InkOptions &options)
 {
-    Request request;
-    request.illuminant = illuminant_of(options.illuminant);
-    request.status = status_of(options.status);
-    const Measurement sheet = sheet_of(options.file, options);
-    request.paper = &paper_of(sheet, options);
-    const Patch &patch = patch_named(sheet, options.patch);
-    const Patch *other = options.against.empty() ? nullptr : &patch_named(sheet, options.against);
-    return outcome_of(study_of(sheet, Inks(sheet, options.order), request, patch, other), options);
+    const InkRequest request{
+        .patch = options.patch,
+        .against = options.against,
+        .illuminant = illuminant_of(options.illuminant),
+        .status = status_of(options.status),
+        .paper = options.paper,
+        .order = options.order,
+    };
+    PatchStudy study = study_of(sheet_of(options.file, options), request);
+    std::vector<std::string> warnings = study.warnings;
+    return outcome_of(std::move(study), std::move(warnings), options);
 }
 
 constexpr const char *kFooter =

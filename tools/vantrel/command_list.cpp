@@ -71,7 +71,7 @@ Command add_list(CLI::App &app)
                         "One of the responses: " + response_names());
     add_common_options(*command, *options);
     command->footer(kFooter);
-    return {command, [options] { return outcome_of(list_of(*options), *options); }};
+    return {command, [options] { return outcome_of(list_of(*options), {}, *options); }};
 }
 
 } // namespace vantrel::program

@@ -14,17 +14,18 @@ struct PredictOptions : Options {
     std::vector<std::string> ink_tints; // NAME:PERCENT
 };
 
-Outcome run(PredictOptions &options)
+Outcome run(const PredictOptions &options)
 {
-    const ILLUM_OBS illuminant = illuminant_of(options.illuminant);
-    const int status = status_of(options.status);
-    const Measurement sheet = sheet_of(options.file, options);
-    const Inks inks(sheet, options.order);
-    const Patch &paper = paper_of(sheet, options);
-    return outcome_of(options.ink_tints.empty()
-                          ? predict_overprints(sheet, inks, paper, illuminant, status)
-                          : predict(sheet, inks, paper, illuminant, status, options.ink_tints),
-                      options);
+    const PredictRequest request{
+        .illuminant = illuminant_of(options.illuminant),
+        .status = status_of(options.status),
+        .paper = options.paper,
+        .order = options.order,
+        .inks = options.ink_tints,
+    };
+    Predictions predictions = predict(sheet_of(options.file, options), request);
+    std::vector<std::string> warnings = predictions.warnings;
+    return outcome_of(std::move(predictions), std::move(warnings), options);
 }
 
 constexpr const char *kFooter =

@@ -18,31 +18,28 @@ struct ReportOptions : Options {
     std::string second_illuminant; // its default follows the first
 };
 
-Report report_of_file(const std::string &file, Request request, ReportOptions &options)
-{
-    const Measurement sheet = sheet_of(file, options);
-    request.paper = &paper_of(sheet, options);
-    if (!options.second_paper.empty())
-        request.second_paper = &patch_named(sheet, options.second_paper);
-    return report_of(sheet, Inks(sheet, options.order), request);
-}
-
-Outcome run(ReportOptions &options)
+Outcome run(const ReportOptions &options)
 {
     if (!(options.n_factor > 0) || !std::isfinite(options.n_factor))
         throw RequestError{"--n-factor takes a number above 0"};
-    Request request;
-    request.illuminant = illuminant_of(options.illuminant);
-    request.status = status_of(options.status);
-    request.n_factor = options.n_factor;
-    request.second_illuminant = options.second_illuminant.empty()
-                                    ? usual_second(request.illuminant)
-                                    : illuminant_of(options.second_illuminant);
-    request.tell = progress_bar();
+    const ReportRequest request{
+        .illuminant = illuminant_of(options.illuminant),
+        .status = status_of(options.status),
+        .paper = options.paper,
+        .n_factor = options.n_factor,
+        .order = options.order,
+        .second_paper = options.second_paper,
+        .second_illuminant = optional_illuminant(options.second_illuminant),
+        .tell = progress_bar(),
+    };
     std::vector<Report> sheets;
-    for (const std::string &file : options.files)
-        sheets.push_back(report_of_file(file, request, options));
-    return outcome_of(std::move(sheets), options);
+    std::vector<std::string> warnings;
+    for (const std::string &file : options.files) {
+        sheets.push_back(report_of(sheet_of(file, options), request));
+        for (const std::string &warning : sheets.back().warnings)
+            warnings.push_back(warning);
+    }
+    return outcome_of(std::move(sheets), std::move(warnings), options);
 }
 
 constexpr const char *kFooter =

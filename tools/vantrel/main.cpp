@@ -8,6 +8,8 @@
 #include "progress.h"
 #include "read/text.h"
 
+#include <fmt/format.h>
+
 #include <csignal>
 #include <cstdio>
 #include <exception>
@@ -28,6 +30,9 @@ Outcome run(CLI::App &app, int count, char **words)
     app.set_version_flag("--version", VANTREL_VERSION);
     const Command commands[] = {add_report(app), add_compare(app), add_predict(app), add_ink(app),
                                 add_list(app)};
+    std::vector<std::string> names;
+    for (const Command &command : commands)
+        names.push_back(command.app->get_name());
     app.footer("Exit status: 0 done; 1 a sheet failed its --tolerance; 2 the request or a file is "
                "at fault;\n3 the output could not be written.\n\n"
                "Example:\n  vantrel report two_ink_halftone.txt\n\n"
@@ -43,8 +48,9 @@ Outcome run(CLI::App &app, int count, char **words)
             throw;
         const auto rest = app.remaining();
         throw RequestError{
-            (rest.empty() ? "a command is required" : "no command " + in_quotes(rest[0])) +
-            "; there are report, compare, predict, ink, list"};
+            fmt::format("{}; there are {}",
+                        rest.empty() ? "a command is required" : "no command " + in_quotes(rest[0]),
+                        fmt::join(names, ", "))};
     }
     for (const Command &command : commands)
         if (command.app->parsed())

@@ -8,8 +8,6 @@
 
 #include <fmt/format.h>
 
-#include <algorithm>
-#include <cmath>
 #include <cstdio>
 #include <cstdlib>
 #include <optional>
@@ -18,16 +16,6 @@
 
 namespace vantrel::program {
 namespace {
-
-// The ink of a patch, all its percentages; nothing where its device values name no ink.
-std::optional<double> ink_on(const Patch &patch)
-{
-    std::optional<double> sum;
-    for (const auto &[field, percent] : patch.device)
-        if (!field.starts_with("RGB_"))
-            sum = sum.value_or(0) + std::abs(percent);
-    return sum;
-}
 
 bool is_same_file(const std::string &first, const std::string &second)
 {
@@ -101,32 +89,12 @@ int status_of(const std::string &name)
     return *status;
 }
 
-const Patch &paper_of(const Measurement &sheet, Options &options)
+std::optional<ILLUM_OBS> optional_illuminant(const std::string &name)
 {
-    if (!options.paper.empty())
-        return patch_named(sheet, options.paper);
-    const Patch &first = sheet.patches.front();
-    if (ink_on(first) > 0) {
-        const auto bare = std::find_if(sheet.patches.begin(), sheet.patches.end(),
-                                       [](const Patch &patch) { return ink_on(patch) == 0; });
-        const std::string other =
-            bare == sheet.patches.end() ? "" : ", " + in_quotes(bare->name) + " has none";
-        options.warnings.push_back(
-            fmt::format("{}: {} stands for the paper, but has ink{}; --paper chooses", sheet.file,
-                        in_quotes(first.name), other));
-    }
-    return first;
+    return name.empty() ? std::nullopt : std::optional(illuminant_of(name));
 }
 
-ILLUM_OBS usual_second(ILLUM_OBS first)
-{
-    const bool ten_degrees = first % 2 == 1;
-    if (first == A_2DEG || first == A_10DEG)
-        return ten_degrees ? D65_10DEG : D65_2DEG;
-    return ten_degrees ? A_10DEG : A_2DEG;
-}
-
-Measurement sheet_of(const std::string &path, Options &options)
+Measurement sheet_of(const std::string &path, const Options &options)
 {
     const std::string file = printable(path);
     if (!options.output.empty() && is_same_file(path, options.output))
@@ -139,8 +107,6 @@ Measurement sheet_of(const std::string &path, Options &options)
         reading.tell = progress_bar();
         Measurement sheet = read_measurement(read_file(path), reading);
         sheet.file = file;
-        for (const std::string &warning : sheet.warnings)
-            options.warnings.push_back(fmt::format("{}:{}", file, warning));
         return sheet;
     } catch (const InputError &error) {
         throw RequestError{fmt::format(

@@ -2,12 +2,13 @@
 #pragma once
 
 #include "read/measurement.h"
-#include "write/flat.h"
 #include "write/html.h"
+#include "write/result.h"
 
 #include <CLI/CLI.hpp>
 
 #include <functional>
+#include <optional>
 #include <string>
 #include <utility>
 #include <vector>
@@ -25,7 +26,6 @@ struct Options {
     std::string format = "table";
     std::string output; // a file; standard output where it is empty
     bool no_color = false;
-    std::vector<std::string> warnings; // of the files that were read
 };
 
 // What a command has to say.
@@ -57,15 +57,11 @@ void add_order_option(CLI::App &command, std::vector<std::string> &order);
 ILLUM_OBS illuminant_of(const std::string &name);
 int status_of(const std::string &name);
 
-// The patch that the options name, or else the first, with a warning where its device values have
-// ink. Throws RequestError.
-const Patch &paper_of(const Measurement &sheet, Options &options);
-
-// Illuminant A beside daylight and lamps, D65 beside A, with the same observer.
-ILLUM_OBS usual_second(ILLUM_OBS first);
+// Nothing where the name is empty.
+std::optional<ILLUM_OBS> optional_illuminant(const std::string &name);
 
 // Reads a file, which is not the output; throws RequestError.
-Measurement sheet_of(const std::string &path, Options &options);
+Measurement sheet_of(const std::string &path, const Options &options);
 
 bool shows_colour(const Options &options);
 
@@ -73,22 +69,25 @@ bool shows_colour(const Options &options);
 void complain(const std::string &message);
 
 // A result in the format that the options ask for.
-template <typename Result> Outcome outcome_of(Result result, const Options &options)
+template <typename Result>
+Outcome outcome_of(Result result, std::vector<std::string> warnings, const Options &options,
+                   TableStyle style = {})
 {
+    style.colour = shows_colour(options);
     const auto write = [result = std::move(result), format = options.format,
-                        colour = shows_colour(options)](const Sink &sink) {
+                        style](const Sink &sink) {
         if (format == "json")
             write_json(result, sink);
         else if (format == "html")
             write_html([&](const Sink &page) { write_json(result, page); }, sink);
         else if (format == "table")
-            write_table(result, sink, colour);
+            write_table(result, sink, style);
         else if (format == "csv")
             write_csv(flat_of(result), sink);
         else
             write_cgats(flat_of(result), sink);
     };
-    return {write, options.output, options.warnings};
+    return {write, options.output, std::move(warnings)};
 }
 
 } // namespace vantrel::program

@@ -1,16 +1,17 @@
+// A report as table, JSON and columns.
+
 #include "judge/names.h"
-#include "judge/predict.h"
-#include "judge/report.h"
 #include "read/text.h"
+#include "write/json_text.h"
+#include "write/result.h"
 #include "write/table_text.h"
 
 #include <fmt/format.h>
 
 #include <algorithm>
-#include <cmath>
-#include <iterator>
 #include <map>
-#include <optional>
+#include <set>
+#include <string_view>
 #include <utility>
 
 namespace vantrel::sheets {
@@ -77,7 +78,7 @@ void add_paper(Lines &lines, const Report &report)
                               fixed(metamerism->din6172)));
 }
 
-struct Column {
+struct BlockColumn {
     const char *title;
     std::optional<double> PatchReport::*value;
     int decimals = 2;
@@ -85,7 +86,7 @@ struct Column {
 
 // A short table of the patches that have a value in the first column.
 void add_block(Lines &lines, const Report &report, const char *title, std::size_t width,
-               const std::vector<Column> &columns)
+               const std::vector<BlockColumn> &columns)
 {
     bool any = false;
     for (const PatchReport &patch : report.patches) {
@@ -93,21 +94,15 @@ void add_block(Lines &lines, const Report &report, const char *title, std::size_
             continue;
         if (!std::exchange(any, true)) {
             std::string head = fmt::format("\n{:<{}}", title, width);
-            for (const Column &column : columns)
+            for (const BlockColumn &column : columns)
                 head += fmt::format("{:>12}", column.title);
             lines.add(head);
         }
         std::string line = fmt::format("{:<{}}", cut(patch.name, kWidestName), width);
-        for (const Column &column : columns)
+        for (const BlockColumn &column : columns)
             line += fmt::format("{:>12}", fixed(patch.*column.value, column.decimals));
         lines.add(line);
     }
-}
-
-std::string colour_columns(const Colour &shown, bool colour)
-{
-    return fmt::format(" {}{:>7}{:>7}{:>7}", colour ? swatch(shown.rgb) : "", fixed(shown.lab.L),
-                       fixed(shown.lab.a), fixed(shown.lab.b));
 }
 
 // Dot area and gain of every ink by nominal value, six inks side by side.
@@ -142,39 +137,6 @@ void add_tone_values(Lines &lines, const Report &report)
     }
 }
 
-std::string shown(const DensityReading &reading, int status)
-{
-    return reading.density ? fmt::format("{} {}", response_code(status, *reading.response),
-                                         fixed(reading.density, 3))
-                           : "none";
-}
-
-// The densities of the one prediction.
-std::string densities_of(const Predictions &predictions)
-{
-    const Prediction &only = predictions.all[0];
-    std::string out =
-        fmt::format("\nDensity ({}): halftone {}, film {}", status_name(predictions.status),
-                    shown(only.halftone.reading, predictions.status),
-                    shown(only.film.reading, predictions.status));
-    if (only.measured)
-        out += ", measured " + shown(only.measured->reading, predictions.status);
-    return out;
-}
-
-// The mean and the largest difference of one model.
-std::string summary(const Predictions &predictions, const char *name, Estimate Prediction::*model)
-{
-    double sum = 0, largest = 0;
-    for (const Prediction &prediction : predictions.all) {
-        const double delta_e = (prediction.*model).to_measured.value_or(0);
-        sum += delta_e;
-        largest = std::max(largest, delta_e);
-    }
-    return fmt::format("{}: mean ΔE00 {}, largest {}", name,
-                       fixed(sum / static_cast<double>(predictions.all.size())), fixed(largest));
-}
-
 void write_table(const Report &report, Lines &lines, bool colour)
 {
     std::size_t width = 10;
@@ -194,60 +156,146 @@ void write_table(const Report &report, Lines &lines, bool colour)
         lines.add(fmt::format("\nInks print in the order {}", fmt::join(report.inks, ", ")));
 }
 
+Json paper_json(const Report &report)
+{
+    const PaperReport &paper = report.paper;
+    Json out = {
+        {"name", paper.name},
+        {"lab", lab_json(paper.lab)},
+        {"brightness", paper.brightness},
+        {"whiteness", or_null(paper.whiteness)},
+    };
+    if (!paper.whiteness)
+        out["no_whiteness"] = paper.no_whiteness;
+    if (const auto &metamerism = report.metamerism)
+        out["metamerism"] = {{"paper", metamerism->paper},
+                             {"illuminant", name_of(metamerism->illuminant)},
+                             {"sum", metamerism->sum},
+                             {"din6172", metamerism->din6172}};
+    return out;
+}
+
+Json tone_values_json(const Report &report)
+{
+    Json out = Json::array();
+    for (const ToneCurve &curve : report.tone_curves) {
+        Json values = Json::array();
+        for (const ToneValue &value : curve.values)
+            values.push_back({{"nominal", value.nominal},
+                              {"dot_area", value.dot_area},
+                              {"dot_gain", value.dot_gain},
+                              {"patches", value.patches}});
+        out.push_back({{"ink", curve.ink}, {"solid", curve.solid}, {"values", values}});
+    }
+    return out;
+}
+
+void write_sheet(const Report &report, const Sink &sink)
+{
+    const Json head = {
+        {"file", report.file},
+        {"illuminant", name_of(report.illuminant)},
+        {"status", status_name(report.status)},
+        {"n_factor", report.n_factor},
+        {"inks", report.inks},
+        {"source",
+         {{"first_nm", report.source.first_nm},
+          {"last_nm", report.source.last_nm},
+          {"step_nm", report.source.step_nm},
+          {"bands", report.source.bands},
+          {"averaged", report.source.averaged},
+          {"scaled_to_percent", report.source.scaled},
+          {"scale_by", report.source.scale_by},
+          {"condition", report.source.condition.empty() ? Json() : Json(report.source.condition)}}},
+        {"paper", paper_json(report)},
+        {"tone_values", tone_values_json(report)},
+    };
+    write_with_array(
+        head, "patches", report.patches.size(),
+        [&](std::size_t i) { return patch_json(report.patches[i], report.status); }, sink);
+}
+
+constexpr std::size_t kMostCells = 50'000'000; // of device values: bounds what empty ones take
+
+// The names of the device values of all patches.
+std::vector<std::string> device_names(const Report &report)
+{
+    std::set<std::string_view> seen;
+    std::vector<std::string> names;
+    for (const PatchReport &patch : report.patches)
+        for (const auto &[name, value] : patch.device)
+            if (seen.insert(name).second)
+                names.push_back(name);
+    if (names.size() * report.patches.size() > kMostCells)
+        throw RequestError{fmt::format("{}: {} inks are too many for a column each; --format json "
+                                       "has them",
+                                       report.file, names.size())};
+    return names;
+}
+
+Flat flat_of(const Report &report)
+{
+    const std::vector<PatchReport> &patches = report.patches;
+    Flat flat;
+    flat.description = fmt::format("Report of {}: {}, {} over {}, n = {:g}", report.file,
+                                   name_of(report.illuminant), status_name(report.status),
+                                   report.paper.name, report.n_factor);
+    flat.rows = patches.size();
+    flat.text("file", "", [&report](std::size_t) { return report.file; });
+    flat.text("id", "SAMPLE_ID", [&patches](std::size_t i) { return patches[i].id; });
+    flat.text("name", "SAMPLE_NAME", [&patches](std::size_t i) { return patches[i].name; });
+    flat.device(device_names(report),
+                [&patches](std::size_t i) -> const Flat::Device & { return patches[i].device; });
+    flat.colour("", [&patches](std::size_t i) { return &patches[i].colour; });
+    flat.number("C", "LAB_C", [&patches](std::size_t i) { return patches[i].lch.C; });
+    flat.number("h", "LAB_H", [&patches](std::size_t i) { return patches[i].lch.h; });
+    flat.number("dE00_paper", "DE00_PAPER",
+                [&patches](std::size_t i) { return patches[i].to_paper; });
+    flat.text("response", "RESPONSE", [&report](std::size_t i) {
+        const auto &response = report.patches[i].response;
+        return response ? response_name(report.status, *response) : "";
+    });
+    flat.number("density", "DENSITY", [&patches](std::size_t i) { return patches[i].density; });
+    flat.number("dot_area", "DOT_AREA", [&patches](std::size_t i) { return patches[i].dot_area; });
+    flat.number("dot_gain", "DOT_GAIN", [&patches](std::size_t i) { return patches[i].dot_gain; });
+    flat.number("print_contrast", "PRINT_CONTRAST",
+                [&patches](std::size_t i) { return patches[i].print_contrast; });
+    flat.number("hue_error", "HUE_ERROR",
+                [&patches](std::size_t i) { return patches[i].hue_error; });
+    flat.number("grayness", "GRAYNESS", [&patches](std::size_t i) { return patches[i].grayness; });
+    flat.number("trap", "TRAP", [&patches](std::size_t i) { return patches[i].trap; });
+    flat.spectrum([&patches](std::size_t i) -> const Spectrum & { return patches[i].refl; });
+    return flat;
+}
+
 } // namespace
 
-void write_table(const std::vector<Report> &sheets, const Sink &sink, bool colour)
+void write_table(const std::vector<Report> &sheets, const Sink &sink, const TableStyle &style)
 {
     Lines lines(sink);
     for (const Report &report : sheets) {
         if (&report != sheets.data())
             lines.add("\n");
-        write_table(report, lines, colour);
+        write_table(report, lines, style.colour);
     }
 }
 
-void write_table(const Predictions &predictions, const Sink &sink, bool colour)
+void write_json(const std::vector<Report> &sheets, const Sink &sink)
 {
-    const std::size_t widest = colour ? 26 : 38; // 120 columns in all
-    const auto title = [&](const Prediction &prediction) {
-        return cut(prediction.measured ? prediction.measured->patch
-                                       : inks_of(prediction, kWidestInText),
-                   widest);
-    };
-    std::size_t width = 11;
-    for (const Prediction &prediction : predictions.all)
-        width = std::max(width, characters(title(prediction)));
-    Lines lines(sink);
-    lines.add(fmt::format("{}: {}, on {}", predictions.file, name_of(predictions.illuminant),
-                          cut(predictions.paper, kWidestName)));
-    if (predictions.all.size() == 1)
-        lines.add(inks_of(predictions.all[0], kWidestInText));
-    const std::string gap = colour ? "    " : "";
-    const std::string lab = fmt::format(" {}{:>7}{:>7}{:>7}", gap, "L*", "a*", "b*");
-    lines.add(fmt::format("\n{:<{}} {}{:>28} {}{:>28} {}{:>21}", "", width, gap, "Halftone", gap,
-                          "Film", gap, "Measured"));
-    lines.add(
-        fmt::format("{:<{}}{}{:>7}{}{:>7}{}", "Combination", width, lab, "ΔE00", lab, "ΔE00", lab));
-    for (const Prediction &prediction : predictions.all) {
-        std::string line = fmt::format("{:<{}}", title(prediction), width);
-        for (const Estimate *estimate : {&prediction.halftone, &prediction.film})
-            line += colour_columns(estimate->colour, colour) +
-                    fmt::format("{:>7}", fixed(estimate->to_measured));
-        if (prediction.measured)
-            line += colour_columns(prediction.measured->colour, colour);
-        lines.add(line);
+    sink.write("{\n\"command\": \"report\",\n\"sheets\": [\n");
+    for (const Report &report : sheets) {
+        sink.write(&report == sheets.data() ? "" : ",\n");
+        write_sheet(report, sink);
     }
-    if (predictions.all.size() > 1) { // every one of them measured
-        lines.add("");
-        lines.add(summary(predictions, "Halftone", &Prediction::halftone));
-        lines.add(summary(predictions, "Film", &Prediction::film));
-    }
-    if (predictions.all.size() == 1)
-        lines.add(densities_of(predictions));
-    if (predictions.left_out)
-        lines.add(fmt::format("Left out: {} overprints of more than three inks, of fractions of a "
-                              "percent, or without a solid",
-                              predictions.left_out));
+    sink.write("\n]\n}\n");
+}
+
+std::vector<Flat> flat_of(const std::vector<Report> &sheets)
+{
+    std::vector<Flat> out;
+    for (const Report &report : sheets)
+        out.push_back(flat_of(report));
+    return out;
 }
 
 } // namespace vantrel::sheets

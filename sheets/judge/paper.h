@@ -1,0 +1,21 @@
+// The paper of a sheet, which densities and differences are over.
+#pragma once
+
+#include "read/measurement.h"
+
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace vantrel::sheets {
+
+struct Paper {
+    std::string name;
+    Spectrum refl{};
+};
+
+// The patch of this name or id. Without a name the first patch, with a warning where its device
+// values have ink. Throws RequestError.
+Paper paper_of(const Measurement &sheet, std::string_view name, std::vector<std::string> &warnings);
+
+} // namespace vantrel::sheets
