@@ -147,12 +147,14 @@ void write_table(const Comparison &comparison, const Sink &sink, const TableStyl
 
 void write_json(const Comparison &comparison, const Sink &sink)
 {
-    Json names = Json::array(), weights = Json::object(), statistics = Json::object();
+    Json names = Json::array(), labels = Json::object(), weights = Json::object(),
+         statistics = Json::object();
     for (std::size_t i = 0; i < comparison.metrics.size(); ++i) {
         const Metric &metric = comparison.metrics[i];
         const std::string name(names_of(metric.formula).key);
         const Statistics &all = comparison.statistics[i];
         names.push_back(name);
+        labels[name] = title_of(metric);
         if (metric.formula != Formula::de76)
             weights[name] = {metric.lightness, metric.chroma};
         statistics[name] = {{"mean", all.mean},
@@ -169,6 +171,7 @@ void write_json(const Comparison &comparison, const Sink &sink)
         {"status", status_name(comparison.status)},
         {"paired_by", name_of(comparison.paired_by)},
         {"formulas", names},
+        {"labels", labels},
         {"weights", weights},
         {"tolerance", or_null(comparison.tolerance)},
         {"passed", comparison.tolerance ? Json(comparison.passed()) : Json()},

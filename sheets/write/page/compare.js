@@ -5,13 +5,7 @@ import { count, figures, fixed, h, named, smallTable, spread, swatch } from './d
 import { spectraPicture, swatches } from './report.js';
 import { searchTable } from './table.js';
 
-const formulaNames = { de2000: 'ΔE00', cmc: 'ΔEcmc', de94: 'ΔE94', de76: 'ΔE*ab' };
-// With its weights, l:c or kL:kC, where they are not one.
-function labeller({ weights }) {
-  const weighted = (formula) => (weights?.[formula]?.some((weight) => weight !== 1)
-    ? `(${weights[formula].join(':')})` : '');
-  return (formula) => `${formulaNames[formula] ?? formula}${weighted(formula)}`;
-}
+const labeller = ({ labels }) => (formula) => labels[formula];
 const labText = (lab) => lab.map((value) => fixed(value)).join(' ');
 
 function verdict(result) {
