@@ -11,8 +11,8 @@ namespace vantrel::sheets {
 
 class Bands {
 public:
-    // Wavelengths in nm, in any order, evenly spaced from 400 to 700 nm at least, in steps of 10 nm
-    // or finer; throws InputError for this line where they are not.
+    // Wavelengths in nm, in any order, evenly spaced in steps of 20, 10 or fewer nm, from 410 to
+    // 680 nm at least; throws InputError for this line where they are not.
     Bands(std::vector<double> wavelengths, std::size_t line);
 
     const std::vector<double> &wavelengths() const { return nm; }
@@ -20,9 +20,16 @@ public:
     // Which of the values the bands need.
     const std::vector<std::size_t> &used() const { return needed; }
 
-    // One value for each wavelength. A band is the mean of those less than 10 nm away, weighted by
-    // a triangle, the passband of spectral data at 10 nm (ISO 13655); of steps of 10 nm it is the
-    // value itself.
+    // One value for each wavelength.
+    //
+    // Steps of 10 nm are taken as they are. Between steps of 20 nm a cubic goes through the four
+    // nearest values, in the first and last interval a parabola through three (Lagrange; ASTM
+    // E2022). Of finer steps a band is the mean weighted by a triangle of 10 nm half width, the
+    // passband of spectral data at 10 nm (ISO 13655), which then is corrected for its width by
+    // -0.083, 1.166, -0.083 of the three neighbouring bands (Stearns and Stearns 1988). Where the
+    // range ends too early for the three triangles, the value at the band's own wavelength stands
+    // for it: that is what the correction brings the mean back to. Bands outside the range are
+    // equal to the last one inside.
     Spectrum of(const std::vector<double> &values) const;
 
     // All but the scale and the condition.
@@ -33,9 +40,17 @@ private:
         std::size_t value;
         double weight; // of a sum of 1
     };
+    using Parts = std::vector<Part>;
+    Parts value_at(double wavelength) const;
+    Parts triangle(double centre) const;
+    Parts between(double wavelength) const;
+    Parts corrected(double centre) const;
+
     std::vector<double> nm;
+    std::vector<std::size_t> order; // of the values, by wavelength
+    double step;
     std::vector<std::size_t> needed; // by wavelength
-    std::array<std::vector<Part>, VANTREL_BANDS> parts;
+    std::array<Parts, VANTREL_BANDS> parts;
 };
 
 } // namespace vantrel::sheets

@@ -7,8 +7,8 @@
 
 namespace vantrel::sheets {
 
-// The first table that holds spectra, with the rows of later tables of the same fields. Throws
-// InputError.
+// The first table that holds spectra, or else colours, with the rows of later tables of the same
+// fields. Throws InputError.
 void read_cgats(std::string_view text, Sheet &sheet);
 
 } // namespace vantrel::sheets

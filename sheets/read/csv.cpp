@@ -7,66 +7,71 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <utility>
 
 namespace vantrel::sheets {
 namespace {
 
 // Takes a record off the text, with the end of its last line; counts the lines that it ends. A
-// quoted value may go over several. Nothing where a quoted value is not closed.
-std::optional<Row> next_record(std::string_view &text, char separator, std::size_t &line)
+// quoted value may go over several. False where a quoted value is not closed.
+bool next_record(std::string_view &text, char separator, std::size_t &line, Row &row)
 {
     const auto ends = [&](char c) { return c == separator || c == '\n' || c == '\r'; };
     const std::string_view blanks = separator == '\t' ? " " : " \t";
-    Row values;
+    row.clear();
     for (;;) {
-        std::string value;
+        std::string_view quoted;
         const auto begin = text.find_first_not_of(blanks);
         if (begin != std::string_view::npos && text[begin] == '"') {
             text.remove_prefix(begin);
-            auto quoted = next_string(text);
-            if (!quoted)
-                return std::nullopt;
-            line += static_cast<std::size_t>(std::count(quoted->begin(), quoted->end(), '\n'));
-            value = std::move(*quoted);
+            const auto string = next_string(text, row);
+            if (!string)
+                return false;
+            line += static_cast<std::size_t>(std::count(string->begin(), string->end(), '\n'));
+            quoted = *string;
         }
         const std::string_view rest = before(text, ends);
         text.remove_prefix(rest.size());
-        value += trimmed(rest);
-        values.push_back(std::move(value));
+        row.add(quoted, trimmed(rest));
         if (text.empty() || text[0] != separator)
             break;
         text.remove_prefix(1);
     }
     next_line(text);
     ++line;
-    return values;
+    return true;
 }
 
-std::size_t wavelengths_in(const Row &fields)
+std::size_t wavelengths_in(const Row &row)
 {
-    return static_cast<std::size_t>(
-        std::count_if(fields.begin(), fields.end(), [](auto &f) { return wavelength_of(f); }));
+    return static_cast<std::size_t>(std::count_if(row.values.begin(), row.values.end(),
+                                                  [](auto field) { return wavelength_of(field); }));
 }
 
-struct Header {
-    Row fields;
+constexpr char separators[] = {',', ';', '\t'};
+
+struct Heading {
+    std::vector<std::string> fields;
     char separator;
 };
 
-// The line as a header under the separator that shows the most wavelengths; one names three at
-// least.
-std::optional<Header> header_in(std::string_view line)
+// The line as a heading under the separator that shows the most wavelengths, three at least, or
+// else under one that shows colours.
+std::optional<Heading> heading_in(std::string_view line, bool spectra)
 {
-    std::optional<Header> best;
+    std::optional<Heading> best;
     std::size_t most = 2;
-    for (const char separator : {',', ';', '\t'}) {
+    Row row;
+    for (const char separator : separators) {
         std::string_view text = line;
         std::size_t lines = 0;
-        auto fields = next_record(text, separator, lines);
-        const std::size_t wavelengths = fields ? wavelengths_in(*fields) : 0;
+        if (!next_record(text, separator, lines, row))
+            continue;
+        std::vector<std::string> fields(row.values.begin(), row.values.end());
+        const std::size_t wavelengths = spectra ? wavelengths_in(row) : has_colours(fields) * 3u;
         if (wavelengths > most) {
             most = wavelengths;
-            best = Header{std::move(*fields), separator};
+            best = Heading{std::move(fields), separator};
         }
     }
     return best;
@@ -74,43 +79,189 @@ std::optional<Header> header_in(std::string_view line)
 
 bool is_blank(const Row &row)
 {
-    return std::all_of(row.begin(), row.end(), [](auto &value) { return value.empty(); });
+    return std::all_of(row.values.begin(), row.values.end(),
+                       [](auto value) { return value.empty(); });
+}
+
+// "Measurement Condition=M0", "Created: 2026-03-02", "Instrument;\"a reader\""
+void take_keyword(std::string_view line, Header &header)
+{
+    const std::string_view keyword = before(
+        line, [](char c) { return std::string_view("=:,;\t").find(c) != std::string_view::npos; });
+    if (keyword.size() == line.size())
+        return;
+    std::string_view value = trimmed(line.substr(keyword.size() + 1));
+    if (value.starts_with('"'))
+        value = before(value.substr(1), [](char c) { return c == '"'; });
+    header.take(keyword, value);
+}
+
+// The rows below the first line that is a heading; false where none is.
+bool read_rows(std::string_view text, Sheet &sheet, bool spectra)
+{
+    std::size_t line = 0;
+    std::optional<Heading> heading;
+    const Work work{sheet.tell(), "Reading", text.size()};
+    sheet.header = {};
+    while (!heading && !text.empty()) {
+        ++line;
+        const std::string_view before_heading = next_line(text);
+        heading = heading_in(before_heading, spectra);
+        if (!heading)
+            take_keyword(before_heading, sheet.header);
+    }
+    if (!heading)
+        return false;
+
+    Table table(sheet, std::move(heading->fields), line);
+    sheet.patches.reserve(static_cast<std::size_t>(std::count(text.begin(), text.end(), '\n')) + 1);
+    Row row;
+    std::string_view statistics; // from where they stand to the end
+    std::size_t statistics_line = 0;
+    bool patches_alone = false; // "Mean" is the name of a patch where others follow
+    while (!text.empty()) {
+        const std::string_view begin = text;
+        const std::size_t at = line + 1;
+        if (!next_record(text, heading->separator, line, row))
+            throw InputError{at, "a quoted text is not closed"};
+        if (is_blank(row))
+            continue;
+        if (!patches_alone && table.is_statistic(row)) {
+            if (statistics.empty()) {
+                statistics = begin;
+                statistics_line = at;
+            }
+            continue;
+        }
+        if (!statistics.empty()) {
+            text = std::exchange(statistics, {});
+            line = statistics_line - 1;
+            patches_alone = true;
+            continue;
+        }
+        while (row.values.size() > table.fields.size() && row.values.back().empty())
+            row.values.pop_back();
+        if (row.values.size() != table.fields.size())
+            throw InputError{at, fmt::format("{} values in a row of {} fields", row.values.size(),
+                                             table.fields.size())};
+        table.add(row, sheet.header.condition, at);
+        work.left(text.size());
+    }
+    work.left(0);
+    if (!statistics.empty())
+        sheet.warn(statistics_line, "the rows of averages at the end are left out");
+    table.finish();
+    return true;
+}
+
+// Where a line begins with a wavelength in nm under this separator.
+std::optional<double> wavelength_at(std::string_view line, char separator)
+{
+    const auto begin = before(line, [&](char c) { return c == separator; });
+    const auto nm = begin.size() < line.size() ? wavelength_of(trimmed(begin)) : std::nullopt;
+    return nm && *nm >= 200 && *nm <= 1100 ? nm : std::nullopt;
+}
+
+// A table whose rows are wavelengths, and whose columns are patches with their names above.
+class Columns {
+public:
+    // Whether the text holds such a table: one wavelength after the other, enough for a spectrum.
+    bool find(std::string_view text);
+    void read(Sheet &sheet);
+
+private:
+    static constexpr std::size_t kFewest = 14; // 410 to 680 nm in steps of 20 nm
+    std::string_view names, rows; // the line above the first wavelength, and from there
+    std::size_t line = 0;         // of the names
+    char separator = ',';
+};
+
+bool Columns::find(std::string_view text)
+{
+    for (const char candidate : {';', '\t', ','}) {
+        separator = candidate;
+        std::string_view rest = text, above;
+        std::size_t count = 0, at = 0;
+        double last = 0;
+        while (!rest.empty() && count < kFewest) {
+            const std::string_view begin = rest, now = next_line(rest);
+            const auto nm = wavelength_at(now, separator);
+            ++at;
+            if (!nm || (count > 0 && *nm <= last)) {
+                count = 0;
+                above = now;
+                line = at;
+            } else if (count++ == 0) {
+                rows = begin;
+                names = above;
+            }
+            last = nm.value_or(0);
+        }
+        if (count == kFewest && !names.empty())
+            return true;
+    }
+    return false;
+}
+
+void Columns::read(Sheet &sheet)
+{
+    Row row;
+    std::size_t at = line - 1;
+    std::string_view rest = names;
+    if (!next_record(rest, separator, at, row))
+        throw InputError{line, "a quoted text is not closed"};
+    std::vector<Patch> patches(row.values.size() - 1);
+    for (std::size_t i = 0; i < patches.size(); ++i) {
+        patches[i].name = printable(row.values[i + 1]);
+        sheet.named = sheet.named || !patches[i].name.empty();
+    }
+    std::vector<double> wavelengths;
+    std::vector<std::vector<double>> values(patches.size());
+    rest = rows;
+    while (!rest.empty()) {
+        const std::size_t begin = at + 1;
+        if (!next_record(rest, separator, at, row))
+            throw InputError{begin, "a quoted text is not closed"};
+        const auto nm = wavelength_of(row.values[0]);
+        if (!nm) {
+            if (is_blank(row))
+                continue;
+            sheet.warn(begin, "what stands below the wavelengths is left out");
+            break;
+        }
+        wavelengths.push_back(*nm);
+        row.values.resize(std::max(row.values.size(), patches.size() + 1));
+        for (std::size_t i = 0; i < patches.size(); ++i) {
+            const auto value = number_in(row.values[i + 1]);
+            if (!value)
+                throw InputError{begin,
+                                 fmt::format("{} is {}, not a number", in_quotes(patches[i].name),
+                                             in_quotes(row.values[i + 1]))};
+            values[i].push_back(*value);
+        }
+    }
+    const Bands &bands = sheet.bands_at(wavelengths, line);
+    for (std::size_t i = 0; i < patches.size(); ++i) {
+        patches[i].refl = bands.of(values[i]);
+        patches[i].id = std::to_string(i + 1);
+        if (patches[i].name.empty())
+            patches[i].name = patches[i].id;
+        sheet.add(std::move(patches[i]), sheet.header.condition, line);
+    }
 }
 
 } // namespace
 
 void read_csv(std::string_view text, Sheet &sheet)
 {
-    std::size_t line = 0;
-    std::optional<Header> header;
-    const Work work{sheet.tell(), "Reading", text.size()};
-    while (!header && !text.empty()) {
-        ++line;
-        header = header_in(next_line(text));
-    }
-    if (!header)
+    Columns columns;
+    if (read_rows(text, sheet, true) || read_rows(text, sheet, false))
+        return;
+    if (!columns.find(text))
         throw InputError{0,
                          "no measurement file: it names no fields of CGATS text "
                          "(BEGIN_DATA_FORMAT), is no XML, and has no CSV header with wavelengths"};
-
-    Table table(sheet, std::move(header->fields), line);
-    while (!text.empty()) {
-        const std::size_t at = line + 1;
-        auto row = next_record(text, header->separator, line);
-        if (!row)
-            throw InputError{at, "a quoted text is not closed"};
-        if (is_blank(*row))
-            continue;
-        while (row->size() > table.fields.size() && row->back().empty())
-            row->pop_back();
-        if (row->size() != table.fields.size())
-            throw InputError{at, fmt::format("{} values in a row of {} fields", row->size(),
-                                             table.fields.size())};
-        table.add(*row, std::nullopt, at);
-        work.left(text.size());
-    }
-    work.left(0);
-    table.finish();
+    columns.read(sheet);
 }
 
 } // namespace vantrel::sheets

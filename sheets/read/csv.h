@@ -7,7 +7,8 @@
 
 namespace vantrel::sheets {
 
-// The rows after the first one that names wavelengths. Throws InputError.
+// The rows after the first one that names wavelengths, or else L*a*b* or XYZ, or the columns beside
+// wavelengths down the rows. Throws InputError.
 void read_csv(std::string_view text, Sheet &sheet);
 
 } // namespace vantrel::sheets

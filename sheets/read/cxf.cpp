@@ -1,107 +1,24 @@
 #include "read/cxf.h"
 
+#include "read/cxf_parts.h"
 #include "read/text.h"
 
 #include <fmt/format.h>
-#include <pugixml.hpp>
 
 #include <algorithm>
-#include <cstring>
+#include <array>
+#include <cmath>
 #include <map>
 #include <utility>
 
 namespace vantrel::sheets {
 namespace {
 
-using Node = pugi::xml_node;
 using Devices = std::vector<std::pair<std::string, double>>;
 
-constexpr std::ptrdiff_t kMostSigns = 16'000'000; // bounds the memory that the parsed text takes
+constexpr std::ptrdiff_t kMostSigns = 32'000'000; // bounds the memory that the parsed text takes
 constexpr std::size_t kLongestInkName = 80;
-
-// The name behind a prefix of a namespace, which each program chooses for itself.
-std::string_view local_name(const char *name)
-{
-    const char *colon = std::strchr(name, ':');
-    return colon ? colon + 1 : name;
-}
-
-bool is(const Node &node, std::string_view name) { return local_name(node.name()) == name; }
-
-Node child(const Node &parent, std::string_view name)
-{
-    return parent.find_child([&](const Node &node) { return is(node, name); });
-}
-
-std::string_view attribute(const Node &node, const char *name)
-{
-    return node.attribute(name).value();
-}
-
-// All text of an element; a comment may divide it.
-std::string text_of(const Node &node)
-{
-    std::string out;
-    for (const Node &part : node.children())
-        if (part.type() == pugi::node_pcdata || part.type() == pugi::node_cdata)
-            out += part.value();
-    return out;
-}
-
-// What visit makes of the elements below one, in their order, until it is something.
-template <typename Visit> auto first_below(const Node &top, Visit visit)
-{
-    decltype(visit(top)) found{};
-    static_cast<void>(top.find_node([&](const Node &node) {
-        found = visit(node);
-        return bool(found);
-    }));
-    return found;
-}
-
-bool contains(std::string_view text, std::string_view part)
-{
-    return upper(text).find(part) != std::string::npos;
-}
-
-// How a ColorSpecification was measured.
-struct Settings {
-    Condition condition;
-    std::optional<double> first_nm, step_nm;
-};
-
-// The condition that one element below a ColorSpecification tells.
-Condition condition_of(const Node &node)
-{
-    const std::string_view name = local_name(node.name());
-    if (contains(name, "ILLUMINATION") || contains(name, "CONDITION") || name == "MeasurementMode")
-        return condition_in(node.child_value());
-    if (contains(attribute(node, "Name"), "CONDITION")) {
-        const std::string_view value = attribute(node, "Value");
-        return condition_in(value.empty() ? node.child_value() : value);
-    }
-    return std::nullopt;
-}
-
-Settings settings_of(const Node &node)
-{
-    Settings out;
-    const Node measurement = child(node, "MeasurementSpec");
-    const Node range = child(measurement, "WavelengthRange");
-    out.first_nm = number_in(attribute(range, "StartWL"));
-    out.step_nm = number_in(attribute(range, "Increment"));
-    const Node device = child(measurement, "Device");
-    if (trimmed(child(device, "DevicePolarization").child_value()) == "true")
-        out.condition = 3;
-    else
-        out.condition = first_below(node, condition_of);
-    if (!out.condition && contains(child(device, "DeviceFilter").child_value(), "UVEXCLUDED"))
-        out.condition = 2;
-    for (const char *name : {"Name", "Id"})
-        if (!out.condition)
-            out.condition = condition_in(attribute(node, name));
-    return out;
-}
+constexpr double kLargestColour = 1e6; // as of reflectances in percent
 
 class Reader {
 public:
@@ -115,36 +32,52 @@ private:
         return line_at(static_cast<std::size_t>(std::max<std::ptrdiff_t>(node.offset_debug(), 0)));
     }
     double number(const Node &node, std::string_view value);
-    void read_tints(const Node &custom);
+    void read_about(const Node &root);
+    void read_target(const Node &object);
     void read_object(const Node &object);
+    void name(Patch &patch, const Node &object);
     Devices device_values(const Node &object);
     std::vector<double> wavelengths(const Node &spectrum, const Settings &settings,
                                     std::size_t count);
-    Condition read_spectrum(const Node &spectrum, Patch &patch);
+    void read_spectrum(const Node &spectrum, const Settings &settings, Patch &patch);
+    CIELABCOORD read_colour(const Node &colour);
+    std::vector<Node> objects(const Node &collection) const;
+
+    const Settings &settings_of(const Node &values)
+    {
+        return all_settings[attribute(values, "ColorSpecification")];
+    }
+
+    // What a place on the printed chart was asked to be.
+    struct Target {
+        std::string name;
+        Devices device;
+        bool used = false;
+    };
 
     std::string_view text;
     Sheet &sheet;
     pugi::xml_document document;
-    std::map<std::string_view, Settings> all_settings;                // by Id
-    std::map<std::string_view, std::pair<std::string, double>> tints; // by the object's Id
+    std::map<std::string_view, Settings> all_settings; // by Id
+    std::map<std::string_view, TintStep> tints;        // by the object's Id
+    std::map<std::string, Target> targets;             // by place
+    std::vector<std::pair<Patch, Condition>> colours;  // of objects with no spectrum
     bool step_missing = false;
-    std::size_t without = 0;           // objects with no spectrum
-    std::size_t repeated = 0;          // spectra of an object under a condition that it has already
-    std::size_t counted = 0, line = 1; // how far the lines are counted
+    std::size_t without = 0;  // objects with no spectrum
+    std::size_t repeated = 0; // spectra of an object under a condition that it has already
+    std::vector<std::size_t> line_ends; // once a line is asked for
 };
 
-// Elements are read in their order, but for a few jumps back; so the lines are counted once.
 std::size_t Reader::line_at(std::size_t offset)
 {
-    offset = std::min(offset, text.size());
-    if (offset < counted) {
-        counted = 0;
-        line = 1;
+    if (line_ends.empty()) {
+        for (std::size_t i = 0; i < text.size(); ++i)
+            if (text[i] == '\n')
+                line_ends.push_back(i);
+        line_ends.push_back(text.size());
     }
-    const std::string_view passed = text.substr(counted, offset - counted);
-    line += static_cast<std::size_t>(std::count(passed.begin(), passed.end(), '\n'));
-    counted = offset;
-    return line;
+    const auto end = std::lower_bound(line_ends.begin(), line_ends.end(), offset);
+    return static_cast<std::size_t>(end - line_ends.begin()) + 1;
 }
 
 double Reader::number(const Node &node, std::string_view value)
@@ -155,38 +88,6 @@ double Reader::number(const Node &node, std::string_view value)
                                                     in_quotes(local_name(node.name())),
                                                     in_quotes(trimmed(value)))};
     return *number;
-}
-
-// The tint steps of CxF/X-4: below a SpotInkCharacterisation, what names a percentage and an
-// object.
-void Reader::read_tints(const Node &custom)
-{
-    constexpr int farthest = 4; // elements between a measurement and the name of its ink
-    first_below(custom, [&](const Node &node) {
-        std::string_view object, tint;
-        for (const auto &attribute : node.attributes()) {
-            const std::string_view name = local_name(attribute.name());
-            if (contains(name, "TINT") || contains(name, "PERCENT"))
-                tint = attribute.value();
-            else if (contains(name, "OBJECT") || contains(name, "REF"))
-                object = attribute.value();
-        }
-        if (object.empty() || tint.empty())
-            return false;
-        std::string_view ink;
-        Node above = node;
-        for (int i = 0; i < farthest && above && ink.empty(); ++i, above = above.parent()) {
-            if (contains(attribute(above, "Background"), "BLACK"))
-                return false; // is no tint on paper
-            ink = attribute(above, "SpotInkName");
-            if (ink.empty())
-                ink = child(above, "SpotInkName").child_value();
-        }
-        if (!trimmed(ink).empty())
-            tints.try_emplace(object, cut(printable(trimmed(ink)), kLongestInkName),
-                              number(node, tint));
-        return false;
-    });
 }
 
 // The first colour of DeviceColorValues that consists of inks, or else of red, green and blue.
@@ -211,7 +112,7 @@ Devices Reader::device_values(const Node &object)
                 inks.emplace_back(
                     cut(printable(trimmed(called)), kLongestInkName),
                     number(part, percent ? percent.child_value() : attribute(part, "Percentage")));
-            } else if (is(colour, "ColorRGB") && name.size() == 1 && contains("RGB", name)) {
+            } else if (is(colour, "ColorRGB") && (name == "R" || name == "G" || name == "B")) {
                 rgb.emplace_back(fmt::format("RGB_{}", name), number(part, part.child_value()));
             }
         }
@@ -220,7 +121,8 @@ Devices Reader::device_values(const Node &object)
     }
     if (rgb.empty())
         if (const auto tint = tints.find(attribute(object, "Id")); tint != tints.end())
-            return {tint->second};
+            return {{cut(printable(tint->second.ink), kLongestInkName),
+                     number(tint->second.node, tint->second.percent)}};
     return rgb;
 }
 
@@ -229,7 +131,8 @@ std::vector<double> Reader::wavelengths(const Node &spectrum, const Settings &se
 {
     const std::string_view stated = attribute(spectrum, "StartWL");
     const auto first = stated.empty() ? settings.first_nm : std::optional(number(spectrum, stated));
-    auto step = settings.step_nm;
+    const std::string_view own_step = attribute(spectrum, "Increment");
+    auto step = own_step.empty() ? settings.step_nm : std::optional(number(spectrum, own_step));
     const double last = first.value_or(0) + 10 * static_cast<double>(count - 1);
     if (first && !step && last >= 700 && last <= 830) {
         step = 10;
@@ -248,7 +151,7 @@ std::vector<double> Reader::wavelengths(const Node &spectrum, const Settings &se
     return nm;
 }
 
-Condition Reader::read_spectrum(const Node &spectrum, Patch &patch)
+void Reader::read_spectrum(const Node &spectrum, const Settings &settings, Patch &patch)
 {
     std::vector<double> values;
     const std::string content = text_of(spectrum);
@@ -263,38 +166,148 @@ Condition Reader::read_spectrum(const Node &spectrum, Patch &patch)
     }
     if (values.empty())
         throw InputError{line_of(spectrum), "a ReflectanceSpectrum without values"};
-    const Settings &settings = all_settings[attribute(spectrum, "ColorSpecification")];
     patch.refl = sheet.bands_at(wavelengths(spectrum, settings, values.size()), line_of(spectrum))
                      .of(values);
-    return settings.condition ? settings.condition : condition_in(attribute(spectrum, "Name"));
 }
 
-void Reader::read_object(const Node &object)
+CIELABCOORD Reader::read_colour(const Node &colour)
 {
-    Patch patch{.id = printable(trimmed(attribute(object, "Id"))),
-                .name = printable(trimmed(attribute(object, "Name"))),
-                .refl = {},
-                .device = device_values(object),
-                .lab = {},
-                .line = 0};
+    const Settings &settings = settings_of(colour);
+    sheet.header.take("ILLUMINANT", settings.illuminant);
+    sheet.header.take("OBSERVER", settings.observer);
+    std::array<double, 3> out{};
+    for (std::size_t i = 0; i < 3; ++i) {
+        const Node node =
+            child(colour, (sheet.xyz ? std::array{"X", "Y", "Z"} : std::array{"L", "A", "B"})[i]);
+        out[i] = number(node ? node : colour, node.child_value());
+        if (std::abs(out[i]) > kLargestColour)
+            throw InputError{line_of(colour), "a colour is too large"};
+    }
+    return {out[0], out[1], out[2]};
+}
+
+void Reader::read_target(const Node &object)
+{
+    const std::string place = place_of(object);
+    if (!place.empty() && !child(object, "ColorValues"))
+        if (Devices device = device_values(object); !device.empty())
+            targets.try_emplace(place, Target{sample_name_of(object), std::move(device), false});
+}
+
+// By the object itself; an object whose name only counts those of its type ("M0_Measurement7") is
+// named by its place on the chart.
+void Reader::name(Patch &patch, const Node &object)
+{
+    patch.id = printable(trimmed(attribute(object, "Id")));
+    patch.name = printable(trimmed(attribute(object, "Name")));
+    patch.device = device_values(object);
+    const std::string place = place_of(object);
+    const auto target = targets.find(place);
+    if (target != targets.end())
+        target->second.used = true;
+    if (target != targets.end() && patch.device.empty())
+        patch.device = target->second.device;
+    const std::string_view type = attribute(object, "ObjectType");
+    if (!place.empty() && !type.empty() && attribute(object, "Name").starts_with(type)) {
+        std::string named = sample_name_of(object);
+        if (named.empty() && target != targets.end())
+            named = target->second.name;
+        patch.id = printable(place);
+        patch.name = named.empty() ? patch.id : named;
+    }
     sheet.named = sheet.named || !patch.id.empty() || !patch.name.empty();
     if (patch.id.empty())
         patch.id = std::to_string(sheet.patches.size() + 1);
     if (patch.name.empty())
         patch.name = patch.id;
+}
+
+void Reader::read_object(const Node &object)
+{
+    const Node values = child(object, "ColorValues");
+    if (!values && targets.contains(place_of(object)))
+        return;
+    Patch patch;
+    name(patch, object);
+
+    // the object's own colours, one for a condition
+    struct Own {
+        CIELABCOORD lab;
+        Condition condition;
+    };
+    std::vector<Own> own;
+    for (const Node &node : values.children())
+        if (is(node, sheet.xyz ? "ColorCIEXYZ" : "ColorCIELab"))
+            own.push_back({read_colour(node), settings_of(node).condition});
+    const auto own_under = [&](Condition condition) -> std::optional<CIELABCOORD> {
+        for (const Own &colour : own)
+            if (colour.condition == condition || !colour.condition)
+                return colour.lab;
+        return std::nullopt;
+    };
+
     std::vector<Condition> seen;
-    for (const Node &spectrum : child(object, "ColorValues").children()) {
-        if (!is(spectrum, "ReflectanceSpectrum"))
+    for (const Node &spectrum : values.children()) {
+        const bool transmission = is(spectrum, "TransmittanceSpectrum");
+        if (!is(spectrum, "ReflectanceSpectrum") && !transmission)
             continue;
-        const Condition condition = read_spectrum(spectrum, patch);
+        const Settings &settings = settings_of(spectrum);
+        const Condition condition =
+            settings.condition ? settings.condition : condition_in(attribute(spectrum, "Name"));
         if (std::find(seen.begin(), seen.end(), condition) != seen.end()) {
             ++repeated;
             continue;
         }
+        if (transmission || settings.quantity.find("Transmi") != std::string_view::npos)
+            sheet.kind = Kind::transmission;
+        read_spectrum(spectrum, settings, patch);
         seen.push_back(condition);
+        patch.lab = own_under(condition);
         sheet.add(patch, condition, line_of(spectrum));
     }
-    without += seen.empty();
+    if (!seen.empty())
+        return;
+    ++without;
+    patch.line = line_of(object);
+    for (const auto &[lab, condition] : own) {
+        patch.lab = lab;
+        colours.emplace_back(patch, condition);
+    }
+}
+
+// Charts are measured in an order of their own; where all places have numbers the objects stand by
+// these, as in other files of the same chart.
+std::vector<Node> Reader::objects(const Node &collection) const
+{
+    std::vector<Node> out;
+    std::vector<std::pair<double, std::size_t>> order;
+    for (const Node &object : collection.children())
+        if (is(object, "Object")) {
+            const auto number = number_in(place_of(object));
+            if (number)
+                order.emplace_back(*number, out.size());
+            out.push_back(object);
+        }
+    if (order.size() != out.size())
+        return out;
+    std::sort(order.begin(), order.end());
+    std::vector<Node> sorted;
+    for (const auto &[number, place] : order)
+        sorted.push_back(out[place]);
+    return sorted;
+}
+
+void Reader::read_about(const Node &root)
+{
+    for (const Node &node : child(root, "FileInformation").children())
+        sheet.header.take(local_name(node.name()), node.child_value());
+    for (const Node &node :
+         child(child(root, "Resources"), "ColorSpecificationCollection").children()) {
+        all_settings.try_emplace(attribute(node, "Id"), settings_in(node));
+        const Node device = child(child(node, "MeasurementSpec"), "Device");
+        sheet.header.take("INSTRUMENT", child(device, "Model").child_value());
+    }
+    sheet.header.condition.reset(); // each spectrum has its own
 }
 
 void Reader::read()
@@ -312,19 +325,33 @@ void Reader::read()
     if (!is(root, "CxF") || !resources)
         throw InputError{line_of(root),
                          fmt::format("not CxF3: {} has no Resources", in_quotes(root.name()))};
-    for (const Node &node : child(resources, "ColorSpecificationCollection").children())
-        all_settings.try_emplace(attribute(node, "Id"), settings_of(node));
-    read_tints(child(root, "CustomResources"));
+    read_about(root);
+    tints = tint_steps(child(root, "CustomResources"));
 
-    const Work work{sheet.tell(), "Reading", text.size()};
-    for (const Node &object : child(resources, "ObjectCollection").children())
-        if (is(object, "Object")) {
-            read_object(object);
-            work.done(counted);
-        }
+    const std::vector<Node> all = objects(child(resources, "ObjectCollection"));
+    for (const Node &object : all)
+        read_target(object);
+    const Work work{sheet.tell(), "Reading", all.size()};
+    for (std::size_t i = 0; i < all.size(); ++i) {
+        read_object(all[i]);
+        work.done(i);
+    }
     work.left(0);
     if (without > 0 && !sheet.patches.empty())
         sheet.warn(0, fmt::format("objects without a reflectance spectrum: {}", without));
+    if (sheet.patches.empty() && !colours.empty()) {
+        sheet.kind = Kind::colours;
+        for (auto &[patch, condition] : colours) {
+            const std::size_t at = patch.line;
+            sheet.add(std::move(patch), condition, at);
+        }
+    }
+    const auto unused = std::count_if(targets.begin(), targets.end(),
+                                      [](const auto &row) { return !row.second.used; });
+    if (unused > 0)
+        sheet.warn(0, fmt::format("target objects without a measurement: {}", unused));
+    sheet.collection = std::all_of(sheet.patches.begin(), sheet.patches.end(),
+                                   [](const Patch &patch) { return patch.device.empty(); });
     if (repeated > 0)
         sheet.warn(
             0, fmt::format("further spectra of an object under the same condition, left out: {}",
@@ -335,7 +362,9 @@ void Reader::read()
 
 void read_cxf(std::string_view text, Sheet &sheet)
 {
-    sheet.largest_fraction = 3; // reflectances are fractions there, below 3
+    sheet.fractions = true;
+    sheet.xyz = text.find("ColorCIELab") == std::string_view::npos &&
+                text.find("ColorCIEXYZ") != std::string_view::npos;
     Reader(text, sheet).read();
 }
 

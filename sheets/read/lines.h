@@ -2,9 +2,11 @@
 #pragma once
 
 #include <algorithm>
+#include <deque>
 #include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
 namespace vantrel::sheets {
 
@@ -18,8 +20,17 @@ template <typename Ends> std::string_view before(std::string_view text, Ends end
 // Takes the next line off the text; a line ends with LF, CRLF or CR.
 std::string_view next_line(std::string_view &text);
 
+// The values of a row, views of the text or of what had to be made.
+struct Row {
+    std::vector<std::string_view> values;
+    std::deque<std::string> made;
+
+    void clear();
+    void add(std::string_view quoted, std::string_view rest); // one behind the other
+};
+
 // Takes the quoted string that the text begins with off it; within it a doubled quote stands for
-// one. Nothing where the string is not closed.
-std::optional<std::string> next_string(std::string_view &text);
+// one, so that it has to be made for the row. Nothing where the string is not closed.
+std::optional<std::string_view> next_string(std::string_view &text, Row &row);
 
 } // namespace vantrel::sheets

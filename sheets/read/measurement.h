@@ -34,13 +34,15 @@ struct Source {
     double last_nm = 0;
     double step_nm = 0;
     std::size_t bands = 0;
-    bool averaged = false; // several of its values make a band
-    bool scaled = false;   // not in percent there
-    std::string scale_by;  // what told the scale: a keyword, "values" or "--scale"
+    bool averaged = false;     // finer steps, brought to 10 nm as Bands::of() does
+    bool interpolated = false; // from steps of 20 nm
+    bool held = false;         // the last value of the range stands for bands outside it
+    bool scaled = false;       // not in percent there
+    std::string scale_by; // what told the scale: a keyword, the kind of file, "values" or "--scale"
     std::string condition; // M0 to M3 (ISO 13655), empty where the file does not say
 };
 
-// What the L*a*b* that a file itself holds were computed for.
+// What colours were computed for, by the file.
 struct Colours {
     std::optional<ILLUM_OBS> illuminant; // where it is one of the library's
     std::string stated;                  // by the file, in its words; empty where it does not say
@@ -77,7 +79,7 @@ struct Measurement {
     Kind kind = Kind::reflectance;
     bool collection = false; // of colours, a spot library, say: no paper among them
     Source source;
-    Colours colours; // where patches have a lab
+    Colours colours;
     Origin origin;
     std::vector<std::string> warnings; // one line each, without the file name
 };

@@ -12,6 +12,9 @@ namespace {
 
 bool is_cgats(std::string_view text)
 {
+    if (text.find("BEGIN_DATA_FORMAT") == std::string_view::npos &&
+        text.find("begin_data_format") == std::string_view::npos)
+        return false; // without going through a long file line by line
     while (!text.empty()) {
         const std::string_view line = trimmed(next_line(text));
         if (equal_ignoring_case(line.substr(0, 17), "BEGIN_DATA_FORMAT"))

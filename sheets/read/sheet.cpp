@@ -3,19 +3,18 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <array>
 #include <cmath>
 #include <set>
+#include <utility>
 
 namespace vantrel::sheets {
 namespace {
 
 constexpr std::size_t kMostWarnings = 20;
+constexpr double kFaintest = 5;         // no sheet is darker throughout
+constexpr double kLightest = 105;       // L*
 constexpr double kLargestPercent = 1e6; // beyond it colours overflow, and no instrument measures it
-
-bool is_word(char c)
-{
-    return (c >= '0' && c <= '9') || (c >= 'A' && c <= 'Z') || (c >= 'a' && c <= 'z');
-}
 
 std::string name_of(const Condition &condition)
 {
@@ -40,26 +39,32 @@ double largest_in(const std::vector<Patch> &patches)
 
 } // namespace
 
-Condition condition_in(std::string_view text)
-{
-    for (std::size_t i = 0; i + 1 < text.size(); ++i)
-        if ((text[i] == 'M' || text[i] == 'm') && text[i + 1] >= '0' && text[i + 1] <= '3' &&
-            (i == 0 || !is_word(text[i - 1])) && (i + 2 == text.size() || !is_word(text[i + 2])))
-            return text[i + 1] - '0';
-    return std::nullopt;
-}
-
 const Bands &Sheet::bands_at(const std::vector<double> &wavelengths, std::size_t line)
 {
-    if (!bands || bands->wavelengths() != wavelengths)
+    if (!bands || bands->wavelengths() != wavelengths) {
         bands.emplace(wavelengths, line);
+        warn_of(bands->source(), line);
+    }
     return *bands;
+}
+
+void Sheet::warn_of(const Source &source, std::size_t line)
+{
+    if (source.interpolated && !std::exchange(told_interpolated, true))
+        warn(line, "steps of 20 nm: the values between are interpolated by third-order Lagrange "
+                   "polynomials (ASTM E2022)");
+    if (source.held && !std::exchange(told_held, true))
+        warn(line, fmt::format("the range is {:g} to {:g} nm: its last value is held up to {}",
+                               source.first_nm, source.last_nm,
+                               source.last_nm >= 700   ? "400 nm"
+                               : source.first_nm > 400 ? "400 and 700 nm"
+                                                       : "700 nm"));
 }
 
 void Sheet::add(Patch patch, Condition condition, std::size_t line)
 {
     if (patches.empty())
-        origin = bands->source();
+        origin = bands ? bands->source() : Source{};
     patch.line = line;
     patches.push_back(std::move(patch));
     conditions.push_back(condition);
@@ -72,6 +77,12 @@ void Sheet::set_full_scale(double value, std::string_view keyword, std::size_t l
                                            value, scale_by, *full_scale)};
     full_scale = value;
     scale_by = keyword;
+}
+
+void Sheet::set_usual_scale(double value, std::string_view kind)
+{
+    usual_scale = value;
+    usually_by = kind;
 }
 
 void Sheet::warn(std::size_t line, const std::string &text)
@@ -109,6 +120,9 @@ void Sheet::choose_condition()
         origin.condition = name_of(chosen);
 }
 
+// Paper with optical brightener reads up to 1.4.
+double Sheet::largest_fraction() const { return fractions ? 3 : 2; }
+
 void Sheet::bring_to_percent()
 {
     const double largest = largest_in(patches);
@@ -120,8 +134,11 @@ void Sheet::bring_to_percent()
         if (percent > 300 || percent <= 2)
             warn(0, fmt::format("by {} the largest reflectance is {:.3g} %; --scale sets the scale",
                                 scale_by, percent));
+    } else if (usual_scale) {
+        full_scale = usual_scale;
+        scale_by = usually_by;
     } else {
-        full_scale = largest <= largest_fraction ? 1 : 100;
+        full_scale = largest <= largest_fraction() ? 1 : 100;
         scale_by = "values";
     }
     origin.scale_by = scale_by;
@@ -133,6 +150,54 @@ void Sheet::bring_to_percent()
                 value *= factor;
             if (!(std::abs(value) <= kLargestPercent))
                 throw InputError{patch.line, "a value is too large in percent"};
+        }
+    if (scale_by == "values")
+        warn_of_guess(largest);
+}
+
+// Nothing reflects this much: few papers and no inks have an L* above 105.
+void Sheet::warn_of_guess(double largest)
+{
+    if (fractions && origin.scaled)
+        return;
+    const char *as = origin.scaled ? "a fraction" : "a percentage";
+    if (largest < kFaintest) {
+        warn(0, fmt::format("no keyword tells the scale: the largest reflectance, {:.3g}, is taken "
+                            "for {}; --scale sets the scale",
+                            largest, as));
+        return;
+    }
+    if (largest * 100 / *full_scale <= kLightest)
+        return;
+    for (const Patch &patch : patches) {
+        std::array<double, 3> lab{};
+        if (ReflToCIELAB(patch.refl.data(), D50_2DEG, lab.data()) && lab[0] > kLightest) {
+            warn(patch.line, fmt::format("no keyword tells the scale: taken for {}, the patch has "
+                                         "an L* of {:.1f}; --scale sets the scale",
+                                         as, lab[0]));
+            return;
+        }
+    }
+}
+
+// X, Y and Z become L*a*b* under the illuminant that the file states, or else D50 and 2 degrees.
+void Sheet::bring_to_lab(const Colours &colours)
+{
+    double largest = 0;
+    for (const Patch &patch : patches)
+        if (patch.lab)
+            largest = std::max(largest, patch.lab->a); // Y
+    const double factor = largest <= largest_fraction() ? 100 : 1;
+    if (factor != 1)
+        warn(0,
+             fmt::format("the largest Y is {:.3g}: X, Y and Z are taken for fractions", largest));
+    for (Patch &patch : patches)
+        if (patch.lab) {
+            const std::array<double, 3> xyz = {patch.lab->L * factor, patch.lab->a * factor,
+                                               patch.lab->b * factor};
+            std::array<double, 3> lab{};
+            XYZToCIELab(xyz.data(), colours.illuminant.value_or(D50_2DEG), lab.data());
+            patch.lab = {lab[0], lab[1], lab[2]};
         }
 }
 
@@ -152,18 +217,27 @@ void Sheet::check_inks()
 Measurement Sheet::measurement()
 {
     if (patches.empty())
-        throw InputError{0, "no spectra in this file"};
+        throw InputError{0, "neither spectra nor L*a*b* nor XYZ in this file"};
+    if (kind == Kind::colours && !reading.colours)
+        throw InputError{
+            0, fmt::format("{} patches of {}, no spectra", patches.size(), xyz ? "XYZ" : "L*a*b*")};
     choose_condition();
-    bring_to_percent();
+    if (kind != Kind::colours)
+        bring_to_percent();
+    const Colours colours = header.colours();
+    if (xyz)
+        bring_to_lab(colours);
     check_inks();
+    if (kind == Kind::transmission)
+        warn(0, "transmission, not reflectance: there is no paper");
     return {.file = {},
             .patches = std::move(patches),
             .named = named,
-            .kind = Kind::reflectance,
-            .collection = false,
+            .kind = kind,
+            .collection = collection,
             .source = std::move(origin),
-            .colours = {},
-            .origin = {},
+            .colours = colours,
+            .origin = std::move(header.origin),
             .warnings = std::move(warnings)};
 }
 

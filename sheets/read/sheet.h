@@ -2,6 +2,7 @@
 #pragma once
 
 #include "read/bands.h"
+#include "read/header.h"
 #include "read/measurement.h"
 
 #include <cstddef>
@@ -11,12 +12,6 @@
 #include <vector>
 
 namespace vantrel::sheets {
-
-// A measurement condition of ISO 13655, 0 to 3 for M0 to M3.
-using Condition = std::optional<int>;
-
-// The condition that a text names as a word: "M1", "M1_Daylight", "CS_M1".
-Condition condition_in(std::string_view text);
 
 class Sheet {
 public:
@@ -32,12 +27,20 @@ public:
     // keyword said otherwise.
     void set_full_scale(double value, std::string_view keyword, std::size_t line);
 
-    // Without a keyword it is 1 or 100; up to this largest reflectance it is 1.
-    double largest_fraction = 2; // paper with optical brightener reads up to 1.4
+    // What it reads in files of this kind where no keyword says it.
+    void set_usual_scale(double value, std::string_view kind);
+
+    // Without either it is 1 or 100, by the largest reflectance; 1 needs no warning where the files
+    // of this kind hold fractions.
+    bool fractions = false;
 
     const Tell &tell() const { return reading.tell; }
     void warn(std::size_t line, const std::string &text);
 
+    Header header;
+    Kind kind = Kind::reflectance;
+    bool collection = false;
+    bool xyz = false; // the lab of the patches holds X, Y, Z
     std::vector<Patch> patches;
     bool named = false; // any of them, by a name or an id of its own
 
@@ -45,8 +48,12 @@ public:
     Measurement measurement();
 
 private:
+    void warn_of(const Source &source, std::size_t line);
     void choose_condition();
     void bring_to_percent();
+    double largest_fraction() const;
+    void warn_of_guess(double largest);
+    void bring_to_lab(const Colours &colours);
     void check_inks();
 
     Reading reading;
@@ -54,8 +61,9 @@ private:
     std::vector<std::string> warnings;
     std::vector<Condition> conditions; // of each patch
     std::optional<Bands> bands;
-    std::optional<double> full_scale;
-    std::string scale_by;
+    std::optional<double> full_scale, usual_scale;
+    std::string scale_by, usually_by;
+    bool told_interpolated = false, told_held = false;
 };
 
 } // namespace vantrel::sheets

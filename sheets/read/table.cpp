@@ -8,20 +8,14 @@
 #include <array>
 #include <cmath>
 #include <initializer_list>
+#include <map>
 
 namespace vantrel::sheets {
 namespace {
 
 constexpr std::size_t kNone = static_cast<std::size_t>(-1);
 constexpr std::size_t kLongestInkName = 80;
-
-// SAMPLE_ID, SampleID and Sample Id are the same field.
-std::string letters(std::string_view field)
-{
-    std::string out = upper(field);
-    std::erase_if(out, [](char c) { return c == '_' || c == ' ' || c == '-'; });
-    return out;
-}
+constexpr double kLargestColour = 1e6; // as of reflectances in percent
 
 // The column of the first of these fields that there is.
 std::size_t column_of(const std::vector<std::string> &keys,
@@ -33,6 +27,66 @@ std::size_t column_of(const std::vector<std::string> &keys,
             return static_cast<std::size_t>(found - keys.begin());
     }
     return kNone;
+}
+
+// L*, a* and b*, or X, Y and Z.
+struct Colour {
+    std::array<std::size_t, 3> columns = {kNone, kNone, kNone};
+    bool xyz = false;
+    std::string illuminant; // behind the name of the first column: Lab_L_D50_2
+
+    bool found() const { return std::count(columns.begin(), columns.end(), kNone) == 0; }
+};
+
+// The columns of colours, by the keys of all fields.
+Colour colour_in(const std::vector<std::string> &keys)
+{
+    constexpr std::array<std::array<std::string_view, 3>, 7> names = {{
+        {"LABL", "LABA", "LABB"},
+        {"CIELABL", "CIELABA", "CIELABB"},
+        {"L*", "A*", "B*"},
+        {"CIEL*", "CIEA*", "CIEB*"},
+        {"L", "A", "B"},
+        {"XYZX", "XYZY", "XYZZ"},
+        {"X", "Y", "Z"},
+    }};
+    for (const auto &family : names) {
+        Colour out;
+        out.xyz = family[0].find('X') != std::string_view::npos;
+        for (std::size_t i = 0; i < keys.size(); ++i)
+            for (std::size_t part = 0; part < 3; ++part) {
+                if (out.columns[part] != kNone || !keys[i].starts_with(family[part]))
+                    continue;
+                const std::string_view rest = std::string_view(keys[i]).substr(family[part].size());
+                const bool light = family[0].size() > 1 &&
+                                   (rest.starts_with('D') || rest == "A2") &&
+                                   (rest.ends_with('2') || rest.ends_with("10"));
+                if (!rest.empty() && !light)
+                    continue;
+                out.columns[part] = i;
+                if (part == 0)
+                    out.illuminant = rest;
+            }
+        if (out.found())
+            return out;
+    }
+    return {};
+}
+
+std::vector<std::string> keys_of(const std::vector<std::string> &fields)
+{
+    std::vector<std::string> keys;
+    for (const std::string &field : fields)
+        keys.push_back(letters(field));
+    return keys;
+}
+
+// The columns of a report as this program writes it to CSV; device values stand between the name
+// and L*.
+bool is_own_report(const std::vector<std::string> &fields)
+{
+    return fields.size() > 4 && fields[0] == "file" && fields[1] == "id" && fields[2] == "name" &&
+           std::find(fields.begin(), fields.end(), "dE00_paper") != fields.end();
 }
 
 // CMYK_M, CMYKOG_O, CMY_C, RGB_R, 6CLR_1: what the printer was asked for, by the standard's names.
@@ -72,6 +126,13 @@ std::string ink_of(std::string key, bool initials)
             if (key == other)
                 return key;
     return percent && (key.starts_with("SPOT") || key.starts_with("INK")) ? key : "";
+}
+
+[[noreturn]] void throw_twice(std::string_view field, std::size_t first, std::size_t second,
+                              std::size_t line)
+{
+    throw InputError{line, fmt::format("{} occurs twice, in columns {} and {}", in_quotes(field),
+                                       first + 1, second + 1)};
 }
 
 bool is_pair_value(std::string_view field)
@@ -123,8 +184,57 @@ bool has_spectra(const std::vector<std::string> &fields)
     return false;
 }
 
+bool has_colours(const std::vector<std::string> &fields)
+{
+    return colour_in(keys_of(fields)).found();
+}
+
 Table::Table(Sheet &sheet, std::vector<std::string> names, std::size_t line)
     : fields(std::move(names)), sheet(sheet)
+{
+    const std::vector<std::string> keys = keys_of(fields);
+    find_colours(keys);
+    if (has_spectra(fields))
+        find_spectra(line);
+    else
+        sheet.kind = Kind::colours;
+
+    id = column_of(keys, {"SAMPLEID", "ID", "PATCHID", "SAMPLENO", "PATCHNO", "NUMBER", "NO"});
+    name = column_of(keys, {"SAMPLENAME", "NAME", "PATCHNAME", "PATCH", "SAMPLE", "LABEL",
+                            "SAMPLELOC", "SAMPLELOCATION", "LOCATION"});
+    condition = column_of(keys, {"MEASUREMENTCONDITION", "CONDITION", "MEASUREMENTMODE", "MEASMODE",
+                                 "TESTMODE", "MODE"});
+    ink = column_of(keys, {"INK", "INKNAME", "COLORANT", "COLOURANT"});
+    tint = column_of(keys, {"TINT", "TINTPCT", "TINT%", "TINTVALUE", "TONEVALUE", "NOMINAL"});
+    find_devices(keys, line);
+    free_names = free_names || tint != kNone;
+    if (tint == kNone) {
+        name = name == kNone ? ink : name;
+        ink = kNone;
+    }
+    for (const std::size_t column : {id, name, condition, tint, lab[0], lab[1], lab[2]})
+        if (column != kNone)
+            if (const auto again = std::find(keys.begin() + static_cast<std::ptrdiff_t>(column) + 1,
+                                             keys.end(), keys[column]);
+                again != keys.end())
+                throw_twice(fields[column], column, static_cast<std::size_t>(again - keys.begin()),
+                            line);
+}
+
+void Table::find_colours(const std::vector<std::string> &keys)
+{
+    const Colour colour = colour_in(keys);
+    lab = colour.columns;
+    sheet.xyz = colour.found() && colour.xyz;
+    if (!colour.illuminant.empty()) {
+        const std::size_t degrees = colour.illuminant.ends_with('2') ? 1 : 2;
+        const auto end = colour.illuminant.size() - degrees;
+        sheet.header.take("ILLUMINANT", colour.illuminant.substr(0, end));
+        sheet.header.take("OBSERVER", colour.illuminant.substr(end));
+    }
+}
+
+void Table::find_spectra(std::size_t line)
 {
     std::string_view unit;
     for (std::size_t i = 0; i < fields.size(); ++i)
@@ -138,53 +248,68 @@ Table::Table(Sheet &sheet, std::vector<std::string> names, std::size_t line)
         sheet.set_full_scale(equal_ignoring_case(unit, "SPECTRAL_DEC") ? 1 : 100, upper(unit),
                              line);
 
-    std::vector<std::string> keys;
-    for (std::size_t i = 0; i < fields.size(); ++i) {
-        keys.push_back(letters(fields[i]));
-        if (const auto wavelength = pairs ? std::nullopt : wavelength_of(fields[i])) {
+    bool percent = false;
+    for (std::size_t i = 0; i < fields.size() && !pairs; ++i)
+        if (const auto wavelength = wavelength_of(fields[i])) {
             wavelengths.push_back(*wavelength);
             values.push_back(i);
+            percent = percent || fields[i].find('%') != std::string::npos;
         }
-    }
+    if (percent)
+        sheet.set_usual_scale(100, "%");
     refl.resize(values.size());
     if (!pairs)
         sheet.bands_at(wavelengths, line);
+}
 
-    id = column_of(keys, {"SAMPLEID", "ID", "PATCHID", "SAMPLENO", "PATCHNO", "NUMBER", "NO"});
-    name = column_of(keys, {"SAMPLENAME", "NAME", "PATCHNAME", "PATCH", "SAMPLE", "LABEL"});
-    condition = column_of(keys, {"MEASUREMENTCONDITION", "CONDITION", "MEASUREMENTMODE", "MODE"});
-    ink = column_of(keys, {"INK", "INKNAME", "COLORANT", "COLOURANT"});
-    tint = column_of(keys, {"TINT", "TINTPCT", "TINT%", "TINTVALUE", "TONEVALUE", "NOMINAL"});
+void Table::find_devices(const std::vector<std::string> &keys, std::size_t line)
+{
     bool initials = true;
     for (const char *initial : {"C", "M", "Y", "K"})
         initials = initials && column_of(keys, {initial}) != kNone;
+    const bool own = is_own_report(fields);
+    const std::size_t lightness = column_of(keys, {"L"});
+    std::map<std::string, std::size_t> seen;
     for (std::size_t i = 0; i < fields.size(); ++i) {
+        const bool free = own && i > 2 && i < lightness; // a name of any kind, in percent
         const bool standard = is_standard_device_field(fields[i]);
-        std::string device = standard ? upper(fields[i]) : ink_of(keys[i], initials);
+        std::string device = standard ? upper(fields[i])
+                             : free   ? fields[i]
+                                      : ink_of(keys[i], initials);
         if (device.empty())
             continue;
-        free_names = free_names || !standard;
-        devices.push_back({i, cut(printable(device), kLongestInkName)});
-    }
-    free_names = free_names || tint != kNone;
-    if (tint == kNone) {
-        name = name == kNone ? ink : name;
-        ink = kNone;
+        free_names = free_names || !(standard || free);
+        device = cut(printable(device), kLongestInkName);
+        if (const auto [before, added] = seen.try_emplace(device, i); !added)
+            throw_twice(fields[i], before->second, i, line);
+        devices.push_back({i, std::move(device)});
     }
 }
 
-double Table::value_at(const Row &row, std::size_t column, std::size_t line) const
+double Table::value_at(const Row &row, std::size_t column, std::size_t line)
 {
-    const auto value = number_in(row[column]);
+    std::string_view text = row.values[column];
+    if (text.ends_with('%')) {
+        text.remove_suffix(1);
+        percent_signs = true;
+    }
+    const auto value = number_in(text);
     if (!value)
         throw InputError{line, fmt::format("{} is {}, not a number", printable(fields[column]),
-                                           in_quotes(trimmed(row[column])))};
+                                           in_quotes(trimmed(text)))};
     return *value;
 }
 
+// A dash stands for nothing; the apostrophe before what a spreadsheet would compute is none of the
+// text.
 std::string Table::text_at(const Row &row, std::size_t column) const
 {
-    return column == kNone ? "" : printable(trimmed(row[column]));
+    if (column == kNone)
+        return "";
+    std::string_view text = trimmed(row.values[column]);
+    if (text.size() > 1 && text[0] == '\'' && std::string_view("=+-@").find(text[1]) != text.npos)
+        text.remove_prefix(1);
+    return text == "-" ? "" : printable(text);
 }
 
 const Bands &Table::bands(const Row &row, std::size_t line)
@@ -202,44 +327,85 @@ const Bands &Table::bands(const Row &row, std::size_t line)
     return sheet.bands_at(wavelengths, line);
 }
 
-// None where all of these columns are blank; among others a blank is 0.
+// A blank tells nothing, as a column that is missing.
 std::vector<std::pair<std::string, double>> Table::device_values(const Row &row, std::size_t line)
 {
     std::vector<std::pair<std::string, double>> out;
-    const auto blank = [&](std::size_t column) { return trimmed(row[column]).empty(); };
+    const auto blank = [&](std::size_t column) { return trimmed(row.values[column]).empty(); };
     if (tint != kNone && !blank(tint)) {
         std::string of = cut(text_at(row, ink), kLongestInkName);
         out.emplace_back(of.empty() ? "TINT" : std::move(of), value_at(row, tint, line));
-    } else if (std::any_of(devices.begin(), devices.end(),
-                           [&](const Device &device) { return !blank(device.column); })) {
-        for (const Device &device : devices)
-            out.emplace_back(device.name,
-                             blank(device.column) ? 0 : value_at(row, device.column, line));
+        return out;
     }
+    out.reserve(devices.size());
+    for (const Device &device : devices)
+        if (!blank(device.column))
+            out.emplace_back(device.name, value_at(row, device.column, line));
     return out;
+}
+
+// Beside a spectrum, what is no number is no colour.
+std::optional<CIELABCOORD> Table::colour(const Row &row, std::size_t line) const
+{
+    std::array<double, 3> out{};
+    for (std::size_t i = 0; i < 3; ++i) {
+        const auto value = lab[i] == kNone ? std::nullopt : number_in(row.values[lab[i]]);
+        if (!value && values.empty())
+            throw InputError{line, fmt::format("{} is {}, not a number", printable(fields[lab[i]]),
+                                               in_quotes(trimmed(row.values[lab[i]])))};
+        if (!value || std::abs(*value) > kLargestColour)
+            return std::nullopt;
+        out[i] = *value;
+    }
+    return CIELABCOORD{out[0], out[1], out[2]};
+}
+
+bool Table::is_statistic(const Row &row) const
+{
+    constexpr std::array words = {
+        "AVERAGE", "AVG",     "MEAN", "STDDEV",  "STDEV",  "STD",   "SD",   "STANDARDDEVIATION",
+        "MIN",     "MINIMUM", "MAX",  "MAXIMUM", "MEDIAN", "RANGE", "COUNT"};
+    const auto is_word = [&](std::string_view value) {
+        const std::string key = letters(value);
+        return std::find(words.begin(), words.end(), key) != words.end();
+    };
+    for (const Device &device : devices)
+        if (device.column < row.values.size() && !row.values[device.column].empty())
+            return false;
+    const std::size_t most = std::min<std::size_t>(row.values.size(), 3);
+    return std::any_of(row.values.begin(), row.values.begin() + static_cast<std::ptrdiff_t>(most),
+                       is_word);
 }
 
 void Table::add(const Row &row, Condition given, std::size_t line)
 {
-    const Bands &at = bands(row, line);
-    for (const std::size_t value : at.used())
-        refl[value] = value_at(row, values[value], line);
+    Patch patch;
+    if (!values.empty()) {
+        const Bands &at = bands(row, line);
+        percent_signs = false;
+        for (const std::size_t value : at.used())
+            refl[value] = value_at(row, values[value], line);
+        if (percent_signs)
+            sheet.set_usual_scale(100, "%");
+        patch.refl = at.of(refl);
+    }
+    patch.lab = colour(row, line);
 
     if (sheet.patches.empty() && id == kNone && name == kNone && ink == kNone)
         for (std::size_t i = 0; i < fields.size() && name == kNone; ++i)
-            if (!trimmed(row[i]).empty() && !number_in(row[i])) // the first column of words
-                name = i;
-    Patch patch;
+            if (!trimmed(row.values[i]).empty() && !number_in(row.values[i]))
+                name = i; // the first column of words
     patch.id = text_at(row, id);
     patch.name = text_at(row, name);
-    patch.refl = at.of(refl);
     sheet.named = sheet.named || ink != kNone || !patch.id.empty() || !patch.name.empty();
     if (patch.id.empty())
         patch.id = std::to_string(sheet.patches.size() + 1);
     if (patch.name.empty() && ink == kNone)
         patch.name = patch.id;
+    percent_signs = false;
     patch.device = device_values(row, line);
-    const Condition own = condition == kNone ? std::nullopt : condition_in(row[condition]);
+    free_names = free_names && !percent_signs;
+    const Condition own = condition == kNone ? std::nullopt : condition_in(row.values[condition]);
     sheet.add(std::move(patch), own ? own : given, line);
 }
 

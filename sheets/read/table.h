@@ -1,8 +1,10 @@
 // Rows of named columns, as CGATS text and CSV hold them, and the patches that they are.
 #pragma once
 
+#include "read/lines.h"
 #include "read/sheet.h"
 
+#include <array>
 #include <cstddef>
 #include <optional>
 #include <string>
@@ -18,16 +20,21 @@ std::optional<double> wavelength_of(std::string_view field);
 // pairs (SPECTRAL_NM with SPECTRAL_DEC or SPECTRAL_PCT).
 bool has_spectra(const std::vector<std::string> &fields);
 
-using Row = std::vector<std::string>; // as many values as there are fields
+// Whether they hold L*a*b* or X, Y and Z.
+bool has_colours(const std::vector<std::string> &fields);
 
 class Table {
 public:
-    // The line names the fields. Throws InputError.
+    // The line names the fields; without spectra among them the colours are read. Throws
+    // InputError.
     Table(Sheet &sheet, std::vector<std::string> names, std::size_t line);
 
-    // A condition in a column of the row itself goes before the one given. Throws
-    // InputError.
+    // A row has as many values as there are fields. A condition in a column of its own goes before
+    // the one given. Throws InputError.
     void add(const Row &row, Condition given, std::size_t line);
+
+    // Whether the row is a mean or another statistic of those above, by its name.
+    bool is_statistic(const Row &row) const;
 
     // Settles what only all rows together tell: whether tints are fractions, which inks there are.
     void finish();
@@ -35,9 +42,13 @@ public:
     const std::vector<std::string> fields;
 
 private:
+    void find_spectra(std::size_t line);
+    void find_colours(const std::vector<std::string> &keys);
+    void find_devices(const std::vector<std::string> &keys, std::size_t line);
     const Bands &bands(const Row &row, std::size_t line);
+    std::optional<CIELABCOORD> colour(const Row &row, std::size_t line) const;
     std::vector<std::pair<std::string, double>> device_values(const Row &row, std::size_t line);
-    double value_at(const Row &row, std::size_t column, std::size_t line) const;
+    double value_at(const Row &row, std::size_t column, std::size_t line);
     std::string text_at(const Row &row, std::size_t column) const;
 
     struct Device {
@@ -51,8 +62,10 @@ private:
     std::vector<double> wavelengths;
     std::vector<double> refl; // of a row, on the file's scale
     std::size_t id, name, condition, ink, tint;
+    std::array<std::size_t, 3> lab; // L*, a*, b*, or X, Y, Z where the sheet says so
     std::vector<Device> devices;
-    bool free_names = false; // of a field that no standard names, and so gives no scale
+    bool free_names = false;    // of a field that no standard names, and so gives no scale
+    bool percent_signs = false; // behind values of the row
 };
 
 } // namespace vantrel::sheets

@@ -74,6 +74,13 @@ bool equal_ignoring_case(std::string_view first, std::string_view second)
     return upper(first) == upper(second);
 }
 
+std::string letters(std::string_view field)
+{
+    std::string out = upper(field);
+    std::erase_if(out, [](char c) { return c == '_' || c == ' ' || c == '-'; });
+    return out;
+}
+
 std::string_view trimmed(std::string_view text)
 {
     const auto begin = text.find_first_not_of(" \t");
@@ -84,16 +91,19 @@ std::string_view trimmed(std::string_view text)
 
 std::optional<double> number_in(std::string_view text)
 {
-    std::string digits(trimmed(text));
-    const auto comma = digits.find(',');
-    if (comma != std::string::npos && digits.find('.') == std::string::npos)
-        digits[comma] = '.';
-    const char *begin = digits.data();
-    const char *end = begin + digits.size();
-    if (digits.size() > 1 && digits[0] == '+' && digits[1] != '-')
-        ++begin;
+    text = trimmed(text);
+    std::string with_point;
+    if (const auto comma = text.find(',');
+        comma != std::string_view::npos && text.find('.') == std::string_view::npos) {
+        with_point = text;
+        with_point[comma] = '.';
+        text = with_point;
+    }
+    if (text.size() > 1 && text[0] == '+' && text[1] != '-')
+        text.remove_prefix(1);
     double value = 0;
-    const auto [last, error] = std::from_chars(begin, end, value);
+    const char *end = text.data() + text.size();
+    const auto [last, error] = std::from_chars(text.data(), end, value);
     if (error != std::errc() || last != end || !std::isfinite(value))
         return std::nullopt;
     return value;
@@ -101,6 +111,8 @@ std::optional<double> number_in(std::string_view text)
 
 std::string printable(std::string_view text)
 {
+    if (std::all_of(text.begin(), text.end(), [](char c) { return c >= ' ' && c <= '~'; }))
+        return std::string(text);
     std::string out;
     while (!text.empty()) {
         const CodePoint next = first_code_point(text);

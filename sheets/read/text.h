@@ -10,6 +10,7 @@ namespace vantrel::sheets {
 
 std::string upper(std::string_view text); // ASCII letters only
 bool equal_ignoring_case(std::string_view first, std::string_view second);
+std::string letters(std::string_view field); // SAMPLE_ID, SampleID and Sample Id are one: SAMPLEID
 std::string_view trimmed(std::string_view text); // without spaces and tabs at both ends
 
 // A finite decimal number that fills the text; a comma is a decimal point where there is none.

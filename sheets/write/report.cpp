@@ -23,9 +23,16 @@ std::string spectra_of(const Source &source)
     std::string out = fmt::format("Spectra: {} values from {:g} to {:g} nm", source.bands,
                                   source.first_nm, source.last_nm);
     if (source.averaged)
-        out += fmt::format(" in steps of {:.3g}, averaged to 10 nm by a triangle", source.step_nm);
+        out += fmt::format(
+            " in steps of {:.3g}, averaged to 10 nm by a triangle and corrected for its "
+            "width (Stearns and Stearns 1988)",
+            source.step_nm);
+    else if (source.interpolated)
+        out += " in steps of 20, interpolated to 10 nm (Lagrange, ASTM E2022)";
     else if (source.first_nm != 400 || source.last_nm != 700)
         out += ", those from 400 to 700 nm used";
+    if (source.held)
+        out += ", the last value held to 400 or 700 nm";
     if (!source.condition.empty())
         out += ", " + source.condition;
     return out + fmt::format("; {} (by {})", source.scaled ? "brought to percent" : "in percent",
@@ -204,6 +211,8 @@ void write_sheet(const Report &report, const Sink &sink)
           {"step_nm", report.source.step_nm},
           {"bands", report.source.bands},
           {"averaged", report.source.averaged},
+          {"interpolated", report.source.interpolated},
+          {"held", report.source.held},
           {"scaled_to_percent", report.source.scaled},
           {"scale_by", report.source.scale_by},
           {"condition", report.source.condition.empty() ? Json() : Json(report.source.condition)}}},

@@ -1,0 +1,147 @@
+#include "read/header.h"
+
+#include "read/illuminant.h"
+#include "read/text.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <array>
+#include <utility>
+
+namespace vantrel::sheets {
+namespace {
+
+bool is_word(char c)
+{
+    return (c >= '0' && c <= '9') || (c >= 'A' && c <= 'Z') || (c >= 'a' && c <= 'z');
+}
+
+// Takes the next word off the text, of letters and digits; empty where there is none.
+std::string_view next_word(std::string_view &text)
+{
+    text.remove_prefix(
+        static_cast<std::size_t>(std::find_if(text.begin(), text.end(), is_word) - text.begin()));
+    const std::string_view word =
+        text.substr(0, static_cast<std::size_t>(
+                           std::find_if_not(text.begin(), text.end(), is_word) - text.begin()));
+    text.remove_prefix(word.size());
+    return word;
+}
+
+bool contains(std::string_view text, std::string_view part)
+{
+    return text.find(part) != std::string_view::npos;
+}
+
+// What stands behind a mark, up to the next blank; empty where the mark is missing.
+std::string_view behind(std::string_view text, std::string_view mark)
+{
+    const auto at = text.find(mark);
+    if (at == std::string_view::npos)
+        return {};
+    const std::string_view rest = text.substr(at + mark.size());
+    return rest.substr(0, rest.find_first_of(" \t,;\""));
+}
+
+// 2 or 10 degrees, the observers of 1931 and 1964.
+std::optional<int> observer_in(std::string_view text)
+{
+    while (!text.empty()) {
+        const std::string_view word = next_word(text);
+        const std::string_view digits =
+            word.substr(0, std::min(word.find_first_not_of("0123456789"), word.size()));
+        if (digits == "2" || digits == "1931")
+            return 2;
+        if (digits == "10" || digits == "1964")
+            return 10;
+    }
+    return std::nullopt;
+}
+
+} // namespace
+
+Condition condition_in(std::string_view text)
+{
+    for (std::size_t i = 0; i + 1 < text.size(); ++i)
+        if ((text[i] == 'M' || text[i] == 'm') && text[i + 1] >= '0' && text[i + 1] <= '3' &&
+            (i == 0 || !is_word(text[i - 1])) && (i + 2 == text.size() || !is_word(text[i + 2])))
+            return text[i + 1] - '0';
+    return std::nullopt;
+}
+
+void Header::take(std::string_view keyword, std::string_view value)
+{
+    const std::string key = letters(keyword);
+    const auto keep = [](std::string &field, std::string_view text) {
+        if (field.empty())
+            field = printable(trimmed(text));
+    };
+    constexpr std::array<std::pair<std::string_view, std::string Origin::*>, 15> texts = {{
+        {"ORIGINATOR", &Origin::originator},
+        {"CREATOR", &Origin::originator},
+        {"OPERATOR", &Origin::originator},
+        {"DESCRIPTOR", &Origin::descriptor},
+        {"FILEDESCRIPTOR", &Origin::descriptor},
+        {"DESCRIPTION", &Origin::descriptor},
+        {"CREATED", &Origin::created},
+        {"CREATIONDATE", &Origin::created},
+        {"MEASUREMENTDATE", &Origin::created},
+        {"DATE", &Origin::created},
+        {"INSTRUMENTATION", &Origin::instrument},
+        {"INSTRUMENT", &Origin::instrument},
+        {"TARGETINSTRUMENT", &Origin::instrument},
+        {"JOB", &Origin::job},
+        {"JOBNAME", &Origin::job},
+    }};
+    for (const auto &[name, field] : texts)
+        if (key == name)
+            keep(origin.*field, value);
+
+    if (key == "QUANTITY" || key == "MEASTYPE" || key == "MEASUREMENTTYPE")
+        keep(quantity, upper(value));
+
+    for (const std::string_view part :
+         {"MEASUREMENT", "ILLUMINATION", "CONDITION", "FILTER", "TESTMODE"})
+        if (contains(key, part))
+            if (const Condition named = condition_in(value)) {
+                condition = named;
+                return;
+            }
+
+    const std::string words = upper(value);
+    if (key == "WEIGHTINGFUNCTION" && words.starts_with("ILLUMINANT"))
+        keep(illuminant, value.substr(std::min(value.find_first_not_of(" ,", 10), value.size())));
+    else if (key == "WEIGHTINGFUNCTION" && words.starts_with("OBSERVER"))
+        keep(observer, value.substr(std::min(value.find_first_not_of(" ,", 8), value.size())));
+    else if (key == "ILLUMINATIONNAME" || key == "ILLUMINANT")
+        keep(illuminant, value);
+    else if (key == "OBSERVERANGLE" || key == "OBSERVER")
+        keep(observer, value);
+    else if (key == "MEASUREMENTSOURCE") {
+        keep(illuminant, behind(words, "ILLUMINATION="));
+        keep(observer, behind(words, "OBSERVERANGLE="));
+    }
+}
+
+bool Header::transmission() const { return contains(quantity, "TRANSMI"); }
+bool Header::reflection() const { return contains(quantity, "REFLECT"); }
+
+bool Header::light() const
+{
+    return contains(quantity, "EMISS") || contains(quantity, "RADIAN") ||
+           contains(quantity, "AMBIENT");
+}
+
+Colours Header::colours() const
+{
+    Colours out;
+    out.stated = illuminant + (illuminant.empty() || observer.empty() ? "" : ", ") + observer;
+    const auto degrees = observer.empty() ? 2 : observer_in(observer);
+    std::string_view text = illuminant;
+    while (degrees && !out.illuminant && !text.empty())
+        out.illuminant = illuminant_named(fmt::format("{}_{}DEG", next_word(text), *degrees));
+    return out;
+}
+
+} // namespace vantrel::sheets

@@ -1,0 +1,35 @@
+// What the keywords of a file say about all of its patches.
+#pragma once
+
+#include "read/measurement.h"
+
+#include <optional>
+#include <string>
+#include <string_view>
+
+namespace vantrel::sheets {
+
+// A measurement condition of ISO 13655, 0 to 3 for M0 to M3.
+using Condition = std::optional<int>;
+
+// The condition that a text names as a word: "M1", "M1_Daylight", "CS_M1".
+Condition condition_in(std::string_view text);
+
+struct Header {
+    Origin origin;
+    std::string quantity; // what was measured: "REFLECTIVE", "TRANSMITTANCE", "EMISSION"
+    std::string illuminant, observer; // of the file's own colours
+    Condition condition;              // the one that was named last
+
+    // The first to say something is believed, but for the condition.
+    void take(std::string_view keyword, std::string_view value);
+
+    bool transmission() const;
+    bool reflection() const;
+    bool light() const;
+
+    // Without an observer it is that of 2 degrees (ISO 13655).
+    Colours colours() const;
+};
+
+} // namespace vantrel::sheets
