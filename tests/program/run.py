@@ -59,6 +59,8 @@ def run(block, folder, environment):
     command = "\n".join([lines[first][2:], *(line[2:] for line in lines[first + 1:end])])
     done = subprocess.run(["sh", "-c", command], cwd=folder, env=environment, capture_output=True,
                           stdin=subprocess.DEVNULL, timeout=300, check=False)
+    if re.search(rb"^sh: \d+: ", done.stderr, re.M):
+        sys.exit(f"{command}\n{done.stderr.decode()}")
     printed = marked(done.stdout, "") + marked(done.stderr, "! ")
     if done.returncode:
         printed.append(f"? {done.returncode}")
