@@ -7,7 +7,7 @@ build_packages=(cmake ninja-build g++ pkg-config
 fuzz_packages=(clang libclang-rt-14-dev)
 page_packages=(npm)
 test_packages=(chromium libgtest-dev libmpfr-dev clang clang-tidy clang-format doxygen binutils python3)
-python_packages=(cmake ninja-build g++ python3-dev python3-venv)
+python_packages=("${build_packages[@]}" python3-dev python3-venv)
 
 # npm may have come with a node that is not Debian's, which Debian's npm would drive out. Debian's is
 # some 400 small packages.

@@ -10,8 +10,8 @@ import pytest
 
 import vantrel
 
-REPOSITORY = Path(__file__).resolve().parents[2]
-GOLDEN = REPOSITORY / "tests" / "golden"
+LIBRARY = Path(__file__).parents[1] / "library"
+GOLDEN = LIBRARY / "golden"
 
 # What the library exports and the package leaves out, and why.
 ABSENT = {
@@ -48,7 +48,7 @@ def find(c_name):
 
 
 def exported_names():
-    for symbol in (REPOSITORY / "src/exports.txt").read_text().split():
+    for symbol in (LIBRARY / "src/exports.txt").read_text().split():
         scope, length, rest = re.match(r"(?:_Z(N9CIEDE2000)?(\d*))?(.*)", symbol).groups()
         name = rest[: int(length)] if length else rest.removesuffix("Ev")
         yield f"CIEDE2000::{name}" if scope else name

@@ -6,15 +6,15 @@ import subprocess
 import sys
 from pathlib import Path
 
-REPOSITORY = Path(__file__).resolve().parents[2]
+LIBRARY = Path(__file__).resolve().parents[1] / "library"
 MARK = "-- end of a block --"
 
 
 def test_the_tutorial_does_what_it_says(tmp_path):
-    text = (REPOSITORY / "docs/python.md").read_text()
+    text = (LIBRARY / "python.md").read_text()
     blocks = re.findall(r"```python\n(.*?)```\n(?:\n```text\n(.*?)```)?", text, re.DOTALL)
     assert len(blocks) > 7
-    (tmp_path / "examples").symlink_to(REPOSITORY / "examples")
+    (tmp_path / "examples").symlink_to(LIBRARY / "examples")
     script = "".join(f"{code}\nprint({MARK!r})\n" for code, _ in blocks)
     # not from a file, which the workers of the cluster would run again
     run = subprocess.run(

@@ -186,8 +186,12 @@ PyMODINIT_FUNC PyInit__ufuncs() // NOLINT(bugprone-reserved-identifier,cert-*)
     if (module && c_names && add_rows(module, c_names, colour_rows()) &&
         add_rows(module, c_names, density_rows()) && add_words(module) && add_den_weight(module) &&
         PyModule_AddObject(module, "c_names", c_names) == 0 &&
-        PyModule_AddStringConstant(module, "version", VANTREL_VERSION) == 0)
+        PyModule_AddStringConstant(module, "version", VANTREL_VERSION) == 0) {
+#ifdef Py_GIL_DISABLED
+        PyUnstable_Module_SetGIL(module, Py_MOD_GIL_NOT_USED);
+#endif
         return module;
+    }
     Py_XDECREF(c_names);
     Py_XDECREF(module);
     return nullptr;

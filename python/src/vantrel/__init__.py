@@ -7,6 +7,13 @@ A spectrum is the last dimension of an array: 31 values, the reflectance at 400,
 in percent. Functions take anything that broadcasts; each is a NumPy generalized ufunc underneath
 (`vantrel.ufuncs`), runs without the interpreter lock, and takes Dask and xarray arrays as well.
 
+The examples of the functions use these spectra:
+
+>>> nm = np.arange(400, 701, 10)
+>>> paper = np.full(31, 85.0)
+>>> cyan, magenta, yellow = (paper - 75 * dark for dark in (nm > 580, abs(nm - 540) < 50, nm < 490))
+>>> tint = (magenta + paper) / 2
+
 An argument that is wrong for the whole call raises ValueError. A row that the library refuses,
 black where a chromaticity is asked for, is NaN, and `ok=True` adds an output that tells which rows
 were accepted.
@@ -136,6 +143,7 @@ from ._constants import (
     set_spectralx_constants,
     settings,
 )
+from ._sheet import Origin, Sheet, Source, read, reads
 from ._wavelengths import resample
 
 __version__ = ufuncs.version

@@ -41,27 +41,88 @@ def _place(setter, getter, wavelengths, shapes):
 def set_hifi_constants(wavelengths, shape1=None, shape2=None, shape3=None):
     """Places the three HiFi bands and rebuilds their rows of `den_weight`.
 
-    `wavelengths`: three centres in nm, cut to their band; one outside 430 to below 680, or NaN,
-    leaves its band as it was. `shape1` to `shape3`: seven relative weights around each centre in
-    steps of 10 nm; None takes the shape that the band has along to the new centre.
+    Parameters
+    ----------
+    wavelengths : array_like (3,)
+        Centres in nm, cut to their band; one outside 430 to below 680, or NaN, leaves its band as
+        it was.
+    shape1, shape2, shape3 : array_like (7,), optional
+        Relative weights around each centre in steps of 10 nm; None takes the shape that the band
+        has along to the new centre.
+
+    Raises
+    ------
+    ValueError
+        Where the shape of an argument is another.
+
+    Examples
+    --------
+    >>> with vantrel.settings():
+    ...     vantrel.set_hifi_constants([550, 600, 640])
+    ...     print(vantrel.get_hifi_constants()[0])
+    [550. 600. 640.]
     """
     shapes = {"shape1": shape1, "shape2": shape2, "shape3": shape3}
     _place(_ufuncs.set_hifi_constants, get_hifi_constants, wavelengths, shapes)
 
 
 def get_hifi_constants():
-    """The HiFi bands: (wavelengths in nm, shape1, shape2, shape3), shapes with 1 in the centre."""
+    """The HiFi bands.
+
+    Returns
+    -------
+    wavelengths : array (3,)
+        Centres in nm.
+    shape1, shape2, shape3 : array (7,)
+        Weights around each, 1 in the centre.
+
+    Examples
+    --------
+    >>> print(vantrel.get_hifi_constants()[0])
+    [530. 630. 620.]
+    """
     return _read(_ufuncs.get_hifi_constants, 3, 7, 7, 7)
 
 
 def set_hexachrome_constants(wavelengths, shape1=None, shape2=None):
-    """Places the two Hexachrome bands; as set_hifi_constants()."""
+    """Places the two Hexachrome bands; as set_hifi_constants().
+
+    Parameters
+    ----------
+    wavelengths : array_like (2,)
+    shape1, shape2 : array_like (7,), optional
+
+    Raises
+    ------
+    ValueError
+        Where the shape of an argument is another.
+
+    Examples
+    --------
+    >>> with vantrel.settings():
+    ...     vantrel.set_hexachrome_constants([450, 620], shape2=[0, 0, 1, 1, 1, 0, 0])
+    ...     print(vantrel.get_hexachrome_constants()[2].round(2))
+    [0. 0. 1. 1. 1. 0. 0.]
+    """
     shapes = {"shape1": shape1, "shape2": shape2}
     _place(_ufuncs.set_hexachrome_constants, get_hexachrome_constants, wavelengths, shapes)
 
 
 def get_hexachrome_constants():
-    """The Hexachrome bands: (wavelengths in nm, shape1, shape2)."""
+    """The Hexachrome bands.
+
+    Returns
+    -------
+    wavelengths : array (2,)
+        Centres in nm.
+    shape1, shape2 : array (7,)
+        Weights around each, 1 in the centre.
+
+    Examples
+    --------
+    >>> print(vantrel.get_hexachrome_constants()[0])
+    [440. 630.]
+    """
     return _read(_ufuncs.get_hexachrome_constants, 2, 7, 7)
 
 
@@ -81,9 +142,27 @@ def _set(setter, getter, values, reason):
 
 
 def set_spectralx_constants(tolerance, reserved, centre, inner, outer):
-    """Sets the SpectralX constants; the weight of the centre must be 1.
+    """Sets the SpectralX constants.
 
-    `tolerance`: how far above the lowest windowed sum, in percent, a band still counts as a peak.
+    Parameters
+    ----------
+    tolerance : float
+        How far above the lowest windowed sum, in percent, a band still counts as a peak.
+    reserved : float
+    centre, inner, outer : float
+        Weights of the window; that of the centre must be 1.
+
+    Raises
+    ------
+    ValueError
+        Where the weight of the centre is not 1, or a constant is NaN.
+
+    Examples
+    --------
+    >>> with vantrel.settings():
+    ...     vantrel.set_spectralx_constants(2, 84, 1, 0.4, 0.2)
+    ...     print(*vantrel.get_spectralx_constants())
+    2.0 84.0 1.0 0.4 0.2
     """
     _set(
         _ufuncs.set_spectralx_constants,
@@ -94,12 +173,40 @@ def set_spectralx_constants(tolerance, reserved, centre, inner, outer):
 
 
 def get_spectralx_constants():
-    """The SpectralX constants: (tolerance, reserved, centre, inner, outer)."""
+    """The SpectralX constants.
+
+    Returns
+    -------
+    tolerance, reserved, centre, inner, outer : float
+
+    Examples
+    --------
+    >>> print(*vantrel.get_spectralx_constants())
+    2.0 84.0 1.0 0.5 0.1
+    """
     return _numbers(_ufuncs.get_spectralx_constants, 5)
 
 
 def set_achromatic_constants(L1, L2, C1, C2):
-    """Sets the line above which a colour is chromatic, through (L1, C1) and (L2, C2)."""
+    """Sets the line above which a colour is chromatic.
+
+    Parameters
+    ----------
+    L1, L2, C1, C2 : float
+        It goes through (L1, C1) and (L2, C2).
+
+    Raises
+    ------
+    ValueError
+        Where no finite line goes through these points.
+
+    Examples
+    --------
+    >>> with vantrel.settings():
+    ...     vantrel.set_achromatic_constants(90, 10, 2, 12)
+    ...     print(*vantrel.get_achromatic_constants())
+    90.0 10.0 2.0 12.0
+    """
     _set(
         _ufuncs.set_achromatic_constants,
         get_achromatic_constants,
@@ -109,7 +216,17 @@ def set_achromatic_constants(L1, L2, C1, C2):
 
 
 def get_achromatic_constants():
-    """The line of is_chromatic(): (L1, L2, C1, C2)."""
+    """The line of is_chromatic().
+
+    Returns
+    -------
+    L1, L2, C1, C2 : float
+
+    Examples
+    --------
+    >>> print(*vantrel.get_achromatic_constants())
+    84.0 14.0 3.0 11.0
+    """
     return _numbers(_ufuncs.get_achromatic_constants, 4)
 
 
@@ -117,9 +234,26 @@ def get_achromatic_constants():
 def settings(*, hifi=None, hexachrome=None, spectralx=None, achromatic=None):
     """Sets constants for the calls inside of a `with`, and all as they were after it.
 
-    Each takes the arguments of its set_ function, in a tuple. `den_weight` is restored too. They
-    hold for all threads of the process, and for what Dask arrays are asked inside, wherever and
-    whenever it is computed.
+    They hold for all threads of the process, and for what Dask arrays are asked inside, wherever
+    and whenever it is computed. `den_weight` is restored too.
+
+    Parameters
+    ----------
+    hifi, hexachrome, spectralx, achromatic : tuple, optional
+        The arguments of set_hifi_constants() and so on.
+
+    Raises
+    ------
+    ValueError
+        As the functions that set them.
+
+    Examples
+    --------
+    >>> with vantrel.settings(hifi=([480, 560, 620],)):
+    ...     print(vantrel.refl_to_density(magenta, None, "HIFI", "HIFI2").round(3))
+    0.922
+    >>> print(vantrel.refl_to_density(magenta, None, "HIFI", "HIFI2").round(3))
+    0.071
     """
     kept = _ufuncs.get_settings()
     asked = {

@@ -7,13 +7,16 @@ from . import _ufuncs
 from ._arguments import library_of
 from ._dask import on_dask
 from ._declared import DECLARED, WORDS, Declared, evaluate
+from ._kinds import meaning_of
 from ._xarray import on_xarray
 
-_OUT = """
-    `out`: array, or tuple of arrays, that takes the result (not for Dask and xarray)."""
-_OK = """
-    `ok`: with `ok=True` a last output tells which rows the library accepted; a refused row is NaN
-    (-1 in integers, "" in words) either way."""
+_OUT = """out : array or tuple of arrays, optional
+    Takes the result; not for Dask and xarray."""
+_OK = """ok : bool, default False
+    Whether a last output tells which rows were accepted. A row that is refused, or that holds a NaN,
+    is NaN (-1 in integers, False, "" in words) either way."""
+_RAISES = "ValueError\n    Where an argument is wrong for the whole call, with its name and the reason."
+_TYPES = {"f": "float", "i": "int", "u": "int", "b": "bool", "U": "str"}
 
 
 def _dispatch(declared, *values, ok=False, out=None):
@@ -25,6 +28,44 @@ def _dispatch(declared, *values, ok=False, out=None):
     if "dask" in library:
         return on_dask(declared, values, ok)
     return evaluate(declared.name, ok, *values, out=out)
+
+
+def _shape(core):
+    """(..., 31) for the core "31"; a spectrum that may be missing has one of its own name."""
+    sizes = {"p": "31", "q": "31"}
+    return f" (..., {', '.join(sizes.get(d, d) for d in core)})" if core else ""
+
+
+def _documentation(declared, declaration, keywords):
+    """The text of a declaration, with a section for each of parameters, results and faults."""
+    text = inspect.cleandoc(declaration.__doc__ or "")  # python -OO drops them
+    text, prompt, example = text.partition("\n>>> ")
+    parameters = [
+        f"{p.name} : array_like{_shape(core)}"
+        + ("" if p.default is p.empty else f", default {p.default!r}")
+        + f"\n    {meaning_of(p.annotation)}"
+        for p, core in zip(declared.parameters, declared.cores)
+    ]
+    parameters += [{"out": _OUT, "ok": _OK}[name] for name in keywords]
+    results = [
+        f"{name} : {_TYPES[dtype.kind]} or array{_shape(core)}"
+        for name, core, dtype in zip(declared.outputs, *declared.result_types(False))
+    ]
+    c_name = _ufuncs.c_names[declared.name]
+    notes = [
+        (declaration.__globals__["__doc__"] or "").partition("\n\n")[2].strip(),
+        f"Shapes: {declared.signature}, broadcast as NumPy does."
+        + (f" C function: {c_name}." if c_name else ""),
+    ]
+    sections = {
+        "Parameters": "\n".join(parameters),
+        "Returns": "\n".join(results),
+        "Raises": _RAISES,
+        "Notes": "\n\n".join(filter(None, notes)),
+        "Examples": prompt.strip("\n") + example,
+    }
+    titled = [f"{title}\n{'-' * len(title)}\n{body}" for title, body in sections.items() if body]
+    return "\n\n".join([text.strip(), *titled])
 
 
 def function(*outputs):
@@ -46,21 +87,15 @@ def function(*outputs):
             values = declared.prepare(declared.bind(args, kwargs))
             return _dispatch(declared, *values, ok=bool(ok), out=out)
 
-        text = inspect.cleandoc(declaration.__doc__ or "")  # python -OO drops them
-        subject = (declaration.__globals__["__doc__"] or "").partition("\n\n")[2].strip()
-        shapes = f"Shapes: {declared.signature}, broadcast as NumPy does."
-        c_name = _ufuncs.c_names[declared.name]
-        source = f"C function: {c_name}." if c_name else ""
-        keywords = {"out": (None, _OUT), "ok": (False, _OK)}
-        if declared.name in WORDS:
+        keywords = {"out": None, "ok": False}
+        if not plain:
             del keywords["out"]
         if not declared.flagged:
             del keywords["ok"]
-        more = inspect.cleandoc("".join(note for _, note in keywords.values()))
-        call.__doc__ = "\n\n".join(filter(None, (text, subject, f"{shapes} {source}", more)))
+        call.__doc__ = _documentation(declared, declaration, keywords)
         extra = [
             inspect.Parameter(name, inspect.Parameter.KEYWORD_ONLY, default=default)
-            for name, (default, _) in keywords.items()
+            for name, default in keywords.items()
         ]
         call.__signature__ = inspect.Signature(declared.parameters + extra)
         return call

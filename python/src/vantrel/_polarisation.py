@@ -24,12 +24,22 @@ from ._kinds import (
 def pol_refl_adjust(
     spectra: "Spectra", response: "ResponseName", targets: "Numbers", weights: "Numbers"
 ):
-    """Spectra as the channel of a response adjusts them."""
+    """Spectra as the channel of a response adjusts them.
+
+    >>> print(np.round(vantrel.pol_refl_adjust(magenta, "GREEN", [1000] * 4, np.ones((4,
+    ...     31)))[[0, 15]], 2))
+    [43.37  5.1 ]
+    """
 
 
 @function("refl")
 def pol_refl_auto_adjust(spectra: "Spectra", targets: "Numbers", weights: "Numbers"):
-    """pol_refl_adjust() in the response of determine_density_response() under E_STATUS."""
+    """pol_refl_adjust() in the response of determine_density_response() under E_STATUS.
+
+    >>> print(np.round(vantrel.pol_refl_auto_adjust(magenta, [1000] * 4, np.ones((4,
+    ...     31)))[[0, 15]], 2))
+    [43.37  5.1 ]
+    """
 
 
 @function("response")
@@ -44,6 +54,10 @@ def pol_determine_density_response(
     """determine_density_response() of adjusted spectra over an adjusted paper.
 
     0, which is also the visual response, where an adjustment fails.
+
+    >>> print(vantrel.pol_determine_density_response(magenta, [1000] * 4, "E", paper,
+    ...     [2000] * 4, np.ones((4, 31))))
+    2
     """
 
 
@@ -57,7 +71,12 @@ def pol_refl_to_density(
     status: "StatusName",
     response: "Reading",
 ):
-    """refl_to_density() of spectra over the paper, each after pol_refl_auto_adjust()."""
+    """refl_to_density() of spectra over the paper, each after pol_refl_auto_adjust().
+
+    >>> print(np.round(vantrel.pol_refl_to_density(magenta, [1000] * 4, paper, [2000] * 4,
+    ...     np.ones((4, 31)), "E", "GREEN"), 3))
+    1.045
+    """
 
 
 @function("densities")
@@ -69,7 +88,12 @@ def pol_refl_to_densities(
     weights: "Numbers",
     status: "StatusName",
 ):
-    """refl_to_densities() with the spectrum adjusted for each response on its own."""
+    """refl_to_densities() with the spectrum adjusted for each response on its own.
+
+    >>> print(np.round(vantrel.pol_refl_to_densities(magenta, [1000] * 4, paper,
+    ...     [2000] * 4, np.ones((4, 31)), "E"), 2))
+    [0.5  0.17 1.04 0.17 0.   0.   0.   0.   0.  ]
+    """
 
 
 @function("grayness", "hue_error")
@@ -81,7 +105,12 @@ def pol_refl_to_hue_gray(
     weights: "Numbers",
     status: "HueStatus",
 ):
-    """Grayness and hue error in percent of pol_refl_to_densities()."""
+    """Grayness and hue error in percent of pol_refl_to_densities().
+
+    >>> print(np.round(vantrel.pol_refl_to_hue_gray(magenta, [1000] * 4, paper, [2000] * 4,
+    ...     np.ones((4, 31)), "E"), 1))
+    [16.6  0.1]
+    """
 
 
 @function("dot_area")
@@ -97,7 +126,12 @@ def pol_refl_to_dot_area(
     response: "Reading",
     n_factor: "Numbers" = 1,
 ):
-    """refl_to_dot_area() in percent of spectra, each after pol_refl_auto_adjust()."""
+    """refl_to_dot_area() in percent of spectra, each after pol_refl_auto_adjust().
+
+    >>> print(np.round(vantrel.pol_refl_to_dot_area(magenta, [1000] * 4, tint, [1500] * 4,
+    ...     paper, [2000] * 4, np.ones((4, 31)), "E", "GREEN"), 1))
+    56.3
+    """
 
 
 @function("dot_gain")
@@ -114,7 +148,12 @@ def pol_refl_to_dot_gain(
     n_factor: "Numbers",
     nominal_dot_area: "Integers",
 ):
-    """refl_to_dot_gain() in percent of spectra, each after pol_refl_auto_adjust()."""
+    """refl_to_dot_gain() in percent of spectra, each after pol_refl_auto_adjust().
+
+    >>> print(np.round(vantrel.pol_refl_to_dot_gain(magenta, [1000] * 4, tint, [1500] * 4,
+    ...     paper, [2000] * 4, np.ones((4, 31)), "E", "GREEN", 1, 40), 1))
+    16.3
+    """
 
 
 @function("contrast")
@@ -129,7 +168,12 @@ def pol_refl_to_print_contrast(
     status: "StatusName",
     response: "Reading",
 ):
-    """refl_to_print_contrast() in percent of spectra, each after pol_refl_auto_adjust()."""
+    """refl_to_print_contrast() in percent of spectra, each after pol_refl_auto_adjust().
+
+    >>> print(np.round(vantrel.pol_refl_to_print_contrast(magenta, [1000] * 4, tint,
+    ...     [1500] * 4, paper, [2000] * 4, np.ones((4, 31)), "E", "GREEN"), 1))
+    70.2
+    """
 
 
 @function("trap")
@@ -146,4 +190,9 @@ def pol_refl_to_trap(
     status: "StatusName",
     response: "Reading",
 ):
-    """refl_to_trap() in percent of spectra, each after pol_refl_auto_adjust()."""
+    """refl_to_trap() in percent of spectra, each after pol_refl_auto_adjust().
+
+    >>> print(np.round(vantrel.pol_refl_to_trap(magenta, [1000] * 4, yellow, [1000] * 4,
+    ...     np.minimum(magenta, yellow), [500] * 4, paper, [2000] * 4, np.ones((4, 31)), "E", "GREEN"), 1))
+    95.1
+    """

@@ -1,0 +1,267 @@
+"""Measurement files: CGATS text, CSV and CxF, from the file to arrays."""
+
+import html
+import os
+import warnings
+from dataclasses import dataclass, field
+from typing import Any, Dict, List, Literal, Optional, Union
+
+import numpy as np
+from numpy.typing import NDArray
+
+from ._colour import refl_to_cielab, refl_to_rgb, unpack_rgb
+from ._enums import IllumObs
+from ._wavelengths import NM
+
+Scale = Literal["automatic", "percent", "fraction"]
+Condition = Optional[Literal["M0", "M1", "M2", "M3"]]
+_SCALES = {"automatic": 0, "percent": 1, "fraction": 2}
+_MOST_SHOWN = 200  # patches in a notebook
+
+
+@dataclass(frozen=True)
+class Source:
+    """What the spectra looked like in the file.
+
+    `averaged`: several of its values make a band. `scaled`: they are not in percent there, and
+    `scale_by` says what told so. `condition`: M0 to M3 (ISO 13655), "" where the file does not say.
+    """
+
+    first_nm: float
+    last_nm: float
+    step_nm: float
+    bands: int
+    averaged: bool
+    scaled: bool
+    scale_by: str
+    condition: str
+
+
+@dataclass(frozen=True)
+class Origin:
+    """Who measured what and when, in the words of the file; "" where it does not say."""
+
+    originator: str
+    descriptor: str
+    created: str
+    instrument: str
+    job: str
+
+
+@dataclass(frozen=True, eq=False)
+class Sheet:
+    """The patches of a measurement file.
+
+    Attributes
+    ----------
+    spectra : array (n, 31) or None
+        Reflectance (transmittance) in percent at 400, 410, ... 700 nm; None where the file holds
+        colours alone.
+    names, ids : list of str
+        Of the patches.
+    device : dict of str to array (n,)
+        Dot areas and the like by field, "CMYK_M" for instance; NaN where a patch has none.
+    lab : array (n, 3) or None
+        L*a*b* that the file itself holds, computed for `lab_illuminant` or, in the words of the
+        file, `lab_stated`.
+    kind : str
+        "reflectance", "transmission" or "colours".
+    source : Source
+        What the spectra looked like in the file; None for colours alone.
+    origin : Origin
+        Who measured what and when.
+    file : str
+        The name of the file, "" for bytes.
+    warnings : list of str
+        What the reader found odd.
+    """
+
+    spectra: Optional[NDArray[np.float64]]
+    names: List[str]
+    ids: List[str]
+    device: Dict[str, NDArray[np.float64]]
+    lab: Optional[NDArray[np.float64]]
+    lab_illuminant: Optional[IllumObs]
+    lab_stated: str
+    kind: str
+    source: Optional[Source]
+    origin: Origin
+    file: str = ""
+    warnings: List[str] = field(default_factory=list)
+
+    def __len__(self) -> int:
+        return len(self.names)
+
+    def index(self, name: str) -> int:
+        """The place of the first patch of this name, or else of this id; KeyError without one."""
+        for labels in self.names, self.ids:
+            if name in labels:
+                return labels.index(name)
+        raise KeyError(f"no patch {name!r}; the patches are {', '.join(self.names[:8])} ...")
+
+    def __getitem__(self, name: str) -> NDArray[np.float64]:
+        """The spectrum of a patch, by its name or id."""
+        if self.spectra is None:
+            raise KeyError(f"{name!r} has no spectrum: the file holds colours alone")
+        return self.spectra[self.index(name)]
+
+    def to_pandas(self) -> Any:
+        """A DataFrame: id, name, device values, the spectrum by wavelength, L*a*b* of the file."""
+        import pandas as pd
+
+        columns = {"id": self.ids, "name": self.names, **self.device}
+        if self.spectra is not None:
+            columns.update(zip(NM.astype(int).tolist(), self.spectra.T))
+        if self.lab is not None:
+            columns.update(zip(("L", "a", "b"), self.lab.T))
+        return pd.DataFrame(columns)
+
+    def to_xarray(self) -> Any:
+        """The spectra as a DataArray over patch and nm, names and device values as coordinates."""
+        import xarray as xr
+
+        if self.spectra is None:
+            raise ValueError("the file holds colours alone, no spectra")
+        by_patch = {"name": self.names, "id": self.ids, **self.device}
+        coordinates = {label: ("patch", values) for label, values in by_patch.items()}
+        return xr.DataArray(self.spectra, {**coordinates, "nm": NM}, ("patch", "nm"), name="refl")
+
+    def _colours(self) -> Any:
+        """(L*a*b*, what it is for, swatches) of the patches that a notebook shows."""
+        if self.spectra is None:
+            stated = self.lab_illuminant.name if self.lab_illuminant is not None else ""
+            return self.lab[:_MOST_SHOWN], stated or self.lab_stated, None
+        shown = self.spectra[:_MOST_SHOWN]
+        # under D65, the white of displays
+        return refl_to_cielab(shown), "D50_2DEG", unpack_rgb(refl_to_rgb(shown, "D65_2DEG"))
+
+    def _repr_html_(self) -> str:
+        lab, light, swatches = self._colours()
+        head = ["", "id", "name", *self.device, "L*", "a*", "b*"]
+        rows = []
+        for i, colour in enumerate(lab):
+            rgb = "none" if swatches is None else f"rgb{tuple(swatches[i].tolist())}"
+            values = [f"{column[i]:g}" for column in self.device.values()]
+            cells = [self.ids[i], self.names[i], *values, *(f"{c:.2f}" for c in colour)]
+            rows.append(
+                f'<tr><td style="background:{rgb};min-width:3em"></td>'
+                + "".join(f"<td>{html.escape(cell)}</td>" for cell in cells)
+                + "</tr>"
+            )
+        left_out = len(self) - len(rows)
+        return (
+            f"<p>{html.escape(self.file)}: {len(self)} patches, L*a*b* for {html.escape(light)}</p>"
+            + "<table><tr>"
+            + "".join(f"<th>{html.escape(title)}</th>" for title in head)
+            + f"</tr>{''.join(rows)}</table>"
+            + (f"<p>{left_out} more patches are not shown</p>" if left_out else "")
+        )
+
+
+def _array(buffer: Any, *shape: int) -> NDArray[np.float64]:
+    return np.frombuffer(buffer, dtype=np.float64).reshape(shape)
+
+
+def _sheet(
+    content: bytes, file: str, scale: str, condition: Optional[str], level: int
+) -> Sheet:
+    try:
+        from . import _sheets
+    except ImportError:
+        raise NotImplementedError("vantrel was built without the reader of measurement files")
+    if scale not in _SCALES:
+        raise ValueError(f"scale: {scale!r} is not one of {', '.join(_SCALES)}")
+    if condition not in (None, "M0", "M1", "M2", "M3"):
+        raise ValueError(f"condition: {condition!r} is not one of M0, M1, M2, M3")
+    try:
+        found = _sheets.read(content, _SCALES[scale], condition or "")
+    except ValueError as error:
+        raise ValueError(f"{file}: {error}" if file else str(error)) from None
+    said = [
+        line.strip().replace("--condition", "condition=").replace("--scale", "scale=")
+        for line in found["warnings"]
+    ]
+    for line in said:
+        warnings.warn(f"{file}: {line}" if file else line, stacklevel=level)
+    illuminant = found.get("lab_illuminant")
+    return Sheet(
+        spectra=_array(found["spectra"], -1, 31) if "spectra" in found else None,
+        names=found["names"],
+        ids=found["ids"],
+        device={name: _array(column, -1) for name, column in found["device"].items()},
+        lab=_array(found["lab"], -1, 3) if "lab" in found else None,
+        lab_illuminant=None if illuminant is None else IllumObs(illuminant),
+        lab_stated=found["lab_stated"],
+        kind=found["kind"],
+        source=Source(**found["source"]) if "spectra" in found else None,
+        origin=Origin(**found["origin"]),
+        file=file,
+        warnings=said,
+    )
+
+
+def read(
+    file: Union[str, "os.PathLike[str]"],
+    *,
+    scale: Scale = "automatic",
+    condition: Condition = None,
+) -> Sheet:
+    """A measurement file, CGATS text, CSV or CxF, as the program `vantrel` reads it.
+
+    Parameters
+    ----------
+    file : str or path
+    scale : {"automatic", "percent", "fraction"}
+        Of the reflectances; automatic: as the file says, or as its largest value.
+    condition : {"M0", "M1", "M2", "M3"}, optional
+        The measurement condition (ISO 13655) that is wanted; otherwise that of the file, or M1 of
+        several.
+
+    Returns
+    -------
+    sheet : Sheet
+        What the reader finds odd becomes warnings.
+
+    Raises
+    ------
+    ValueError
+        Where the file cannot be read as a measurement, with the line and the reason.
+    OSError
+        Where there is no such file.
+
+    Examples
+    --------
+    >>> sheet = vantrel.read("examples/two_ink_halftone.txt")
+    >>> sheet.spectra.shape, sheet.device["CMYK_M"][:3].tolist()
+    ((31, 31), [0.0, 10.0, 20.0])
+    """
+    with open(file, "rb") as opened:
+        content = opened.read()
+    return _sheet(content, os.fspath(file), scale, condition, 3)
+
+
+def reads(content: bytes, *, scale: Scale = "automatic", condition: Condition = None) -> Sheet:
+    """What read() gives, of the bytes of a measurement file.
+
+    Parameters
+    ----------
+    content : bytes
+    scale, condition
+        As in read().
+
+    Returns
+    -------
+    sheet : Sheet
+
+    Raises
+    ------
+    ValueError
+        Where the bytes cannot be read as a measurement, with the line and the reason.
+
+    Examples
+    --------
+    >>> text = "name," + ",".join(map(str, range(400, 701, 10))) + "\\ngrey" + 31 * ",50"
+    >>> vantrel.reads(text.encode())["grey"].mean()
+    np.float64(50.0)
+    """
+    return _sheet(content, "", scale, condition, 3)

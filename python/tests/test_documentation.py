@@ -1,0 +1,85 @@
+"""What the documentation shows is what happens, and types say what is taken."""
+
+import doctest
+import inspect
+import subprocess
+import sys
+from pathlib import Path
+
+import numpy as np
+import pytest
+
+import vantrel
+
+LIBRARY = Path(__file__).resolve().parents[1] / "library"
+PUBLIC = {name: getattr(vantrel, name) for name in vantrel.__all__}
+FUNCTIONS = {name: value for name, value in PUBLIC.items() if inspect.isfunction(value)}
+
+
+@pytest.fixture(scope="module")
+def spectra():
+    names = {"np": np, "vantrel": vantrel}
+    runner = doctest.DocTestRunner(verbose=False)
+    test = doctest.DocTestParser().get_doctest(vantrel.__doc__, names, "vantrel", None, 0)
+    assert runner.run(test, clear_globs=False).failed == 0
+    return test.globs
+
+
+def test_every_example_prints_what_it_says(spectra, monkeypatch, capsys):
+    monkeypatch.chdir(LIBRARY)
+    documented = [*filter(callable, PUBLIC.values()), *vars(vantrel.CIEDE2000).values()]
+    runner = doctest.DocTestRunner(optionflags=doctest.NORMALIZE_WHITESPACE, verbose=False)
+    with_examples = 0
+    for value in documented:
+        text = getattr(getattr(value, "__func__", value), "__doc__", None) or ""
+        test = doctest.DocTestParser().get_doctest(text, dict(spectra), text[:60], None, 0)
+        with_examples += bool(test.examples)
+        runner.run(test)
+    assert runner.summarize(verbose=False).failed == 0, capsys.readouterr().out
+    assert with_examples >= len(FUNCTIONS) + 4
+    for name, function in FUNCTIONS.items():
+        titles = ["Examples"] if name.startswith("set") else ["Returns", "Examples"]
+        titles += ["Parameters", "Raises"] if inspect.signature(function).parameters else []
+        assert all(f"{t}\n{'-' * len(t)}" in inspect.getdoc(function) for t in titles), name
+
+
+RIGHT = """
+import numpy as np
+import vantrel
+spectra = np.full((4, 31), 50.0)
+lab = vantrel.refl_to_cielab(spectra, "D50_2DEG")
+first: float = float(lab[0, 0])
+gray, hue, ok = vantrel.refl_to_hue_gray(spectra, None, ["E", "T"], ok=True)
+vantrel.refl_to_density(spectra, None, vantrel.Status.T_STATUS, [[1], [2]])
+with vantrel.settings(hifi=([480, 560, 620],)):
+    vantrel.refl_to_density(spectra, [80.0] * 31, np.array([6]), "HIFI1", ok=False)
+sheet = vantrel.read("sheet.cxf", condition="M1")
+names: list[str] = sheet.names
+vantrel.CIEDE2000.calculate(lab, lab)
+"""
+WRONG = [
+    'vantrel.refl_to_density(spectra, None, "NONSENSE", 1)',
+    'vantrel.refl_to_density(spectra, None, ["E", "NONSENSE"], 1)',
+    'vantrel.refl_to_hue_gray(spectra, None, "SPECTRALX")',
+    'vantrel.refl_to_xyz(spectra, "D51_2DEG")',
+    'vantrel.refl_to_xyz(spectra, "A_2DEG", okay=True)',
+    "lab.nonsense()",
+    'vantrel.read("sheet.cxf", condition="M7")',
+]
+
+
+@pytest.mark.parametrize("checker", [["mypy", "--strict"], ["pyright", "--pythonpath", sys.executable]])
+def test_type_checkers_take_what_is_right_and_nothing_else(checker, tmp_path):
+    (tmp_path / "pyrightconfig.json").write_text('{"typeCheckingMode": "strict"}')
+    script = tmp_path / "calls.py"
+    script.write_text(RIGHT + "\n".join(WRONG) + "\n")
+    run = subprocess.run(
+        [sys.executable, "-m", *checker, "calls.py"], cwd=tmp_path, capture_output=True, text=True
+    )
+    said = {
+        int(line.split("calls.py:")[1].split(":")[0])
+        for line in run.stdout.splitlines()
+        if "calls.py:" in line and "error" in line
+    }
+    before = RIGHT.count("\n")
+    assert said == set(range(before + 1, before + 1 + len(WRONG))), run.stdout + run.stderr
