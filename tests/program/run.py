@@ -6,8 +6,8 @@ A file holds commands as one types them, each with what it prints: standard outp
 standard error behind "! ", an exit status other than 0 behind "? ". Lines that begin with "> " go on
 with a command, those with "# " before it say what it is for. The commands of a file run in order, in
 a new folder that holds copies of the sheets in tests/sheets/data and of the example. Control
-characters are shown as the symbols for them. Numbers of 12 digits or more may differ in the last
-places; everything else is compared to the letter.
+characters are shown as the symbols for them. Where both numbers have 12 digits or more they may
+differ in the last places; everything else is compared to the letter.
 """
 import difflib
 import math
@@ -27,7 +27,7 @@ CONTROL = {c: chr(0x2400 + c) for c in range(32) if chr(c) not in "\t\n"}
 def close(expected, actual):
     if expected == actual:
         return True
-    exact = max(len(re.sub(r"e.*|\D", "", text)) for text in (expected, actual)) < 12
+    exact = min(len(re.sub(r"e.*|\D", "", text)) for text in (expected, actual)) < 12
     return (not exact and NUMBER.fullmatch(expected) and NUMBER.fullmatch(actual)
             and math.isclose(float(expected), float(actual), rel_tol=1e-9, abs_tol=1e-12))
 
