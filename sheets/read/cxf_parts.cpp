@@ -116,10 +116,12 @@ std::string place_of(const Node &object)
 {
     if (const auto sample = tag_of(object, "SampleID"); !sample.empty())
         return std::string(sample);
-    const auto row = tag_of(object, "Row"), column = tag_of(object, "Column");
+    const auto page = tag_of(object, "Page"), row = tag_of(object, "Row"),
+               column = tag_of(object, "Column");
     if (row.empty() || column.empty())
         return "";
-    return fmt::format("page {}, row {}, column {}", tag_of(object, "Page"), row, column);
+    return fmt::format("{}{}row {} column {}", page.empty() ? "" : "page ",
+                       page.empty() ? "" : std::string(page) + ' ', row, column);
 }
 
 std::string sample_name_of(const Node &object) { return printable(tag_of(object, "SampleName")); }

@@ -219,8 +219,9 @@ Measurement Sheet::measurement()
     if (patches.empty())
         throw InputError{0, "neither spectra nor L*a*b* nor XYZ in this file"};
     if (kind == Kind::colours && !reading.colours)
-        throw InputError{
-            0, fmt::format("{} patches of {}, no spectra", patches.size(), xyz ? "XYZ" : "L*a*b*")};
+        throw InputError{0, fmt::format("{} {} of {}, no spectra", patches.size(),
+                                        patches.size() == 1 ? "patch" : "patches",
+                                        xyz ? "XYZ" : "L*a*b*")};
     choose_condition();
     if (kind != Kind::colours)
         bring_to_percent();

@@ -82,7 +82,7 @@ std::vector<std::string> keys_of(const std::vector<std::string> &fields)
 }
 
 // The columns of a report as this program writes it to CSV; device values stand between the name
-// and L*.
+// and the swatch.
 bool is_own_report(const std::vector<std::string> &fields)
 {
     return fields.size() > 4 && fields[0] == "file" && fields[1] == "id" && fields[2] == "name" &&
@@ -268,10 +268,10 @@ void Table::find_devices(const std::vector<std::string> &keys, std::size_t line)
     for (const char *initial : {"C", "M", "Y", "K"})
         initials = initials && column_of(keys, {initial}) != kNone;
     const bool own = is_own_report(fields);
-    const std::size_t lightness = column_of(keys, {"L"});
+    const std::size_t swatch = column_of(keys, {"RGB"});
     std::map<std::string, std::size_t> seen;
     for (std::size_t i = 0; i < fields.size(); ++i) {
-        const bool free = own && i > 2 && i < lightness; // a name of any kind, in percent
+        const bool free = own && i > 2 && i < swatch; // a name of any kind, in percent
         const bool standard = is_standard_device_field(fields[i]);
         std::string device = standard ? upper(fields[i])
                              : free   ? fields[i]
