@@ -3,7 +3,7 @@
 cd "$(dirname "${BASH_SOURCE[0]}")/.."
 
 build_packages=(cmake ninja-build g++ pkg-config
-    libcli11-dev libeigen3-dev libfmt-dev nlohmann-json3-dev libpugixml-dev)
+    libcli11-dev libeigen3-dev libfmt-dev nlohmann-json3-dev libpugixml-dev libtomlplusplus-dev)
 fuzz_packages=(clang libclang-rt-14-dev)
 page_packages=(npm)
 test_packages=(chromium libgtest-dev libmpfr-dev clang clang-tidy clang-format doxygen binutils python3)

@@ -6,8 +6,6 @@
 #include <fmt/format.h>
 
 #include <algorithm>
-#include <cmath>
-#include <numeric>
 #include <utility>
 
 namespace vantrel::sheets {
@@ -60,32 +58,11 @@ PairReport pair_report(const Patch &reference, const Paper &reference_paper, con
     return out;
 }
 
-// What cannot be measured (not a number) is worse than anything.
-double badness(double delta_e) { return std::isnan(delta_e) ? INFINITY : delta_e; }
-
-// The pairs from the worst on, by one metric.
-std::vector<std::size_t> worst_first(const std::vector<PairReport> &pairs, std::size_t metric)
+std::vector<double> delta_e_of(const std::vector<PairReport> &pairs, std::size_t metric)
 {
-    std::vector<std::size_t> order(pairs.size());
-    std::iota(order.begin(), order.end(), 0u);
-    std::stable_sort(order.begin(), order.end(), [&](std::size_t first, std::size_t second) {
-        return badness(pairs[first].delta_e[metric]) > badness(pairs[second].delta_e[metric]);
-    });
-    return order;
-}
-
-Statistics statistics_of(const std::vector<PairReport> &pairs, std::size_t metric)
-{
-    const std::vector<std::size_t> order = worst_first(pairs, metric);
-    const std::size_t count = pairs.size();
-    const std::size_t rank = (95 * count + 99) / 100; // counted from the smallest
-    Statistics out;
+    std::vector<double> out;
     for (const PairReport &pair : pairs)
-        out.mean += pair.delta_e[metric];
-    out.mean /= static_cast<double>(count);
-    out.p95 = pairs[order[count - rank]].delta_e[metric];
-    out.max_pair = order.front();
-    out.max = pairs[out.max_pair].delta_e[metric];
+        out.push_back(pair.delta_e[metric]);
     return out;
 }
 
@@ -144,8 +121,8 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
         work.done(out.pairs.size());
     }
     for (std::size_t metric = 0; metric < request.metrics.size(); ++metric)
-        out.statistics.push_back(statistics_of(out.pairs, metric));
-    out.worst = worst_first(out.pairs, 0);
+        out.statistics.push_back(statistics_of(delta_e_of(out.pairs, metric)));
+    out.worst = largest_first(delta_e_of(out.pairs, 0));
     out.worst.resize(std::min(out.worst.size(), kMostWorst));
     return out;
 }

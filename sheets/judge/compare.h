@@ -4,6 +4,7 @@
 #include "judge/colour.h"
 #include "judge/formulas.h"
 #include "judge/pairs.h"
+#include "judge/statistics.h"
 #include "read/measurement.h"
 
 #include <optional>
@@ -43,13 +44,6 @@ struct PairReport {
     std::optional<int> response;
 };
 
-struct Statistics {
-    double mean = 0;
-    double p95 = 0; // the smallest value that at least 95 % of the pairs do not exceed
-    double max = 0;
-    std::size_t max_pair = 0;
-};
-
 struct Comparison {
     std::string reference, sample;             // files
     std::string reference_paper, sample_paper; // names; densities are over these
@@ -59,7 +53,7 @@ struct Comparison {
     std::vector<Metric> metrics;
     std::optional<double> tolerance;
     std::vector<PairReport> pairs;
-    std::vector<Statistics> statistics; // for each metric
+    std::vector<Statistics> statistics; // of the pairs, for each metric
     std::vector<std::size_t> worst;     // ten at most, by the first metric
     std::vector<std::string> only_reference, only_sample;
     std::vector<std::string> warnings;

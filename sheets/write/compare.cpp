@@ -59,7 +59,7 @@ void add_statistics(Lines &lines, const Comparison &comparison)
         const Statistics &all = comparison.statistics[i];
         lines.add(fmt::format("{:<22}{:>8}{:>8}{:>8}  {}", title_of(comparison.metrics[i]),
                               fixed(all.mean), fixed(all.p95), fixed(all.max),
-                              cut(comparison.pairs[all.max_pair].reference.name, kWidestName)));
+                              cut(comparison.pairs[all.max_at].reference.name, kWidestName)));
     }
 }
 
@@ -160,7 +160,7 @@ void write_json(const Comparison &comparison, const Sink &sink)
         statistics[name] = {{"mean", all.mean},
                             {"p95", all.p95},
                             {"max", all.max},
-                            {"max_patch", comparison.pairs[all.max_pair].reference.name}};
+                            {"max_patch", comparison.pairs[all.max_at].reference.name}};
     }
     const Json head = {
         {"command", "compare"},
