@@ -366,6 +366,8 @@ bool Table::is_statistic(const Row &row) const
         "AVERAGE", "AVG",     "MEAN", "STDDEV",  "STDEV",  "STD",   "SD",   "STANDARDDEVIATION",
         "MIN",     "MINIMUM", "MAX",  "MAXIMUM", "MEDIAN", "RANGE", "COUNT"};
     const auto is_word = [&](std::string_view value) {
+        if (value.empty() || std::string_view("AMSRCamsrc").find(value[0]) == value.npos)
+            return false; // the words begin with one of these
         const std::string key = letters(value);
         return std::find(words.begin(), words.end(), key) != words.end();
     };

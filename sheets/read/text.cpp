@@ -83,30 +83,30 @@ std::string letters(std::string_view field)
 
 std::string_view trimmed(std::string_view text)
 {
-    const auto begin = text.find_first_not_of(" \t");
-    if (begin == std::string_view::npos)
-        return {};
-    return text.substr(begin, text.find_last_not_of(" \t") - begin + 1);
+    const auto blank = [](char c) { return c == ' ' || c == '\t'; };
+    while (!text.empty() && blank(text.front()))
+        text.remove_prefix(1);
+    while (!text.empty() && blank(text.back()))
+        text.remove_suffix(1);
+    return text;
 }
 
 std::optional<double> number_in(std::string_view text)
 {
     text = trimmed(text);
-    std::string with_point;
-    if (const auto comma = text.find(',');
-        comma != std::string_view::npos && text.find('.') == std::string_view::npos) {
-        with_point = text;
-        with_point[comma] = '.';
-        text = with_point;
-    }
     if (text.size() > 1 && text[0] == '+' && text[1] != '-')
         text.remove_prefix(1);
     double value = 0;
     const char *end = text.data() + text.size();
     const auto [last, error] = std::from_chars(text.data(), end, value);
-    if (error != std::errc() || last != end || !std::isfinite(value))
+    if (last == end && error == std::errc() && std::isfinite(value))
+        return value;
+    const auto comma = text.find(',');
+    if (comma == std::string_view::npos || text.find('.') != std::string_view::npos)
         return std::nullopt;
-    return value;
+    std::string with_point(text);
+    with_point[comma] = '.';
+    return text[0] == '+' ? std::nullopt : number_in(with_point);
 }
 
 std::string printable(std::string_view text)
