@@ -92,7 +92,7 @@ class Build:
     PROGRAMS = {"tests/library/CMakeFiles/vantrel_tests.dir/": [
                     ["--gtest_filter=Golden.*", "--gtest_fail_fast"],
                     ["--gtest_filter=-Golden.*", "--gtest_fail_fast"]],
-                "tests/bits/CMakeFiles/bits.dir/": [[ROOT / "tests/bits/functions.txt", os.devnull]]}
+                "tests/bits/CMakeFiles/bits.dir/": [[ROOT / "tests/bits/digest.txt", os.devnull]]}
 
     def __init__(self, folder, *flags):
         self.folder = folder

@@ -89,7 +89,7 @@ template <class V, std::size_t n> V polynomial(V x, const double (&c)[n])
 
 /// To the nearest integer, below 2^51. The last bits of the sum are those of the integer.
 inline constexpr double kRounder = 0x1.8p52;
-template <class V> V rounded(V x) { return (x + kRounder) - kRounder; }
+template <class V> V to_integer(V x) { return (x + kRounder) - kRounder; }
 
 /// 2^k for an integer k of -1022 to 1023.
 template <class V> V power_of_2(V k) { return from_bits(bits(k + (kRounder + 1023)) << 52); }
@@ -175,21 +175,21 @@ template <class V> V exp_of_parts(V k, V high, V low)
     const V r = high + low;
     const V sum = 1 + high;
     const V power = sum + (((1 - sum) + high) + (low + r * r * polynomial(r, kQ)));
-    const V half = rounded(0.5 * k); // in two steps, since 2^k may not be a normal number
+    const V half = to_integer(0.5 * k); // in two steps, since 2^k may not be a normal number
     return power * power_of_2(half) * power_of_2(k - half);
 }
 
 template <class V> V exp(V x)
 {
     const V y = smaller(larger(x, V(-746)), V(710));
-    const V k = rounded(y * 0x1.71547652b82fep+0);
+    const V k = to_integer(y * 0x1.71547652b82fep+0);
     return exp_of_parts(k, y - k * kLn2.high, -(k * kLn2.low));
 }
 
 template <class V> V exp10(V x)
 {
     const V y = smaller(larger(x, V(-324)), V(309));
-    const V k = rounded(y * 0x1.a934f0979a371p+1);
+    const V k = to_integer(y * 0x1.a934f0979a371p+1);
     const V r = y - k * kLog10Of2.high;
     const V r1 = leading(r);
     return exp_of_parts(k, r1 * kLn10.high,
@@ -209,7 +209,9 @@ template <class V> V near_cube_root(V x, double y)
     const V normal = select(subnormal, x * 0x1p54, x);
     const V k = small_integer(bits(normal) >> 52) - 1023;
     const V m = from_bits((bits(normal) & kMantissa) | kOne);
-    const V third = rounded((k - 1) * (1.0 / 3)); // of k, toward minus infinity
+    const V estimate = to_integer((k - 1) * (1.0 / 3));
+    const V over = k - 3 * estimate; // 0, 1 or 2, but for another rounding mode
+    const V third = estimate + select(over < 0, V(-1), select(over > 2, V(1), V(0)));
     const V rest = k - 3 * third;
     const V t = leading(polynomial(m, kRoot) * select(rest == 0, V(1),
                                                       select(rest == 1, V(0x1.428a2f98d728bp+0),
@@ -240,6 +242,7 @@ inline constexpr double kLargeAngle = 800000;
 Angle<double> reduce_large(double x);
 
 inline void reduce_large(double x, Angle<double> &angle) { angle = reduce_large(x); }
+#ifdef __GNUC__
 template <int N> void reduce_large(Lanes<N> x, Angle<Lanes<N>> &angle)
 {
     for (int i = 0; i < N; ++i) {
@@ -251,6 +254,8 @@ template <int N> void reduce_large(Lanes<N> x, Angle<Lanes<N>> &angle)
         angle.quadrant[i] = reduced.quadrant;
     }
 }
+
+#endif
 
 template <class V> Angle<V> reduce(V x)
 {
@@ -356,6 +361,7 @@ template <class V> V atan2(V y, V x)
 
 } // namespace elementary
 
+#ifdef __GNUC__
 template <int N> Lanes<N> log(Lanes<N> x) { return elementary::log(x); }
 template <int N> Lanes<N> log10(Lanes<N> x) { return elementary::log10(x); }
 template <int N> Lanes<N> exp(Lanes<N> x) { return elementary::exp(x); }
@@ -367,5 +373,6 @@ template <int N> Lanes<N> near_cube_root(Lanes<N> x, double y)
 template <int N> Lanes<N> sin(Lanes<N> x) { return elementary::sin(x); }
 template <int N> Lanes<N> cos(Lanes<N> x) { return elementary::cos(x); }
 template <int N> Lanes<N> atan2(Lanes<N> y, Lanes<N> x) { return elementary::atan2(y, x); }
+#endif
 
 } // namespace vantrel

@@ -5,7 +5,9 @@
 // alike everywhere, and select() takes one of two results that are both computed.
 #pragma once
 
+#include <array>
 #include <bit>
+#include <cmath>
 #include <cstddef>
 #include <cstdint>
 #include <type_traits>
@@ -26,6 +28,7 @@
 
 namespace vantrel {
 
+#ifdef __GNUC__
 /// The compiler's vectors of N doubles, of their bits, and of what comparing them yields.
 template <int N> struct Vector;
 template <> struct Vector<2> {
@@ -81,8 +84,25 @@ template <int N> struct Lanes {
     Lanes &operator-=(Lanes b) { return *this = *this - b; }
 };
 
+#endif
+
 inline std::uint64_t bits(double x) { return std::bit_cast<std::uint64_t>(x); }
 inline double from_bits(std::uint64_t x) { return std::bit_cast<double>(x); }
+/// a where the condition holds, otherwise b.
+inline double select(bool condition, double a, double b) { return condition ? a : b; }
+inline bool any(bool condition) { return condition; }
+
+/// The square root by the processor's instruction, which is IEEE's at every level of optimisation.
+inline double sqrt(double x)
+{
+#ifdef __GNUC__
+    return __builtin_sqrt(x);
+#else
+    return std::sqrt(x);
+#endif
+}
+
+#ifdef __GNUC__
 template <int N> typename Vector<N>::Bits bits(Lanes<N> x)
 {
     return std::bit_cast<typename Vector<N>::Bits>(x.v);
@@ -93,8 +113,6 @@ template <class Bits> auto from_bits(Bits x)
     return Result(std::bit_cast<typename Result::Doubles>(x));
 }
 
-/// a where the condition holds, otherwise b.
-inline double select(bool condition, double a, double b) { return condition ? a : b; }
 template <int N>
 Lanes<N> select(Mask<N> condition, std::type_identity_t<Lanes<N>> a,
                 std::type_identity_t<Lanes<N>> b)
@@ -102,7 +120,6 @@ Lanes<N> select(Mask<N> condition, std::type_identity_t<Lanes<N>> a,
     return condition.m ? a.v : b.v;
 }
 
-inline bool any(bool condition) { return condition; }
 template <int N> bool any(Mask<N> condition)
 {
 #if defined(__AVX512DQ__)
@@ -123,8 +140,6 @@ template <int N> bool any(Mask<N> condition)
     return false;
 }
 
-/// The square root by the processor's instruction, which is IEEE's at every level of optimisation.
-inline double sqrt(double x) { return __builtin_sqrt(x); }
 template <int N> Lanes<N> sqrt(Lanes<N> x)
 {
 #if defined(__AVX512F__)
@@ -151,6 +166,8 @@ template <int N> Lanes<N> sqrt(Lanes<N> x)
     return roots;
 }
 
+#endif
+
 inline constexpr std::uint64_t kSignBit = 0x8000000000000000;
 
 template <class V> V abs(V x) { return from_bits(bits(x) & ~kSignBit); }
@@ -162,6 +179,35 @@ template <class V> V copysign(V size, V sign)
 /// The larger and the smaller one; a where b is not a number.
 template <class V> V larger(V a, V b) { return select(a < b, b, a); }
 template <class V> V smaller(V a, V b) { return select(b < a, b, a); }
+
+/// f of two numbers at the same time.
+template <class F> std::array<double, 2> side_by_side(F f, double a, double b)
+{
+#ifdef __GNUC__
+    const Lanes<2> both = f(Lanes<2>(Vector<2>::Doubles{a, b}));
+    return {both[0], both[1]};
+#else
+    return {f(a), f(b)};
+#endif
+}
+template <class F, class V> std::array<V, 2> side_by_side(F f, V a, V b) { return {f(a), f(b)}; }
+
+/// f(a1, b1) and f(a2, b2) at the same time.
+template <class F>
+std::array<double, 2> side_by_side(F f, double a1, double a2, double b1, double b2)
+{
+#ifdef __GNUC__
+    const Lanes<2> both =
+        f(Lanes<2>(Vector<2>::Doubles{a1, a2}), Lanes<2>(Vector<2>::Doubles{b1, b2}));
+    return {both[0], both[1]};
+#else
+    return {f(a1, b1), f(a2, b2)};
+#endif
+}
+template <class F, class V> std::array<V, 2> side_by_side(F f, V a1, V a2, V b1, V b2)
+{
+    return {f(a1, b1), f(a2, b2)};
+}
 
 } // namespace vantrel
 

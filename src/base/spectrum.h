@@ -15,19 +15,36 @@ inline constexpr int kBands = VANTREL_BANDS;
 using Spectrum = std::span<const double, kBands>;
 /// A spectrum, or one value for each band, by value.
 using Bands = std::array<double, kBands>;
+template <class V> using BandsOf = std::array<V, kBands>;
 /// A spectrum that is written.
 using SpectrumOut = std::span<double, kBands>;
 
 /// The paper that a reading is relative to, if any.
 using Paper = std::optional<Spectrum>;
 
-using Lab = CIELABCOORD;
-using Lch = CIELCHCOORD;
+// Records of one colour, or of several side by side: V is double or Lanes<N>.
+template <class V> struct Colour {
+    struct Lab {
+        V L, a, b;
+    };
+    struct Lch {
+        V L, C, h;
+    };
+};
+template <> struct Colour<double> {
+    using Lab = CIELABCOORD;
+    using Lch = CIELCHCOORD;
+};
+template <class V> using LabOf = typename Colour<V>::Lab;
+template <class V> using LchOf = typename Colour<V>::Lch;
+using Lab = LabOf<double>;
+using Lch = LchOf<double>;
 
 /// Tristimulus values, Y = 100 for the perfect white.
-struct Xyz {
-    double x, y, z;
+template <class V> struct XyzOf {
+    V x, y, z;
 };
+using Xyz = XyzOf<double>;
 
 inline Spectrum spectrum(const double *refl) { return Spectrum(refl, kBands); }
 inline SpectrumOut spectrum_out(double *refl) { return SpectrumOut(refl, kBands); }

@@ -1,9 +1,8 @@
 #include "colorimetry/spaces.h"
 
+#include "base/lanes.h"
 #include "base/numeric.h"
 #include "colorimetry/lab.h"
-
-#include <cmath>
 
 namespace vantrel {
 
@@ -38,7 +37,7 @@ std::optional<HunterLab> hunter_from_xyz(const Xyz &xyz, const Illuminant &illum
         return std::nullopt;
     const auto &[white, ka, kb] = illuminant;
     const double yr = xyz.y / white.y;
-    const double root = std::sqrt(yr);
+    const double root = sqrt(yr);
     if (root == 0)
         return HunterLab{0, 0, 0};
     return HunterLab{100 * root, ka * (xyz.x / white.x - yr) / root,
@@ -47,7 +46,7 @@ std::optional<HunterLab> hunter_from_xyz(const Xyz &xyz, const Illuminant &illum
 
 static double six_decimals(double v) { return whole_part(v * 1000000 + 0.5) / 1000000; }
 
-static double cube(double v) { return six_decimals(std::pow(v, 3.0)); }
+static double cube(double v) { return six_decimals(v * v * v); }
 
 static constexpr double kRootOffset = 16.0 / 116.0;
 

@@ -4,8 +4,6 @@
 
 namespace vantrel {
 
-static constexpr double kScale = 100000.0;
-
 Xyz integrate(Spectrum refl, TristimulusWeights &weights)
 {
     Pair xy{}, z{};
@@ -13,7 +11,7 @@ Xyz integrate(Spectrum refl, TristimulusWeights &weights)
         xy += refl[i] * weights[i].xy;
         z += refl[i] * weights[i].z;
     }
-    return {xy[0] / kScale, xy[1] / kScale, z[0] / kScale};
+    return {xy[0] / kWeightScale, xy[1] / kWeightScale, z[0] / kWeightScale};
 }
 
 #ifdef VANTREL_AVX2
@@ -26,7 +24,7 @@ Xyz integrate(Spectrum refl, TristimulusWeights &weights)
         std::memcpy(&band, &weights[i], sizeof band);
         sum += refl[i] * band;
     }
-    return {sum[0] / kScale, sum[1] / kScale, sum[2] / kScale};
+    return {sum[0] / kWeightScale, sum[1] / kWeightScale, sum[2] / kWeightScale};
 }
 
 // False until the library is initialised: a call before that takes the plain way.
@@ -48,8 +46,8 @@ std::array<Xyz, kBands> xyz_by_band(Spectrum refl, ILLUM_OBS illum_obs)
     TristimulusWeights &weights = tristimulus_weights(illum_obs);
     std::array<Xyz, kBands> bands;
     for (int i = 0; i < kBands; ++i) {
-        const Pair xy = refl[i] * weights[i].xy / kScale;
-        bands[i] = {xy[0], xy[1], refl[i] * weights[i].z[0] / kScale};
+        const Pair xy = refl[i] * weights[i].xy / kWeightScale;
+        bands[i] = {xy[0], xy[1], refl[i] * weights[i].z[0] / kWeightScale};
     }
     return bands;
 }

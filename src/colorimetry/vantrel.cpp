@@ -202,13 +202,16 @@ int VerbalColorDifference(const double *standard, const double *sample, ILLUM_OB
     VANTREL_REQUIRE(lightness && (!words_colour || (colour1 && colour2)), "0");
     const Labch reference = labch_from_spectrum(spectrum(standard), illumObs);
     const Labch measured = labch_from_spectrum(spectrum(sample), illumObs);
-    std::wcscpy(lightness, lightness_words(reference, measured));
+    const auto write = [](wchar_t *out, Word word) {
+        std::wcscpy(out, kWords[static_cast<int>(word)]);
+    };
+    write(lightness, lightness_word(reference, measured));
     if (words_colour) {
         const bool polar = selector == 1;
-        std::wcscpy(colour1, polar ? chroma_words(reference, measured)
-                                   : red_green_words(reference, measured));
-        std::wcscpy(colour2, polar ? hue_words(reference, measured)
-                                   : yellow_blue_words(reference, measured));
+        write(colour1,
+              polar ? chroma_word(reference, measured) : red_green_word(reference, measured));
+        write(colour2,
+              polar ? hue_word(reference, measured) : yellow_blue_word(reference, measured));
     }
     return 1;
 }

@@ -14,53 +14,53 @@ Labch labch_from_spectrum(Spectrum refl, ILLUM_OBS illum_obs)
             static_cast<float>(lch.C), static_cast<float>(lch.h)};
 }
 
-static const wchar_t *words(float difference, const wchar_t *below, const wchar_t *above)
+static Word word(float difference, Word below, Word above)
 {
     if (std::fabs(difference) <= 0.5f)
-        return L"On Target";
+        return Word::on_target;
     return difference < 0 ? below : above;
 }
 
-const wchar_t *lightness_words(const Labch &standard, const Labch &sample)
+Word lightness_word(const Labch &standard, const Labch &sample)
 {
-    return words(sample.L - standard.L, L"Too Dark", L"Too Light");
+    return word(sample.L - standard.L, Word::too_dark, Word::too_light);
 }
 
-const wchar_t *red_green_words(const Labch &standard, const Labch &sample)
+Word red_green_word(const Labch &standard, const Labch &sample)
 {
-    return words(sample.a - standard.a, L"Too Green", L"Too Red");
+    return word(sample.a - standard.a, Word::too_green, Word::too_red);
 }
 
-const wchar_t *yellow_blue_words(const Labch &standard, const Labch &sample)
+Word yellow_blue_word(const Labch &standard, const Labch &sample)
 {
-    return words(sample.b - standard.b, L"Too Blue", L"Too Yellow");
+    return word(sample.b - standard.b, Word::too_blue, Word::too_yellow);
 }
 
-const wchar_t *chroma_words(const Labch &standard, const Labch &sample)
+Word chroma_word(const Labch &standard, const Labch &sample)
 {
-    return words(sample.C - standard.C, L"Too Dull", L"Too Bright");
+    return word(sample.C - standard.C, Word::too_dull, Word::too_bright);
 }
 
 // The neighbours of a hue, clockwise and counter-clockwise, by the hue angle of the standard:
 // each range excludes its lower and includes its upper bound.
 struct HueRange {
     double upper;
-    const wchar_t *clockwise, *counter_clockwise;
+    Word clockwise, counter_clockwise;
 };
 static constexpr HueRange kHueRanges[] = {
-    {35, L"Too Blue", L"Too Yellow"},       {55, L"Too Red", L"Too Yellow"},
-    {125, L"Too Red", L"Too Green"},        {145, L"Too Yellow", L"Too Green"},
-    {215, L"Too Yellow", L"Too Blue"},      {235, L"Too Green", L"Too Blue"},
-    {305, L"Too Green", L"Too Red"},        {325, L"Too Blue", L"Too Red"},
-    {INFINITY, L"Too Blue", L"Too Yellow"},
+    {35, Word::too_blue, Word::too_yellow},       {55, Word::too_red, Word::too_yellow},
+    {125, Word::too_red, Word::too_green},        {145, Word::too_yellow, Word::too_green},
+    {215, Word::too_yellow, Word::too_blue},      {235, Word::too_green, Word::too_blue},
+    {305, Word::too_green, Word::too_red},        {325, Word::too_blue, Word::too_red},
+    {INFINITY, Word::too_blue, Word::too_yellow},
 };
 
-const wchar_t *hue_words(const Labch &standard, const Labch &sample)
+Word hue_word(const Labch &standard, const Labch &sample)
 {
     const HueRange *range = kHueRanges;
     while (standard.h > range->upper)
         ++range;
-    return words(sample.h - standard.h, range->clockwise, range->counter_clockwise);
+    return word(sample.h - standard.h, range->clockwise, range->counter_clockwise);
 }
 
 } // namespace vantrel

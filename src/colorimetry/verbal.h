@@ -11,11 +11,28 @@ struct Labch {
 
 Labch labch_from_spectrum(Spectrum refl, ILLUM_OBS illum_obs);
 
+/// The words of a difference; the first one stands for none.
+enum class Word {
+    none,
+    on_target,
+    too_dark,
+    too_light,
+    too_green,
+    too_red,
+    too_blue,
+    too_yellow,
+    too_bright,
+    too_dull
+};
+inline constexpr const wchar_t *kWords[] = {L"",           L"On Target", L"Too Dark", L"Too Light",
+                                            L"Too Green",  L"Too Red",   L"Too Blue", L"Too Yellow",
+                                            L"Too Bright", L"Too Dull"};
+
 // How a sample differs from its standard, coordinate by coordinate.
-const wchar_t *lightness_words(const Labch &standard, const Labch &sample);
-const wchar_t *red_green_words(const Labch &standard, const Labch &sample);
-const wchar_t *yellow_blue_words(const Labch &standard, const Labch &sample);
-const wchar_t *chroma_words(const Labch &standard, const Labch &sample);
-const wchar_t *hue_words(const Labch &standard, const Labch &sample);
+Word lightness_word(const Labch &standard, const Labch &sample);
+Word red_green_word(const Labch &standard, const Labch &sample);
+Word yellow_blue_word(const Labch &standard, const Labch &sample);
+Word chroma_word(const Labch &standard, const Labch &sample);
+Word hue_word(const Labch &standard, const Labch &sample);
 
 } // namespace vantrel

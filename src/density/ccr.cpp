@@ -1,9 +1,10 @@
 #include "density/ccr.h"
 
+#include "base/elementary.h"
+#include "base/numeric.h"
 #include "density/weighted.h"
 
 #include <algorithm>
-#include <cmath>
 
 namespace vantrel {
 namespace {
@@ -16,8 +17,8 @@ Rgb factors1(const Rgb &refl)
 {
     const auto [R, G, B] = refl;
     constexpr double kCubeRoot = 0.33333333;
-    return {0.836822509765625 + 0.1 * std::pow(R / G, kCubeRoot) +
-                0.06171607971191406 * std::pow(G / R, kCubeRoot),
+    return {0.836822509765625 + 0.1 * near_cube_root(R / G, kCubeRoot) +
+                0.06171607971191406 * near_cube_root(G / R, kCubeRoot),
             0.97772216796875 + 0.05f * B / (R + G) + 0.0015811920166015625 * (R / G),
             0.9998779296875 + 0.00010299599671270698 * (G / B)};
 }
@@ -36,7 +37,7 @@ double fade(double least)
     constexpr double kThreshold = 0.794328234;
     if (!(least < kThreshold))
         return 1;
-    return std::pow(1 - (kThreshold - least) / kThreshold, 8);
+    return square(square(square(1 - (kThreshold - least) / kThreshold)));
 }
 
 Rgb correction(const Rgb &refl, int status)
@@ -56,8 +57,8 @@ Densities ccr_densities(Spectrum refl, int status)
     const Rgb c = correction(rgb, status);
     const double visual = status == CCR1_STATUS ? 0.75 * rgb.g + 0.25 * rgb.r
                                                 : 0.763 * c.g * rgb.g + 0.237 * c.r * rgb.r;
-    return {{0 - std::log10(visual), 0 - std::log10(c.r * rgb.r), 0 - std::log10(c.g * rgb.g),
-             0 - std::log10(c.b * rgb.b)}};
+    return {{0 - log10(visual), 0 - log10(c.r * rgb.r), 0 - log10(c.g * rgb.g),
+             0 - log10(c.b * rgb.b)}};
 }
 
 } // namespace

@@ -1,13 +1,13 @@
 #include "density/spectral.h"
 
+#include "base/elementary.h"
 #include "density/paper_adjustment.h"
 
 #include <algorithm>
-#include <cmath>
 
 namespace vantrel {
 
-double spectral_density(double refl) { return 0 - std::log10(std::max(refl, 1e-5) / 100); }
+double spectral_density(double refl) { return 0 - log10(std::max(refl, 1e-5) / 100); }
 
 int darkest_wavelength(Spectrum refl, Paper paper)
 {

@@ -1,6 +1,6 @@
 #include "density/spectralx.h"
 
-#include <cmath>
+#include "base/elementary.h"
 
 namespace vantrel {
 namespace {
@@ -33,7 +33,7 @@ double density_of_sum(double sum, std::span<const double> weights)
     double total = 0;
     for (const double weight : weights)
         total += weight;
-    return 0 - std::log10(sum / (total * 100));
+    return 0 - log10(sum / (total * 100));
 }
 
 double band_density(Spectrum refl, int band)

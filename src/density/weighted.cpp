@@ -1,35 +1,16 @@
 #include "density/weighted.h"
 
-#include "density/den_weight.h"
-
 #include <algorithm>
-#include <cmath>
 
 namespace vantrel {
-namespace {
 
-// A weight row sums to 100 000 and a spectrum is in percent.
-constexpr double kToFactor = 1e-7;
-constexpr double kToPercent = 1e-5f;
-constexpr double kLeastFactor = 1e-5;
-constexpr double kLeastPercent = 0.0009999999310821295;
+static constexpr double kToPercent = 1e-5f;
+static constexpr double kLeastPercent = 0.0009999999310821295;
 static_assert(kToPercent == 9.999999747378752e-6);
-
-// Subtracted from 0 rather than negated, so that a perfect white has 0 and not -0.
-double density_of_sum(double sum)
-{
-    return 0 - std::log10(std::max(sum * kToFactor, kLeastFactor));
-}
-
-} // namespace
 
 double weighted_sum(Spectrum refl, int status, int response)
 {
-    const Weights weights = weights_of(status, response);
-    double sum = 0;
-    for (int i = 0; i < kBands; ++i)
-        sum += refl[i] * static_cast<double>(weights[i]);
-    return sum;
+    return weighted_sum(refl, weights_of(status, response));
 }
 
 double weighted_reflectance(Spectrum refl, int status, int response)
@@ -49,7 +30,9 @@ double weighted_density(Spectrum refl, Paper paper, int status, int response)
         sum += refl[i] * weight;
         paper_sum += (*paper)[i] * weight;
     }
-    return density_of_sum(sum) - density_of_sum(paper_sum);
+    const auto [density, paper_density] =
+        side_by_side([](auto v) { return density_of_sum(v); }, sum, paper_sum);
+    return density - paper_density;
 }
 
 } // namespace vantrel

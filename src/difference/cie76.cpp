@@ -1,24 +1,17 @@
 #include "difference/cie76.h"
 
-#include "base/numeric.h"
 #include "colorimetry/lab.h"
 
 #include <cmath>
 
 namespace vantrel {
 
-double delta_e76(const Lab &first, const Lab &second)
-{
-    return std::sqrt(square(first.L - second.L) + square(first.a - second.a) +
-                     square(first.b - second.b));
-}
-
 double delta_h(const Lab &first, const Lab &second, bool round)
 {
     const Lch lch1 = lch_from_lab(round ? rounded(first) : first);
     const Lch lch2 = lch_from_lab(round ? rounded(second) : second);
-    const double dH = std::sqrt(std::fabs(square(second.a - first.a) + square(second.b - first.b) -
-                                          square(lch2.C - lch1.C)));
+    const double dH = sqrt(std::fabs(square(second.a - first.a) + square(second.b - first.b) -
+                                     square(lch2.C - lch1.C)));
     double dh = lch2.h - lch1.h;
     if (dh > 180)
         dh -= 360;

@@ -1,5 +1,6 @@
 #include "inks/error_weights.h"
 
+#include "base/elementary.h"
 #include "colorimetry/tristimulus.h"
 
 #include <cmath>
@@ -23,7 +24,7 @@ static Bands scaled_roots(Bands values)
 {
     double largest = 0;
     for (double &v : values) {
-        const double root = std::pow(std::fabs(v), 0.333333333333);
+        const double root = near_cube_root(std::fabs(v), 0.333333333333);
         if (root > largest)
             largest = root;
         v = v < 0 ? -root : root;

@@ -6,12 +6,9 @@ namespace vantrel {
 
 Bands halftone_tint(Spectrum ink, int percent, Spectrum paper)
 {
-    if (percent == 0)
-        return bands(paper);
-    const double bare = 100.0 - percent;
     Bands refl;
     for (int i = 0; i < kBands; ++i)
-        refl[i] = ink[i] + (paper[i] - ink[i]) * bare / 100;
+        refl[i] = halftone_band(ink[i], percent, paper[i]);
     return refl;
 }
 

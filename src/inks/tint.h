@@ -4,6 +4,13 @@
 
 namespace vantrel {
 
+/// One band of halftone_tint().
+template <class V> V halftone_band(V ink, int percent, V paper)
+{
+    const double bare = 100.0 - percent;
+    return percent == 0 ? paper : ink + (paper - ink) * bare / 100;
+}
+
 /// A tint as a halftone: ink and bare paper mixed by area (Murray-Davies).
 Bands halftone_tint(Spectrum ink, int percent, Spectrum paper);
 

@@ -1,10 +1,9 @@
 #include "print/density_ratio.h"
 
+#include "base/lanes.h"
 #include "base/numeric.h"
 #include "density/automatic_response.h"
 #include "density/density.h"
-
-#include <cmath>
 
 namespace vantrel {
 
@@ -28,7 +27,7 @@ double at_equivalent_density(double refl, double ratio)
         return refl;
     const double R = refl / 100;
     const double ks = R == 0 ? kBlack : square(1 - R) / (2 * R) * 100 / ratio;
-    const double root = std::sqrt(square(ks) + 2 * ks);
+    const double root = sqrt(square(ks) + 2 * ks);
     // Beyond black the difference of two large numbers has lost its digits; this is its equal.
     return 100 * (ks > kBlack ? 1 / (1 + ks + root) : 1 + ks - root);
 }

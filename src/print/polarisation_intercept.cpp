@@ -1,9 +1,8 @@
 #include "print/polarisation_intercept.h"
 
+#include "base/elementary.h"
 #include "density/automatic_response.h"
 #include "density/weighted.h"
-
-#include <cmath>
 
 namespace vantrel {
 
@@ -11,7 +10,7 @@ std::optional<double> polarisation_intercept(Spectrum refl, double Dr, double Dg
 {
     const auto intercept = [&](int response, double density) {
         const double measured = weighted_sum(refl, E_STATUS, response) / 100;
-        return (measured - 100000 * std::pow(10.0, -density)) / 10;
+        return (measured - 100000 * exp10(-density)) / 10;
     };
     switch (automatic_response(refl, E_STATUS, std::nullopt)) {
     case VISUAL_RESPONSE:
