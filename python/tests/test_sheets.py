@@ -15,6 +15,7 @@ WIDE += "NUMBER_OF_SETS 2\nBEGIN_DATA\n"
 WIDE += "A1 <b>&grey 101.5 51 1 2 " + " ".join(f"{0.2 + i / 100:.2f}" for i in range(33)) + "\n"
 WIDE += "A2 black 40 11 3 4 " + " ".join(f"{0.02 + i / 1000:.3f}" for i in range(33)) + "\n"
 WIDE += "END_DATA\n"
+COLOURS = "name,L,a,b\npaper,95,0,-2\nmagenta,48,75,-4\n"
 
 
 def test_a_sheet_has_what_its_file_has():
@@ -35,8 +36,9 @@ def test_scales_ranges_and_warnings():
     assert caught[0].filename == __file__ and len(sheet.warnings) == len(caught)
     assert np.allclose(sheet.spectra[:, [0, 30]], [[21, 51], [2.1, 5.1]])
     assert sheet.source.scaled and (sheet.source.first_nm, sheet.source.last_nm) == (390, 710)
+    assert sheet.lab.tolist() == [[51, 1, 2], [11, 3, 4]]
     frame = sheet.to_pandas()
-    assert frame.columns[:4].tolist() == ["id", "name", "CMYK_C", 400]
+    assert frame.columns[:4].tolist() == ["id", "name", "CMYK_C", 400] and frame["b"][1] == 4
     refl = sheet.to_xarray()
     assert np.array_equal(refl.nm, np.arange(400, 701, 10)) and refl.CMYK_C[1] == 40
     assert vantrel.refl_to_cielab(refl).id.values.tolist() == ["A1", "A2"]
@@ -45,6 +47,14 @@ def test_scales_ranges_and_warnings():
     with pytest.warns(UserWarning):
         percent = vantrel.reads(WIDE.encode(), scale="percent")
     assert np.allclose(percent.spectra * 100, sheet.spectra)
+
+
+def test_colours_alone_are_a_sheet_too():
+    sheet = vantrel.reads(COLOURS.encode())
+    assert (sheet.kind, sheet.spectra, sheet.source) == ("colours", None, None)
+    assert sheet.lab[1].tolist() == [48, 75, -4] and "magenta" in sheet._repr_html_()
+    with pytest.raises(KeyError, match="colours alone"):
+        sheet["paper"]
 
 
 @pytest.mark.parametrize(
