@@ -52,14 +52,14 @@ std::string_view tag_of(const Node &object, std::string_view name)
 
 } // namespace
 
-Settings settings_in(const Node &specification)
+Settings settings_in(const Node &stated)
 {
     Settings out;
-    const Node measurement = child(specification, "MeasurementSpec");
+    const Node measurement = child(stated, "MeasurementSpec");
     const Node range = child(measurement, "WavelengthRange");
     out.first_nm = number_in(attribute(range, "StartWL"));
     out.step_nm = number_in(attribute(range, "Increment"));
-    const Node tristimulus = child(specification, "TristimulusSpec");
+    const Node tristimulus = child(stated, "TristimulusSpec");
     out.illuminant = child(tristimulus, "Illuminant").child_value();
     out.observer = child(tristimulus, "Observer").child_value();
     out.quantity = child(measurement, "MeasurementType").child_value();
@@ -67,12 +67,12 @@ Settings settings_in(const Node &specification)
     if (trimmed(child(device, "DevicePolarization").child_value()) == "true")
         out.condition = 3;
     else
-        out.condition = first_below(specification, condition_of);
+        out.condition = first_below(stated, condition_of);
     if (!out.condition && contains(child(device, "DeviceFilter").child_value(), "UVEXCLUDED"))
         out.condition = 2;
     for (const char *name : {"Name", "Id"})
         if (!out.condition)
-            out.condition = condition_in(attribute(specification, name));
+            out.condition = condition_in(attribute(stated, name));
     return out;
 }
 

@@ -17,7 +17,7 @@ struct Settings {
     std::optional<double> first_nm, step_nm;
     std::string_view illuminant, observer, quantity;
 };
-Settings settings_in(const Node &specification);
+Settings settings_in(const Node &stated);
 
 // The tint steps of CxF/X-4 by the Id of their objects: below a SpotInkCharacterisation, what names
 // a percentage and an object, as attributes or as elements. Those on black are left out.

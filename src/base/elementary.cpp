@@ -54,7 +54,7 @@ Angle<double> reduce_large(double x)
     // To the nearest quarter turn, the rest from -1/2 to 1/2 in two doubles.
     std::uint64_t quadrant = fraction[0];
     double high = 0, low = 0, weight = 0x1p-192;
-    for (int k = kDigits; k >= 1; --k, weight *= 0x1p32) {
+    for (int k = kDigits; k >= 1; --k) {
         double digit = static_cast<double>(fraction[k]);
         if (k == 1 && fraction[1] >= 0x80000000) {
             digit -= 0x1p32;
@@ -64,6 +64,7 @@ Angle<double> reduce_large(double x)
         const double added = sum - high;
         low += (high - (sum - added)) + (digit * weight - added);
         high = sum;
+        weight *= 0x1p32;
     }
     const double product = high * kHalfPi.high;
     const double rest =

@@ -356,7 +356,7 @@ template <class V> V atan2(V y, V x)
     const V scale = select(d > kHigh, V(0x1p-624), select(d < kLow, V(0x1p600), V(1)));
     const V arctan = arctan_of_ratio(select(small, V(0), n * scale), d * scale, steep, left);
     const V angle = copysign(select(small & !(steep | left), ratio, arctan), y);
-    return select(x == x, select(y == y, angle, y), x);
+    return select(abs(x) >= 0, select(abs(y) >= 0, angle, y), x); // not-a-numbers stay
 }
 
 } // namespace elementary
