@@ -51,8 +51,8 @@ struct Tolerances {
     std::vector<Tolerance> limits; // at least one
 };
 
-// Throws InputError with the line.
-Tolerances read_tolerances(std::string_view toml);
+// Of TOML text. Throws InputError with the line.
+Tolerances read_tolerances(std::string_view text);
 
 std::string_view key_of(Group group);         // near-neutrals
 std::string_view key_of(Statistic statistic); // p95
