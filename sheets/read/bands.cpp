@@ -133,7 +133,7 @@ Bands::Parts Bands::corrected(double centre) const
 // Half way between steps of 20 nm.
 Bands::Parts Bands::between(double wavelength) const
 {
-    const Parts near = value_at(wavelength);
+    Parts near = value_at(wavelength);
     if (near.size() == 1)
         return near;
     const auto left = std::find(order.begin(), order.end(), near[0].value);

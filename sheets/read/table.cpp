@@ -307,7 +307,8 @@ std::string Table::text_at(const Row &row, std::size_t column) const
     if (column == kNone)
         return "";
     std::string_view text = trimmed(row.values[column]);
-    if (text.size() > 1 && text[0] == '\'' && std::string_view("=+-@").find(text[1]) != text.npos)
+    if (text.size() > 1 && text[0] == '\'' &&
+        std::string_view("=+-@").find(text[1]) != std::string_view::npos)
         text.remove_prefix(1);
     return text == "-" ? "" : printable(text);
 }
@@ -366,7 +367,8 @@ bool Table::is_statistic(const Row &row) const
         "AVERAGE", "AVG",     "MEAN", "STDDEV",  "STDEV",  "STD",   "SD",   "STANDARDDEVIATION",
         "MIN",     "MINIMUM", "MAX",  "MAXIMUM", "MEDIAN", "RANGE", "COUNT"};
     const auto is_word = [&](std::string_view value) {
-        if (value.empty() || std::string_view("AMSRCamsrc").find(value[0]) == value.npos)
+        if (value.empty() ||
+            std::string_view("AMSRCamsrc").find(value[0]) == std::string_view::npos)
             return false; // the words begin with one of these
         const std::string key = letters(value);
         return std::find(words.begin(), words.end(), key) != words.end();
