@@ -119,28 +119,29 @@ CalibratedModel::Place CalibratedModel::place_without(const Tints &tints) const
 {
     const auto known = grids.find(inks_of(tints));
     Place place{.tints = tints, .nodes = known == grids.end() ? grid_of(tints) : known->second};
-    if (!measured.contains(tints))
+    if (place.nodes.empty() || !measured.contains(tints))
         return place;
     if (all_solid(tints)) {
         place.films = tints.size() > 1;
         return place;
     }
     // Without this patch the grid lacks one tint of one ink: the one with the nearest neighbours.
-    Levels *nodes = nullptr;
+    std::size_t ink = 0;
     std::ptrdiff_t left_out = 0;
     double narrowest = std::numeric_limits<double>::infinity();
     for (std::size_t i = 0; i < tints.size(); ++i) {
-        Levels &levels = place.nodes[i];
+        const Levels &levels = place.nodes[i];
         const auto level = std::find(levels.begin(), levels.end(), tints[i].percent);
         if (level == levels.end())
             return place; // no node
         if (tints[i].percent < 100 && *(level + 1) - *(level - 1) < narrowest) {
             narrowest = *(level + 1) - *(level - 1);
-            nodes = &levels;
+            ink = i;
             left_out = level - levels.begin();
         }
     }
-    nodes->erase(nodes->begin() + left_out);
+    Levels &nodes = place.nodes[ink];
+    nodes.erase(nodes.begin() + left_out);
     if (tints.size() == 1)
         place.no_tint = tints[0].percent;
     return place;

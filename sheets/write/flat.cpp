@@ -168,7 +168,7 @@ void Flat::exact(std::string name, std::string cgats,
                        [get = std::move(get)](std::size_t i) { return all_digits(get(i)); }});
 }
 
-void Flat::colour(const std::string &prefix, std::function<const Colour *(std::size_t)> get)
+void Flat::colour(const std::string &prefix, const std::function<const Colour *(std::size_t)> &get)
 {
     text(prefix + "rgb", "", [get](std::size_t i) { return get(i) ? hex(get(i)->rgb) : ""; });
     for (const auto &[axis, value] :
@@ -179,7 +179,7 @@ void Flat::colour(const std::string &prefix, std::function<const Colour *(std::s
                });
 }
 
-void Flat::spectrum(std::function<const Spectrum &(std::size_t)> get)
+void Flat::spectrum(const std::function<const Spectrum &(std::size_t)> &get)
 {
     spectra = true;
     for (int band = 0; band < VANTREL_BANDS; ++band)
@@ -188,7 +188,7 @@ void Flat::spectrum(std::function<const Spectrum &(std::size_t)> get)
 }
 
 void Flat::device(const std::vector<std::string> &names,
-                  std::function<const Device &(std::size_t)> get)
+                  const std::function<const Device &(std::size_t)> &get)
 {
     for (const std::string &name : names)
         exact(name, name, [get, name](std::size_t i) {

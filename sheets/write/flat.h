@@ -34,12 +34,12 @@ struct Flat {
     void exact(std::string name, std::string cgats,
                std::function<std::optional<double>(std::size_t)> get);
     // Preview and L*a*b*; a null pointer makes empty cells.
-    void colour(const std::string &prefix, std::function<const Colour *(std::size_t)> get);
-    void spectrum(std::function<const Spectrum &(std::size_t)> get);
+    void colour(const std::string &prefix, const std::function<const Colour *(std::size_t)> &get);
+    void spectrum(const std::function<const Spectrum &(std::size_t)> &get);
     // Device values of these names.
     using Device = std::vector<std::pair<std::string, double>>; // as in Patch
     void device(const std::vector<std::string> &names,
-                std::function<const Device &(std::size_t)> get);
+                const std::function<const Device &(std::size_t)> &get);
 };
 
 // RFC 4180. Tables of different columns share one header, with a column for every name. Text that a
