@@ -95,7 +95,8 @@ int exit_status(int count, char **words)
 
 int main(int count, char **words)
 {
-    static_cast<void>(std::signal(SIGPIPE, SIG_IGN)); // a lost reader is an error of writing
+    for (const int signal : {SIGPIPE, SIGXFSZ}) // a lost reader, a limit: errors of writing
+        static_cast<void>(std::signal(signal, SIG_IGN));
     try {
         return exit_status(count, words);
     } catch (const std::bad_alloc &) {

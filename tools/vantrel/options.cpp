@@ -11,22 +11,9 @@
 #include <cstdio>
 #include <cstdlib>
 #include <optional>
-#include <sys/stat.h>
 #include <unistd.h>
 
 namespace vantrel::program {
-namespace {
-
-bool is_same_file(const std::string &first, const std::string &second)
-{
-    struct stat one {
-    }, other{};
-    return stat(first.c_str(), &one) == 0 && stat(second.c_str(), &other) == 0 &&
-           S_ISREG(one.st_mode) && one.st_dev == other.st_dev && one.st_ino == other.st_ino;
-}
-
-} // namespace
-
 void add_common_options(CLI::App &command, Options &options)
 {
     command.add_option("--format", options.format, "table, csv, json, cgats or html")
@@ -97,8 +84,6 @@ std::optional<ILLUM_OBS> optional_illuminant(const std::string &name)
 Measurement sheet_of(const std::string &path, const Options &options)
 {
     const std::string file = printable(path);
-    if (!options.output.empty() && is_same_file(path, options.output))
-        throw RequestError{file + " is to be read; -o would write over it"};
     try {
         Reading reading;
         if (options.scale != "auto")

@@ -60,7 +60,7 @@ int status_of(const std::string &name);
 // Nothing where the name is empty.
 std::optional<ILLUM_OBS> optional_illuminant(const std::string &name);
 
-// Reads a file, which is not the output; throws RequestError.
+// Reads a file; throws RequestError.
 Measurement sheet_of(const std::string &path, const Options &options);
 
 bool shows_colour(const Options &options);

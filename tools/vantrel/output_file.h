@@ -3,7 +3,7 @@
 
 #include <string>
 #include <string_view>
-#include <sys/types.h>
+#include <sys/stat.h>
 #include <utility>
 
 namespace vantrel::program {
@@ -14,8 +14,9 @@ struct OutputError {
 };
 
 // Takes text for a file, or for standard output where the path is empty or "-". A file has either
-// its old content or all of the new one: it is written under a temporary name beside its own and
-// renamed. What is no regular file (a device, a pipe) is written straight.
+// its old content or all of the new one, also when a signal ends the program: it is written under a
+// temporary name beside its own, with the rights, owner and group of the old one, and renamed. What
+// is no regular file (a device, a pipe) is written straight. There is one at a time.
 class OutputFile {
 public:
     explicit OutputFile(std::string path) : path(std::move(path)) {}
@@ -23,20 +24,23 @@ public:
     OutputFile(const OutputFile &) = delete;
     OutputFile &operator=(const OutputFile &) = delete;
 
-    // These throw OutputError. Nothing is opened before there is text for it.
+    // These throw OutputError, and RequestError for a file that was read. Nothing is opened before
+    // there is text for it.
     void write(std::string_view text);
     void finish();
 
 private:
     void open();
-    void open_beside(const std::string &target, mode_t of_target);
+    void open_to_replace(const struct stat &target);
+    void open_beside(const std::string &target);
+    void forget_temporary();
     void flush();
 
     std::string path;
     std::string buffer;
     int file = -1;
     std::string temporary, replaced; // both empty where the file is written straight
-    mode_t mode = 0;                 // of the replaced file
+    mode_t mode = 0;                 // that the file will have
 };
 
 } // namespace vantrel::program
