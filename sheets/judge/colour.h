@@ -8,7 +8,7 @@
 
 namespace vantrel::sheets {
 
-// Drive levels of the screen preview.
+// sRGB levels of the screen preview.
 struct Rgb {
     std::uint8_t red = 0, green = 0, blue = 0;
 };
@@ -20,12 +20,14 @@ struct Colour {
 
 CIELABCOORD lab_of(const Spectrum &refl, ILLUM_OBS illuminant);
 
-// The preview is that under D65, the white of displays: under another illuminant white paper would
-// look tinted beside it.
-Colour colour_of(const Spectrum &refl, ILLUM_OBS illuminant);
+// Of a patch of this sheet: where the sheet holds colours alone, what it says, for whichever
+// illuminant.
+CIELABCOORD lab_of(const Measurement &sheet, const Patch &patch, ILLUM_OBS illuminant);
 
-// As it looks under this illuminant to an eye that is adapted to the display.
-Rgb preview_of(const Spectrum &refl, ILLUM_OBS illuminant);
+// The preview is the sRGB colour of the same L*a*b*, adapted from D50.
+Colour colour_of(const CIELABCOORD &lab);
+Colour colour_of(const Spectrum &refl, ILLUM_OBS illuminant);
+Colour colour_of(const Measurement &sheet, const Patch &patch, ILLUM_OBS illuminant);
 
 // The usual illuminant to tell metamerism beside another: A beside daylight and lamps, D65 beside
 // A, with the same observer.

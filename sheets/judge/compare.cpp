@@ -1,7 +1,9 @@
 #include "judge/compare.h"
 
+#include "judge/control.h"
 #include "judge/densitometer.h"
 #include "judge/paper.h"
+#include "judge/substrate.h"
 
 #include <fmt/format.h>
 
@@ -13,13 +15,27 @@ namespace {
 
 constexpr std::size_t kMostWorst = 10;
 
+// One of the two sheets.
+struct Sheet {
+    const Measurement &measurement;
+    Paper paper;
+
+    bool has_spectra() const { return measurement.kind != Kind::colours; }
+    const Patch &patch(std::size_t place) const { return measurement.patches[place]; }
+};
+
+// What all pairs are judged by.
+struct Terms {
+    const CompareRequest &request;
+    ILLUM_OBS illuminant, second_illuminant;
+};
+
 // The parts that are off target.
-std::string verbal_difference(const Spectrum &reference, const Spectrum &sample,
-                              const CompareRequest &request)
+std::string verbal_difference(const Spectrum &reference, const Spectrum &sample, const Terms &terms)
 {
     wchar_t words[3][16] = {};
-    VerbalColorDifference(reference.data(), sample.data(), request.illuminant,
-                          request.words_of_hue ? 1 : 0, words[0], words[1], words[2]);
+    VerbalColorDifference(reference.data(), sample.data(), terms.illuminant,
+                          terms.request.words_of_hue ? 1 : 0, words[0], words[1], words[2]);
     std::string out;
     for (const wchar_t *part : words) {
         std::string narrow; // ASCII throughout
@@ -31,39 +47,129 @@ std::string verbal_difference(const Spectrum &reference, const Spectrum &sample,
     return out.empty() ? "On Target" : out;
 }
 
-Side side_of(const Patch &patch, const Paper &paper, const CompareRequest &request,
+std::optional<int> response_of(const Sheet &sheet, const Patch &patch, int status)
+{
+    if (!sheet.has_spectra())
+        return std::nullopt;
+    return Densitometer(sheet.paper.refl, status).response(patch.refl);
+}
+
+Side side_of(const Sheet &sheet, const Patch &patch, const Terms &terms,
              const std::optional<int> &response)
 {
-    Side side{patch.id, patch.name, colour_of(patch.refl, request.illuminant), patch.refl, {}};
+    Side side{patch.id, patch.name, colour_of(sheet.measurement, patch, terms.illuminant), {}, {}};
+    if (!sheet.has_spectra())
+        return side;
+    side.refl = patch.refl;
     if (response)
-        side.density = Densitometer(paper.refl, request.status).density(patch.refl, *response);
+        side.density =
+            Densitometer(sheet.paper.refl, terms.request.status).density(patch.refl, *response);
     return side;
 }
 
-PairReport pair_report(const Patch &reference, const Paper &reference_paper, const Patch &sample,
-                       const Paper &sample_paper, const CompareRequest &request,
-                       ILLUM_OBS second_illuminant)
+void compare_spectra(PairReport &pair, const Spectrum &reference, const Spectrum &sample,
+                     const Terms &terms)
+{
+    pair.verbal = verbal_difference(reference, sample, terms);
+    double sum = 0, din6172 = 0;
+    Metamerism(reference.data(), sample.data(), terms.illuminant, terms.second_illuminant, &sum);
+    ReflToDIN6172(reference.data(), sample.data(), terms.illuminant, terms.second_illuminant,
+                  &din6172);
+    pair.metamerism = sum;
+    pair.din6172 = din6172;
+}
+
+PairReport pair_report(const Sheet &references, const Patch &reference, const Sheet &samples,
+                       const Patch &sample, const Terms &terms)
 {
     PairReport out;
-    out.response = Densitometer(reference_paper.refl, request.status).response(reference.refl);
-    out.reference = side_of(reference, reference_paper, request, out.response);
-    out.sample = side_of(sample, sample_paper, request, out.response);
-    for (const Metric &metric : request.metrics)
+    const int status = terms.request.status;
+    out.response = references.has_spectra() ? response_of(references, reference, status)
+                                            : response_of(samples, sample, status);
+    out.reference = side_of(references, reference, terms, out.response);
+    out.sample = side_of(samples, sample, terms, out.response);
+    out.device = reference.device.empty() ? sample.device : reference.device;
+    for (const Metric &metric : terms.request.metrics)
         out.delta_e.push_back(metric(out.reference.colour.lab, out.sample.colour.lab));
-    out.verbal = verbal_difference(reference.refl, sample.refl, request);
-    Metamerism(reference.refl.data(), sample.refl.data(), request.illuminant, second_illuminant,
-               &out.metamerism);
-    ReflToDIN6172(reference.refl.data(), sample.refl.data(), request.illuminant, second_illuminant,
-                  &out.din6172);
+    if (out.reference.refl && out.sample.refl)
+        compare_spectra(out, *out.reference.refl, *out.sample.refl, terms);
     return out;
 }
 
-std::vector<double> delta_e_of(const std::vector<PairReport> &pairs, std::size_t metric)
+using Differences = std::vector<double> PairReport::*; // for each metric
+
+std::vector<double> values_of(const std::vector<PairReport> &pairs, Differences differences,
+                              std::size_t metric)
 {
     std::vector<double> out;
     for (const PairReport &pair : pairs)
-        out.push_back(pair.delta_e[metric]);
+        out.push_back((pair.*differences)[metric]);
     return out;
+}
+
+std::vector<Statistics> all_statistics(const std::vector<PairReport> &pairs,
+                                       Differences differences)
+{
+    std::vector<Statistics> out;
+    for (std::size_t metric = 0; metric < (pairs.front().*differences).size(); ++metric)
+        out.push_back(statistics_of(values_of(pairs, differences, metric)));
+    return out;
+}
+
+// By the largest difference in the first metric, and by the limits.
+std::optional<Verdict> verdict_of(const CompareRequest &request, double largest,
+                                  const std::vector<LimitResult> &limits)
+{
+    if (!request.tolerance && request.tolerances.limits.empty())
+        return std::nullopt;
+    const bool above = request.tolerance && !(largest <= *request.tolerance);
+    return worse(above ? Verdict::failed : Verdict::passed, verdict_of(limits));
+}
+
+// The aim of the least L* among all of the reference.
+const Patch &darkest_of(const Measurement &reference, ILLUM_OBS illuminant)
+{
+    return *std::min_element(reference.patches.begin(), reference.patches.end(),
+                             [&](const Patch &first, const Patch &second) {
+                                 return lab_of(reference, first, illuminant).L <
+                                        lab_of(reference, second, illuminant).L;
+                             });
+}
+
+SubstrateCorrected substrate_corrected(std::vector<PairReport> &pairs,
+                                       std::vector<ControlPatch> controls, const Sheet &reference,
+                                       const Sheet &sample, const Terms &terms)
+{
+    const Patch &darkest = darkest_of(reference.measurement, terms.illuminant);
+    const CIELABCOORD black = lab_of(reference.measurement, darkest, terms.illuminant);
+    SubstrateCorrected out;
+    out.aim_paper = lab_of(reference.paper, terms.illuminant);
+    out.paper = lab_of(sample.paper, terms.illuminant);
+    out.darkest = darkest.name;
+    if (!(black.L < out.aim_paper.L))
+        throw RequestError{fmt::format("{} holds no aim that is darker than its paper",
+                                       reference.measurement.file)};
+    const SubstrateCorrection correction(out.aim_paper, black, out.paper, terms.illuminant);
+    for (std::size_t i = 0; i < pairs.size(); ++i) {
+        pairs[i].corrected_aim = correction(pairs[i].reference.colour.lab);
+        for (const Metric &metric : terms.request.metrics)
+            pairs[i].corrected_delta_e.push_back(
+                metric(*pairs[i].corrected_aim, pairs[i].sample.colour.lab));
+        controls[i].aim = *pairs[i].corrected_aim;
+    }
+    out.statistics = all_statistics(pairs, &PairReport::corrected_delta_e);
+    out.limits = judge_limits(terms.request.tolerances, controls);
+    out.verdict = verdict_of(terms.request, out.statistics[0].max, out.limits);
+    return out;
+}
+
+void warn_of_conditions(const Measurement &reference, const Measurement &sample,
+                        std::vector<std::string> &warnings)
+{
+    const std::string &first = reference.source.condition, &second = sample.source.condition;
+    if (!first.empty() && !second.empty() && first != second)
+        warnings.push_back(fmt::format("{} was measured under {}, {} under {}", reference.file,
+                                       first, sample.file, second));
 }
 
 std::vector<std::string> names_of(const Measurement &sheet, const std::vector<std::size_t> &places)
@@ -76,29 +182,26 @@ std::vector<std::string> names_of(const Measurement &sheet, const std::vector<st
 
 } // namespace
 
-bool Comparison::passed() const
-{
-    return std::all_of(pairs.begin(), pairs.end(), [&](const PairReport &pair) {
-        return !tolerance || pair.delta_e[0] <= *tolerance;
-    });
-}
-
 Comparison compare(const Measurement &reference, const Measurement &sample,
                    const CompareRequest &request)
 {
     std::vector<std::string> warnings = reading_warnings(reference);
     for (const std::string &warning : reading_warnings(sample))
         warnings.push_back(warning);
-    const Paper reference_paper = paper_of(reference, request.paper, warnings);
-    const Paper sample_paper = paper_of(sample, request.paper, warnings);
-    const ILLUM_OBS second = request.second_illuminant.value_or(usual_second(request.illuminant));
+    const IlluminantChoice illuminant =
+        illuminant_for(request.illuminant, {&reference, &sample}, warnings);
+    warn_of_conditions(reference, sample, warnings);
+    const Sheet references{reference, paper_of(reference, request.paper, warnings)};
+    const Sheet samples{sample, paper_of(sample, request.paper, warnings)};
+    const Terms terms{request, illuminant.illuminant,
+                      request.second_illuminant.value_or(usual_second(illuminant.illuminant))};
     const Pairs pairs = pairs_of(reference, sample, request.pairing);
     Comparison out{.reference = reference.file,
                    .sample = sample.file,
-                   .reference_paper = reference_paper.name,
-                   .sample_paper = sample_paper.name,
-                   .illuminant = request.illuminant,
-                   .second_illuminant = second,
+                   .reference_paper = references.paper.name,
+                   .sample_paper = samples.paper.name,
+                   .illuminant = illuminant,
+                   .second_illuminant = terms.second_illuminant,
                    .status = request.status,
                    .paired_by = pairs.by,
                    .metrics = request.metrics,
@@ -108,7 +211,11 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
                    .worst = {},
                    .only_reference = names_of(reference, pairs.only_reference),
                    .only_sample = names_of(sample, pairs.only_sample),
-                   .warnings = std::move(warnings)};
+                   .tolerances = request.tolerances.name,
+                   .limits = {},
+                   .corrected = {},
+                   .warnings = std::move(warnings),
+                   .verdict = {}};
     for (const auto &[sheet, alone] :
          {std::pair{&reference, &out.only_reference}, std::pair{&sample, &out.only_sample}})
         if (!alone->empty())
@@ -116,13 +223,18 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
                                                alone->size(), sheet->patches.size()));
     const Work work{request.tell, "Comparing", pairs.matched.size()};
     for (const auto &[in_reference, in_sample] : pairs.matched) {
-        out.pairs.push_back(pair_report(reference.patches[in_reference], reference_paper,
-                                        sample.patches[in_sample], sample_paper, request, second));
+        out.pairs.push_back(pair_report(references, references.patch(in_reference), samples,
+                                        samples.patch(in_sample), terms));
         work.done(out.pairs.size());
     }
-    for (std::size_t metric = 0; metric < request.metrics.size(); ++metric)
-        out.statistics.push_back(statistics_of(delta_e_of(out.pairs, metric)));
-    out.worst = largest_first(delta_e_of(out.pairs, 0));
+    const std::vector<ControlPatch> controls =
+        control_patches(out.pairs, references.paper, samples.paper, request.status);
+    out.statistics = all_statistics(out.pairs, &PairReport::delta_e);
+    out.limits = judge_limits(request.tolerances, controls);
+    out.verdict = verdict_of(request, out.statistics[0].max, out.limits);
+    if (request.substrate_corrected)
+        out.corrected = substrate_corrected(out.pairs, controls, references, samples, terms);
+    out.worst = largest_first(values_of(out.pairs, &PairReport::delta_e, 0));
     out.worst.resize(std::min(out.worst.size(), kMostWorst));
     return out;
 }

@@ -25,10 +25,10 @@ IlluminantReading under_illuminant(const Spectrum &refl, const Spectrum *other, 
                                    ILLUM_OBS illuminant)
 {
     IlluminantReading out;
-    out.colour = {lab_of(refl, illuminant), preview_of(refl, illuminant)};
+    out.colour = colour_of(refl, illuminant);
     out.lch = lch_of(out.colour.lab);
     if (other) {
-        out.other = {lab_of(*other, illuminant), preview_of(*other, illuminant)};
+        out.other = colour_of(*other, illuminant);
         out.de00 = delta_e00(out.other->lab, out.colour.lab);
         double metamerism = 0, din6172 = 0;
         Metamerism(other->data(), refl.data(), chosen, illuminant, &metamerism);
@@ -44,17 +44,18 @@ IlluminantReading under_illuminant(const Spectrum &refl, const Spectrum *other, 
 PatchStudy study_of(const Measurement &sheet, const InkRequest &request)
 {
     std::vector<std::string> warnings = reading_warnings(sheet);
+    const IlluminantChoice illuminant = illuminant_for(request.illuminant, {&sheet}, warnings);
     const Paper paper = paper_of(sheet, request.paper, warnings);
     const Patch &patch = patch_named(sheet, request.patch);
     const Patch *other = request.against.empty() ? nullptr : &patch_named(sheet, request.against);
     const Inks inks(sheet, request.order);
-    const Conditions conditions{inks, paper, request.illuminant, request.status};
+    const Conditions conditions{sheet, inks, paper, illuminant, request.status};
     PatchStudy out{.file = sheet.file,
-                   .illuminant = request.illuminant,
+                   .illuminant = illuminant,
                    .status = request.status,
                    .paper = paper.name,
                    .patch = patch_report(patch, conditions),
-                   .as_paper = paper_report({patch.name, patch.refl}, request.illuminant),
+                   .as_paper = paper_report({patch.name, patch.refl, {}}, illuminant),
                    .statuses = {},
                    .illuminants = {},
                    .against = {},
@@ -63,12 +64,12 @@ PatchStudy study_of(const Measurement &sheet, const InkRequest &request)
         out.statuses[status] = under_status(patch.refl, paper.refl, status);
     for (int i = 0; i < NUM_ILLUM_OBS; ++i)
         out.illuminants[i] = under_illuminant(patch.refl, other ? &other->refl : nullptr,
-                                              request.illuminant, static_cast<ILLUM_OBS>(i));
+                                              illuminant, static_cast<ILLUM_OBS>(i));
     if (other) {
         out.against.emplace();
         out.against->patch = patch_report(*other, conditions);
         out.against->de00 = delta_e00(out.against->patch.colour.lab, out.patch.colour.lab);
-        ReflToABErrorWeights(other->refl.data(), patch.refl.data(), request.illuminant,
+        ReflToABErrorWeights(other->refl.data(), patch.refl.data(), illuminant,
                              out.against->a.data(), out.against->b.data());
     }
     return out;

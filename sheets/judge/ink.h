@@ -34,7 +34,7 @@ struct Against {
 
 struct PatchStudy {
     std::string file;
-    ILLUM_OBS illuminant;
+    IlluminantChoice illuminant;
     int status;
     std::string paper;
     PatchReport patch;
@@ -46,9 +46,9 @@ struct PatchStudy {
 };
 
 struct InkRequest {
-    std::string patch;   // by name or id
-    std::string against; // likewise; none where it is empty
-    ILLUM_OBS illuminant = D50_2DEG;
+    std::string patch;                   // by name or id
+    std::string against;                 // likewise; none where it is empty
+    std::optional<ILLUM_OBS> illuminant; // as the file states where it is empty, or else D50
     int status = E_STATUS;
     std::string paper;              // by name or id; the usual one where it is empty
     std::vector<std::string> order; // of printing, as Inks takes it

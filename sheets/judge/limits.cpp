@@ -186,7 +186,9 @@ LimitResult judge(const Tolerance &limit, const std::vector<ControlPatch> &patch
     if (of_spread && !against_aims)
         out.note = "of the gains themselves: the reference has none";
     if (values.empty()) {
-        out.note = all.empty() ? "no such patch" : "no " + key_of(limit) + " on both sides";
+        out.note = of_spread     ? "no nominal value of which two inks have a gain"
+                   : all.empty() ? "no such patch"
+                                 : "no " + key_of(limit) + " on both sides";
         return out;
     }
     const Statistics statistics = statistics_of(values);

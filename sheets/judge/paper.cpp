@@ -1,5 +1,6 @@
 #include "judge/paper.h"
 
+#include "judge/colour.h"
 #include "read/text.h"
 
 #include <fmt/format.h>
@@ -21,13 +22,23 @@ std::optional<double> ink_on(const Patch &patch)
     return sum;
 }
 
+std::optional<CIELABCOORD> own_lab(const Measurement &sheet, const Patch &patch)
+{
+    return sheet.kind == Kind::colours ? patch.lab : std::nullopt;
+}
+
 } // namespace
+
+CIELABCOORD lab_of(const Paper &paper, ILLUM_OBS illuminant)
+{
+    return paper.lab ? *paper.lab : lab_of(paper.refl, illuminant);
+}
 
 Paper paper_of(const Measurement &sheet, std::string_view name, std::vector<std::string> &warnings)
 {
     if (!name.empty()) {
         const Patch &patch = patch_named(sheet, name);
-        return {patch.name, patch.refl};
+        return {patch.name, patch.refl, own_lab(sheet, patch)};
     }
     const Patch &first = sheet.patches.front();
     if (ink_on(first) > 0) {
@@ -39,7 +50,7 @@ Paper paper_of(const Measurement &sheet, std::string_view name, std::vector<std:
             fmt::format("{}: {} stands for the paper, but has ink{}; --paper chooses", sheet.file,
                         in_quotes(first.name), other));
     }
-    return {first.name, first.refl};
+    return {first.name, first.refl, own_lab(sheet, first)};
 }
 
 } // namespace vantrel::sheets

@@ -3,6 +3,7 @@
 
 #include "read/measurement.h"
 
+#include <optional>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -12,7 +13,10 @@ namespace vantrel::sheets {
 struct Paper {
     std::string name;
     Spectrum refl{};
+    std::optional<CIELABCOORD> lab{}; // where the sheet holds colours alone
 };
+
+CIELABCOORD lab_of(const Paper &paper, ILLUM_OBS illuminant);
 
 // The patch of this name or id. Without a name the first patch, with a warning where its device
 // values have ink. Throws RequestError.

@@ -152,9 +152,10 @@ Predictions predict(const Measurement &sheet, const PredictRequest &request)
 {
     const Inks inks(sheet, request.order);
     std::vector<std::string> warnings = reading_warnings(sheet);
+    const IlluminantChoice illuminant = illuminant_for(request.illuminant, {&sheet}, warnings);
     const Paper paper = paper_of(sheet, request.paper, warnings);
     Predictions out{.file = sheet.file,
-                    .illuminant = request.illuminant,
+                    .illuminant = illuminant,
                     .status = request.status,
                     .paper = paper.name,
                     .all = {},
@@ -163,8 +164,8 @@ Predictions predict(const Measurement &sheet, const PredictRequest &request)
         predict_overprints(out, sheet, inks, paper);
     } else {
         const std::vector<Layer> layers = layers_named(request.inks, sheet, inks);
-        out.all.push_back(prediction_of(layers, paper, request.illuminant, request.status,
-                                        measured_of(layers, inks)));
+        out.all.push_back(
+            prediction_of(layers, paper, illuminant, request.status, measured_of(layers, inks)));
     }
     return out;
 }

@@ -3,6 +3,7 @@
 
 #include "judge/colour.h"
 #include "judge/densitometer.h"
+#include "judge/stated.h"
 #include "read/measurement.h"
 
 #include <cstddef>
@@ -43,7 +44,7 @@ struct Prediction {
 
 struct Predictions {
     std::string file;
-    ILLUM_OBS illuminant;
+    IlluminantChoice illuminant;
     int status;
     std::string paper;
     std::vector<Prediction> all;
@@ -52,7 +53,7 @@ struct Predictions {
 };
 
 struct PredictRequest {
-    ILLUM_OBS illuminant = D50_2DEG;
+    std::optional<ILLUM_OBS> illuminant; // as the file states where it is empty, or else D50
     int status = E_STATUS;
     std::string paper;              // by name or id; the usual one where it is empty
     std::vector<std::string> order; // of printing, as Inks takes it

@@ -49,17 +49,15 @@ void measure_inks(PatchReport &row, const Patch &patch, const Inks &inks,
     }
 }
 
-MetamerismReport metamerism_of(const Paper &paper, const Patch &second,
-                               const ReportRequest &request)
+MetamerismReport metamerism_of(const Paper &paper, const Patch &second, ILLUM_OBS illuminant,
+                               const std::optional<ILLUM_OBS> &second_illuminant)
 {
     MetamerismReport out{.paper = second.name,
-                         .illuminant =
-                             request.second_illuminant.value_or(usual_second(request.illuminant)),
+                         .illuminant = second_illuminant.value_or(usual_second(illuminant)),
                          .sum = 0,
                          .din6172 = 0};
-    Metamerism(paper.refl.data(), second.refl.data(), request.illuminant, out.illuminant, &out.sum);
-    ReflToDIN6172(paper.refl.data(), second.refl.data(), request.illuminant, out.illuminant,
-                  &out.din6172);
+    Metamerism(paper.refl.data(), second.refl.data(), illuminant, out.illuminant, &out.sum);
+    ReflToDIN6172(paper.refl.data(), second.refl.data(), illuminant, out.illuminant, &out.din6172);
     return out;
 }
 
@@ -101,10 +99,12 @@ PatchReport patch_report(const Patch &patch, const Conditions &conditions)
     row.id = patch.id;
     row.name = patch.name;
     row.device = patch.device;
-    row.refl = patch.refl;
-    row.colour = colour_of(patch.refl, conditions.illuminant);
-    row.to_paper = delta_e00(lab_of(conditions.paper.refl, conditions.illuminant), row.colour.lab);
+    row.colour = colour_of(conditions.sheet, patch, conditions.illuminant);
+    row.to_paper = delta_e00(lab_of(conditions.paper, conditions.illuminant), row.colour.lab);
     row.lch = lch_of(row.colour.lab);
+    if (conditions.sheet.kind == Kind::colours)
+        return row;
+    row.refl = patch.refl;
 
     const Densitometer densitometer(conditions.paper.refl, conditions.status);
     const DensityReading reading = densitometer.read(patch.refl);
@@ -117,11 +117,17 @@ PatchReport patch_report(const Patch &patch, const Conditions &conditions)
 PaperReport paper_report(const Paper &paper, ILLUM_OBS illuminant)
 {
     PaperReport out{.name = paper.name,
-                    .lab = lab_of(paper.refl, illuminant),
-                    .brightness = 0,
+                    .lab = lab_of(paper, illuminant),
+                    .brightness = {},
                     .whiteness = {},
                     .no_whiteness = {}};
-    ReflToBrightness(paper.refl.data(), &out.brightness);
+    if (paper.lab) {
+        out.no_whiteness = "there are no spectra";
+        return out;
+    }
+    double brightness = 0;
+    ReflToBrightness(paper.refl.data(), &brightness);
+    out.brightness = brightness;
     double whiteness = 0;
     if (ReflToWhiteE313_98(paper.refl.data(), illuminant, &whiteness))
         out.whiteness = whiteness;
@@ -136,23 +142,28 @@ PaperReport paper_report(const Paper &paper, ILLUM_OBS illuminant)
 Report report_of(const Measurement &sheet, const ReportRequest &request)
 {
     std::vector<std::string> warnings = reading_warnings(sheet);
+    const IlluminantChoice illuminant = illuminant_for(request.illuminant, {&sheet}, warnings);
     const Paper paper = paper_of(sheet, request.paper, warnings);
     std::optional<MetamerismReport> metamerism;
+    if (!request.second_paper.empty() && sheet.kind == Kind::colours)
+        throw RequestError{
+            fmt::format("{} holds colours alone, and metamerism takes spectra", sheet.file)};
     if (!request.second_paper.empty())
-        metamerism = metamerism_of(paper, patch_named(sheet, request.second_paper), request);
+        metamerism = metamerism_of(paper, patch_named(sheet, request.second_paper), illuminant,
+                                   request.second_illuminant);
     const Inks inks(sheet, request.order);
     Report report{.file = sheet.file,
-                  .illuminant = request.illuminant,
+                  .illuminant = illuminant,
                   .status = request.status,
                   .n_factor = request.n_factor,
                   .inks = inks.names(),
                   .source = sheet.source,
-                  .paper = paper_report(paper, request.illuminant),
+                  .paper = paper_report(paper, illuminant),
                   .metamerism = std::move(metamerism),
                   .patches = {},
                   .tone_curves = {},
                   .warnings = std::move(warnings)};
-    const Conditions conditions{inks, paper, request.illuminant, request.status, request.n_factor};
+    const Conditions conditions{sheet, inks, paper, illuminant, request.status, request.n_factor};
     const Work work{request.tell, "Measuring", sheet.patches.size()};
     for (const Patch &patch : sheet.patches) {
         report.patches.push_back(patch_report(patch, conditions));

@@ -4,6 +4,7 @@
 #include "judge/colour.h"
 #include "judge/inks.h"
 #include "judge/paper.h"
+#include "judge/stated.h"
 #include "read/measurement.h"
 
 #include <optional>
@@ -14,7 +15,7 @@
 namespace vantrel::sheets {
 
 struct ReportRequest {
-    ILLUM_OBS illuminant = D50_2DEG;
+    std::optional<ILLUM_OBS> illuminant; // as the file states where it is empty, or else D50
     int status = E_STATUS;
     std::string paper; // by name or id; the usual one where it is empty
     double n_factor = 1;
@@ -30,7 +31,7 @@ struct PatchReport {
     std::string id;
     std::string name;
     std::vector<std::pair<std::string, double>> device; // as in Patch
-    Spectrum refl{};
+    std::optional<Spectrum> refl; // missing where the file holds colours alone
     Colour colour;
     CIELCHCOORD lch{};
     double to_paper = 0;                       // ΔE00
@@ -45,7 +46,7 @@ struct PatchReport {
 struct PaperReport {
     std::string name;
     CIELABCOORD lab{};
-    double brightness = 0;
+    std::optional<double> brightness;
     std::optional<double> whiteness;
     std::string no_whiteness; // the reason
 };
@@ -75,11 +76,11 @@ struct ToneCurve {
 
 struct Report {
     std::string file;
-    ILLUM_OBS illuminant;
+    IlluminantChoice illuminant;
     int status;
     double n_factor;
     std::vector<std::string> inks; // device fields in the order of printing
-    Source source;
+    Source source;                 // without bands where the file holds colours alone
     PaperReport paper;
     std::optional<MetamerismReport> metamerism;
     std::vector<PatchReport> patches;
@@ -89,6 +90,7 @@ struct Report {
 
 // What the report of a patch rests on.
 struct Conditions {
+    const Measurement &sheet;
     const Inks &inks;
     const Paper &paper;
     ILLUM_OBS illuminant;

@@ -207,9 +207,8 @@ Tolerances read_tolerances(std::string_view text)
             for (const toml::node &limit : *value.as_array())
                 out.limits.push_back(limit_of(*limit.as_table()));
         else
-            throw InputError{line_of(value),
-                             fmt::format("no key {} here; there are name = \"…\" and [[limit]]",
-                                         in_quotes(key.str()))};
+            throw InputError{line_of(value), fmt::format("{} is none of name = \"…\" and [[limit]]",
+                                                         in_quotes(key.str()))};
     }
     if (out.limits.empty())
         throw InputError{0, "no [[limit]] in this file"};

@@ -3,6 +3,7 @@
 #include "judge/names.h"
 #include "read/text.h"
 #include "write/json_text.h"
+#include "write/limits.h"
 #include "write/result.h"
 #include "write/table_text.h"
 
@@ -48,15 +49,16 @@ void add_pairs(Lines &lines, const Comparison &comparison, const std::vector<std
                   fmt::format("{:>4}{:>7}{:>7}  {}",
                               pair.response ? response_code(comparison.status, *pair.response) : "",
                               fixed(density_difference(pair), 3), fixed(pair.metamerism),
-                              pair.verbal));
+                              pair.verbal.value_or("")));
     }
 }
 
-void add_statistics(Lines &lines, const Comparison &comparison)
+void add_statistics(Lines &lines, const Comparison &comparison,
+                    const std::vector<Statistics> &statistics)
 {
     lines.add(fmt::format("\n{:<22}{:>8}{:>8}{:>8}", "", "mean", "95 %", "largest"));
     for (std::size_t i = 0; i < comparison.metrics.size(); ++i) {
-        const Statistics &all = comparison.statistics[i];
+        const Statistics &all = statistics[i];
         lines.add(fmt::format("{:<22}{:>8}{:>8}{:>8}  {}", title_of(comparison.metrics[i]),
                               fixed(all.mean), fixed(all.p95), fixed(all.max),
                               cut(comparison.pairs[all.max_at].reference.name, kWidestName)));
@@ -76,18 +78,53 @@ void add_unpaired(Lines &lines, const std::string &file, const std::vector<std::
     lines.add(line);
 }
 
-void add_verdict(Lines &lines, const Comparison &comparison)
+// "Failed: 3 of 5 pairs are above ΔE00 2; all 7 limits are held"
+std::string sentence_of(Verdict verdict, const Comparison &comparison,
+                        std::vector<double> PairReport::*differences,
+                        const std::vector<LimitResult> &limits)
 {
-    if (!comparison.tolerance)
+    std::string word(name_of(verdict));
+    word[0] = static_cast<char>(word[0] - 'a' + 'A');
+    std::string reasons;
+    if (comparison.tolerance) {
+        const auto above = std::count_if(
+            comparison.pairs.begin(), comparison.pairs.end(), [&](const PairReport &pair) {
+                return !((pair.*differences)[0] <= *comparison.tolerance);
+            });
+        const std::string title = title_of(comparison.metrics[0]);
+        reasons = above ? fmt::format("{} of {} pairs are above {} {:g}", above,
+                                      comparison.pairs.size(), title, *comparison.tolerance)
+                        : fmt::format("no {} is above {:g}", title, *comparison.tolerance);
+    }
+    if (!limits.empty())
+        reasons += (reasons.empty() ? "" : "; ") + counts_of(limits);
+    return fmt::format("{}: {}", word, reasons);
+}
+
+std::string limits_title(const Comparison &comparison)
+{
+    return comparison.tolerances.empty() ? "Limits" : "Limits: " + comparison.tolerances;
+}
+
+void add_verdicts(Lines &lines, const Comparison &comparison)
+{
+    add_limits(lines, limits_title(comparison), comparison.limits);
+    if (comparison.verdict)
+        lines.add('\n' + sentence_of(*comparison.verdict, comparison, &PairReport::delta_e,
+                                     comparison.limits));
+    if (!comparison.corrected)
         return;
-    const auto above = std::count_if(
-        comparison.pairs.begin(), comparison.pairs.end(),
-        [&](const PairReport &pair) { return !(pair.delta_e[0] <= *comparison.tolerance); });
-    const std::string title = title_of(comparison.metrics[0]);
-    lines.add(comparison.passed()
-                  ? fmt::format("\nPassed: no {} is above {:g}", title, *comparison.tolerance)
-                  : fmt::format("\nFailed: {} of {} pairs are above {} {:g}", above,
-                                comparison.pairs.size(), title, *comparison.tolerance));
+    const SubstrateCorrected &corrected = *comparison.corrected;
+    lines.add(fmt::format("\nSubstrate-corrected: the aims' paper {} taken to the sample's {}, {} "
+                          "fixed",
+                          fixed(corrected.aim_paper), fixed(corrected.paper),
+                          cut(corrected.darkest, kWidestInText)));
+    add_statistics(lines, comparison, corrected.statistics);
+    add_limits(lines, limits_title(comparison) + ", substrate-corrected", corrected.limits);
+    if (corrected.verdict)
+        lines.add(fmt::format("\nSubstrate-corrected: {}",
+                              sentence_of(*corrected.verdict, comparison,
+                                          &PairReport::corrected_delta_e, corrected.limits)));
 }
 
 Json side_json(const Side &side)
@@ -97,7 +134,7 @@ Json side_json(const Side &side)
             {"rgb", hex(side.colour.rgb)},
             {"lab", lab_json(side.colour.lab)},
             {"density", or_null(side.density)},
-            {"refl", side.refl}};
+            {"refl", or_null(side.refl)}};
 }
 
 Json pair_json(const PairReport &pair, const Comparison &comparison)
@@ -107,13 +144,45 @@ Json pair_json(const PairReport &pair, const Comparison &comparison)
                 {"sample", side_json(pair.sample)}};
     for (std::size_t i = 0; i < pair.delta_e.size(); ++i)
         out[std::string(names_of(comparison.metrics[i].formula).key)] = pair.delta_e[i];
-    out["verbal"] = pair.verbal;
-    out["metamerism"] = pair.metamerism;
-    out["din6172"] = pair.din6172;
+    out["verbal"] = or_null(pair.verbal);
+    out["metamerism"] = or_null(pair.metamerism);
+    out["din6172"] = or_null(pair.din6172);
     out["response"] =
         pair.response ? Json(response_name(comparison.status, *pair.response)) : Json();
     out["density_difference"] = or_null(density_difference(pair));
+    if (!pair.corrected_aim)
+        return out;
+    Json &corrected = out["corrected"];
+    corrected["lab"] = lab_json(*pair.corrected_aim);
+    for (std::size_t i = 0; i < pair.corrected_delta_e.size(); ++i)
+        corrected[std::string(names_of(comparison.metrics[i].formula).key)] =
+            pair.corrected_delta_e[i];
     return out;
+}
+
+Json statistics_json(const Comparison &comparison, const std::vector<Statistics> &statistics)
+{
+    Json out = Json::object();
+    for (std::size_t i = 0; i < statistics.size(); ++i)
+        out[std::string(names_of(comparison.metrics[i].formula).key)] = {
+            {"mean", statistics[i].mean},
+            {"p95", statistics[i].p95},
+            {"max", statistics[i].max},
+            {"max_patch", comparison.pairs[statistics[i].max_at].reference.name}};
+    return out;
+}
+
+Json corrected_json(const Comparison &comparison)
+{
+    if (!comparison.corrected)
+        return {};
+    const SubstrateCorrected &corrected = *comparison.corrected;
+    return {{"reference_paper", lab_json(corrected.aim_paper)},
+            {"sample_paper", lab_json(corrected.paper)},
+            {"darkest", corrected.darkest},
+            {"verdict", corrected.verdict ? Json(name_of(*corrected.verdict)) : Json()},
+            {"limits", limits_json(corrected.limits)},
+            {"statistics", statistics_json(comparison, corrected.statistics)}};
 }
 
 } // namespace
@@ -127,7 +196,7 @@ void write_table(const Comparison &comparison, const Sink &sink, const TableStyl
     lines.add(fmt::format("{} against {}: {} {} by {}", comparison.sample, comparison.reference,
                           comparison.pairs.size(), comparison.pairs.size() == 1 ? "pair" : "pairs",
                           name_of(comparison.paired_by)));
-    lines.add(fmt::format("{}, metamerism with {}; {} over {}", name_of(comparison.illuminant),
+    lines.add(fmt::format("{}, metamerism with {}; {} over {}", said(comparison.illuminant),
                           name_of(comparison.second_illuminant), status_name(comparison.status),
                           paper));
     if (style.all_pairs) {
@@ -139,34 +208,29 @@ void write_table(const Comparison &comparison, const Sink &sink, const TableStyl
     lines.add(fmt::format("\nThe worst {} by {}", comparison.worst.size(),
                           title_of(comparison.metrics[0])));
     add_pairs(lines, comparison, comparison.worst, style.colour);
-    add_statistics(lines, comparison);
+    add_statistics(lines, comparison, comparison.statistics);
     add_unpaired(lines, comparison.reference, comparison.only_reference);
     add_unpaired(lines, comparison.sample, comparison.only_sample);
-    add_verdict(lines, comparison);
+    add_verdicts(lines, comparison);
 }
 
 void write_json(const Comparison &comparison, const Sink &sink)
 {
-    Json names = Json::array(), labels = Json::object(), weights = Json::object(),
-         statistics = Json::object();
+    Json names = Json::array(), labels = Json::object(), weights = Json::object();
     for (std::size_t i = 0; i < comparison.metrics.size(); ++i) {
         const Metric &metric = comparison.metrics[i];
         const std::string name(names_of(metric.formula).key);
-        const Statistics &all = comparison.statistics[i];
         names.push_back(name);
         labels[name] = title_of(metric);
         if (metric.formula != Formula::de76)
             weights[name] = {metric.lightness, metric.chroma};
-        statistics[name] = {{"mean", all.mean},
-                            {"p95", all.p95},
-                            {"max", all.max},
-                            {"max_patch", comparison.pairs[all.max_at].reference.name}};
     }
     const Json head = {
         {"command", "compare"},
         {"reference", {{"file", comparison.reference}, {"paper", comparison.reference_paper}}},
         {"sample", {{"file", comparison.sample}, {"paper", comparison.sample_paper}}},
         {"illuminant", name_of(comparison.illuminant)},
+        {"illuminant_by", comparison.illuminant.by},
         {"second_illuminant", name_of(comparison.second_illuminant)},
         {"status", status_name(comparison.status)},
         {"paired_by", name_of(comparison.paired_by)},
@@ -174,8 +238,12 @@ void write_json(const Comparison &comparison, const Sink &sink)
         {"labels", labels},
         {"weights", weights},
         {"tolerance", or_null(comparison.tolerance)},
-        {"passed", comparison.tolerance ? Json(comparison.passed()) : Json()},
-        {"statistics", statistics},
+        {"verdict", comparison.verdict ? Json(name_of(*comparison.verdict)) : Json()},
+        {"passed", comparison.verdict ? Json(*comparison.verdict == Verdict::passed) : Json()},
+        {"tolerances", comparison.tolerances.empty() ? Json() : Json(comparison.tolerances)},
+        {"limits", limits_json(comparison.limits)},
+        {"corrected", corrected_json(comparison)},
+        {"statistics", statistics_json(comparison, comparison.statistics)},
         {"worst", comparison.worst},
         {"unpaired",
          {{"reference", comparison.only_reference}, {"sample", comparison.only_sample}}},
@@ -206,7 +274,14 @@ std::vector<Flat> flat_of(const Comparison &comparison)
         flat.number(std::string(names.key), std::string(names.cgats),
                     [&pairs, k](std::size_t i) { return pairs[i].delta_e[k]; });
     }
-    flat.text("verbal", "VERBAL", [&pairs](std::size_t i) { return pairs[i].verbal; });
+    if (comparison.corrected)
+        for (std::size_t k = 0; k < comparison.metrics.size(); ++k) {
+            const FormulaNames &names = names_of(comparison.metrics[k].formula);
+            flat.number("corrected_" + std::string(names.key),
+                        "CORRECTED_" + std::string(names.cgats),
+                        [&pairs, k](std::size_t i) { return pairs[i].corrected_delta_e[k]; });
+        }
+    flat.text("verbal", "VERBAL", [&pairs](std::size_t i) { return pairs[i].verbal.value_or(""); });
     flat.number("metamerism", "METAMERISM",
                 [&pairs](std::size_t i) { return pairs[i].metamerism; });
     flat.number("din6172", "DIN6172", [&pairs](std::size_t i) { return pairs[i].din6172; });
@@ -217,8 +292,16 @@ std::vector<Flat> flat_of(const Comparison &comparison)
     flat.number("density", "DENSITY", [&pairs](std::size_t i) { return pairs[i].sample.density; });
     flat.number("reference_density", "REFERENCE_DENSITY",
                 [&pairs](std::size_t i) { return pairs[i].reference.density; });
-    flat.spectrum([&pairs](std::size_t i) -> const Spectrum & { return pairs[i].sample.refl; });
-    return {flat};
+    if (pairs.front().sample.refl)
+        flat.spectrum(
+            [&pairs](std::size_t i) -> const Spectrum & { return *pairs[i].sample.refl; });
+    std::vector<Flat> tables = {flat};
+    if (!comparison.limits.empty())
+        tables.push_back(flat_of(comparison.limits, "reference", limits_title(comparison)));
+    if (comparison.corrected && !comparison.corrected->limits.empty())
+        tables.push_back(flat_of(comparison.corrected->limits, "substrate-corrected",
+                                 limits_title(comparison) + ", substrate-corrected"));
+    return tables;
 }
 
 } // namespace vantrel::sheets

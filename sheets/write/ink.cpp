@@ -27,7 +27,7 @@ void add_summary(Lines &lines, const PatchStudy &study, bool colour)
     const PatchReport &patch = study.patch;
     lines.add(fmt::format("{} ({}) of {}{}", cut(patch.name, kWidestName), patch.id, study.file,
                           device_values(patch)));
-    lines.add(fmt::format("{}, {} over {}", name_of(study.illuminant), status_name(study.status),
+    lines.add(fmt::format("{}, {} over {}", said(study.illuminant), status_name(study.status),
                           cut(study.paper, kWidestInText)));
     lines.add(fmt::format("\n{}L*a*b* {}, C* {}, h {}, ΔE00 to the paper {}",
                           colour ? swatch(patch.colour.rgb) + ' ' : "", fixed(patch.colour.lab),
@@ -103,9 +103,9 @@ void add_bands(Lines &lines, const PatchStudy &study)
                       : ""));
     for (int band = 0; band < VANTREL_BANDS; ++band) {
         std::string line =
-            fmt::format("{:<10}{:>10}", 400 + 10 * band, fixed(study.patch.refl[band], 3));
+            fmt::format("{:<10}{:>10}", 400 + 10 * band, fixed((*study.patch.refl)[band], 3));
         if (const auto &against = study.against)
-            line += fmt::format("{:>10}{:>12}{:>12}", fixed(against->patch.refl[band], 3),
+            line += fmt::format("{:>10}{:>12}{:>12}", fixed((*against->patch.refl)[band], 3),
                                 fixed(against->a[band]), fixed(against->b[band]));
         lines.add(line);
     }
@@ -171,7 +171,7 @@ Flat spectra(const PatchStudy &study)
     flat.colour("", [patch](std::size_t i) { return &patch(i).colour; });
     flat.number("brightness", "BRIGHTNESS", of_first(study.as_paper.brightness));
     flat.number("whiteness", "WHITENESS", of_first(study.as_paper.whiteness));
-    flat.spectrum([patch](std::size_t i) -> const Spectrum & { return patch(i).refl; });
+    flat.spectrum([patch](std::size_t i) -> const Spectrum & { return *patch(i).refl; });
     return flat;
 }
 
@@ -262,10 +262,11 @@ void write_json(const PatchStudy &study, const Sink &sink)
     Json out = {{"command", "ink"},
                 {"file", study.file},
                 {"illuminant", name_of(study.illuminant)},
+                {"illuminant_by", study.illuminant.by},
                 {"status", status_name(study.status)},
                 {"paper", study.paper},
                 {"patch", patch_json(study.patch, study.status)},
-                {"brightness", study.as_paper.brightness},
+                {"brightness", or_null(study.as_paper.brightness)},
                 {"whiteness", or_null(study.as_paper.whiteness)}};
     if (!study.as_paper.whiteness)
         out["no_whiteness"] = study.as_paper.no_whiteness;

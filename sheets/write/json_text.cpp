@@ -36,7 +36,7 @@ Json patch_json(const PatchReport &patch, int status)
             {"hue_error", or_null(patch.hue_error)},
             {"grayness", or_null(patch.grayness)},
             {"trap", or_null(patch.trap)},
-            {"refl", patch.refl}};
+            {"refl", or_null(patch.refl)}};
 }
 
 void write_with_array(const Json &object, std::string_view name, std::size_t count,

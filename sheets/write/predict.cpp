@@ -106,7 +106,7 @@ void write_table(const Predictions &predictions, const Sink &sink, const TableSt
     for (const Prediction &prediction : predictions.all)
         width = std::max(width, characters(title(prediction)));
     Lines lines(sink);
-    lines.add(fmt::format("{}: {}, on {}", predictions.file, name_of(predictions.illuminant),
+    lines.add(fmt::format("{}: {}, on {}", predictions.file, said(predictions.illuminant),
                           cut(predictions.paper, kWidestName)));
     if (predictions.all.size() == 1)
         lines.add(inks_of(predictions.all[0], kWidestInText));
@@ -144,6 +144,7 @@ void write_json(const Predictions &predictions, const Sink &sink)
         {"command", "predict"},
         {"file", predictions.file},
         {"illuminant", name_of(predictions.illuminant)},
+        {"illuminant_by", predictions.illuminant.by},
         {"status", status_name(predictions.status)},
         {"paper", predictions.paper},
         {"left_out", predictions.left_out},

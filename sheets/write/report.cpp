@@ -45,9 +45,9 @@ void add_head(Lines &lines, const Report &report)
     lines.add(fmt::format("{}: {} {}", report.file, report.patches.size(),
                           report.patches.size() == 1 ? "patch" : "patches"));
     lines.add(fmt::format("{}, {}, ΔE00 and density over {}, dot area with n = {:g}",
-                          name_of(report.illuminant), status_name(report.status), paper,
+                          said(report.illuminant), status_name(report.status), paper,
                           report.n_factor));
-    lines.add(spectra_of(report.source));
+    lines.add(report.source.bands ? spectra_of(report.source) : "Colours alone, no spectra");
 }
 
 void add_patches(Lines &lines, const Report &report, std::size_t width, bool colour)
@@ -75,7 +75,8 @@ void add_paper(Lines &lines, const Report &report)
     const PaperReport &paper = report.paper;
     lines.add("");
     lines.add(
-        fmt::format("Paper: brightness {}, whiteness {}, L*a*b* {}", fixed(paper.brightness),
+        fmt::format("Paper: brightness {}, whiteness {}, L*a*b* {}",
+                    paper.brightness ? fixed(paper.brightness) : "none",
                     paper.whiteness ? fixed(paper.whiteness) : "none (" + paper.no_whiteness + ")",
                     fixed(paper.lab)));
     if (const auto &metamerism = report.metamerism)
@@ -169,7 +170,7 @@ Json paper_json(const Report &report)
     Json out = {
         {"name", paper.name},
         {"lab", lab_json(paper.lab)},
-        {"brightness", paper.brightness},
+        {"brightness", or_null(paper.brightness)},
         {"whiteness", or_null(paper.whiteness)},
     };
     if (!paper.whiteness)
@@ -202,6 +203,7 @@ void write_sheet(const Report &report, const Sink &sink)
     const Json head = {
         {"file", report.file},
         {"illuminant", name_of(report.illuminant)},
+        {"illuminant_by", report.illuminant.by},
         {"status", status_name(report.status)},
         {"n_factor", report.n_factor},
         {"inks", report.inks},
@@ -273,7 +275,8 @@ Flat flat_of(const Report &report)
                 [&patches](std::size_t i) { return patches[i].hue_error; });
     flat.number("grayness", "GRAYNESS", [&patches](std::size_t i) { return patches[i].grayness; });
     flat.number("trap", "TRAP", [&patches](std::size_t i) { return patches[i].trap; });
-    flat.spectrum([&patches](std::size_t i) -> const Spectrum & { return patches[i].refl; });
+    if (patches.front().refl)
+        flat.spectrum([&patches](std::size_t i) -> const Spectrum & { return *patches[i].refl; });
     return flat;
 }
 

@@ -1,5 +1,7 @@
 #include "write/table_text.h"
 
+#include "read/illuminant.h"
+
 #include <fmt/format.h>
 
 #include <algorithm>
@@ -18,6 +20,12 @@ std::string fixed(const std::optional<double> &value, int decimals)
 std::string fixed(const CIELABCOORD &lab)
 {
     return fmt::format("{} {} {}", fixed(lab.L), fixed(lab.a), fixed(lab.b));
+}
+
+std::string said(const IlluminantChoice &choice)
+{
+    return fmt::format("{}{}", name_of(choice.illuminant),
+                       choice.by == "file" ? " as the file says" : "");
 }
 
 std::size_t characters(const std::string &text)

@@ -2,6 +2,7 @@
 #pragma once
 
 #include "judge/colour.h"
+#include "judge/stated.h"
 #include "write/sink.h"
 
 #include <cstddef>
@@ -16,6 +17,8 @@ constexpr std::size_t kWidestInText = 30; // a line has 120 columns
 // Without a minus before zero; nothing stays blank.
 std::string fixed(const std::optional<double> &value, int decimals = 2);
 std::string fixed(const CIELABCOORD &lab); // L*, a*, b* with spaces between
+
+std::string said(const IlluminantChoice &choice); // with "as the file says" where it does
 
 std::size_t characters(const std::string &text);
 std::string swatch(const Rgb &rgb);

@@ -1,5 +1,6 @@
 // vantrel compare REFERENCE SAMPLE
 
+#include "file.h"
 #include "judge/compare.h"
 #include "options.h"
 #include "progress.h"
@@ -22,6 +23,8 @@ struct CompareOptions : Options {
     std::string second_illuminant;    // its default follows the first
     std::string words = "ab";
     std::optional<double> tolerance;
+    std::string tolerances; // a file
+    bool substrate_corrected = false;
     bool all = false;
 };
 
@@ -87,6 +90,21 @@ Pairing pairing_of(const std::string &name)
     return Pairing::automatic;
 }
 
+Tolerances tolerances_of(const std::string &path)
+{
+    if (path.empty())
+        return {};
+    const std::string file = printable(path);
+    try {
+        Tolerances tolerances = read_tolerances(read_file(path));
+        if (tolerances.name.empty())
+            tolerances.name = file;
+        return tolerances;
+    } catch (const InputError &error) {
+        throw RequestError{complaint_of(file, error)};
+    }
+}
+
 Outcome run(const CompareOptions &options)
 {
     if (options.tolerance && !(*options.tolerance >= 0 && std::isfinite(*options.tolerance)))
@@ -94,22 +112,24 @@ Outcome run(const CompareOptions &options)
     const CompareRequest request{
         .pairing = pairing_of(options.pairing),
         .metrics = metrics_of(options),
-        .illuminant = illuminant_of(options.illuminant),
+        .illuminant = optional_illuminant(options.illuminant),
         .second_illuminant = optional_illuminant(options.second_illuminant),
         .status = status_of(options.status),
         .words_of_hue = options.words == "hue",
         .tolerance = options.tolerance,
+        .tolerances = tolerances_of(options.tolerances),
+        .substrate_corrected = options.substrate_corrected,
         .paper = options.paper,
         .tell = progress_bar(),
     };
-    const Measurement reference = sheet_of(options.reference, options);
-    const Measurement sample = sheet_of(options.sample, options);
+    const Measurement reference = sheet_of(options.reference, options, true);
+    const Measurement sample = sheet_of(options.sample, options, true);
     Comparison comparison = compare(reference, sample, request);
-    const bool passed = comparison.passed();
+    const auto verdict = comparison.corrected ? comparison.corrected->verdict : comparison.verdict;
     std::vector<std::string> warnings = comparison.warnings;
     Outcome outcome =
         outcome_of(std::move(comparison), std::move(warnings), options, {.all_pairs = options.all});
-    outcome.within_tolerance = passed;
+    outcome.within_tolerance = verdict.value_or(Verdict::passed) == Verdict::passed;
     return outcome;
 }
 
@@ -119,7 +139,9 @@ constexpr const char *kFooter =
     "shorter sheet's\npatches find a partner, or else by place where the sheets are equally long. "
     "Patches without a\npartner are told, and do not count.\n\n"
     "With --tolerance the sheet fails, and the exit status is 1, when any pair is above it in the "
-    "first\nformula. The 95th percentile is the smallest difference that at least 95 % of the "
+    "first\nformula; with --tolerances when one of the limits fails or could not be judged. With\n"
+    "--substrate-corrected the exit status is that of the corrected verdict. The 95th percentile "
+    "is the smallest difference that at least 95 % of the "
     "pairs do not\nexceed. CIE94 and CMC weigh by the colour of the reference. Metamerism is the "
     "sum of the two\nDelta E*ab under the two illuminants; DIN 6172 tells how far the difference "
     "moves between them.\nDensities are over each sheet's own paper, in the response that reads "
@@ -165,6 +187,10 @@ Command add_compare(CLI::App &app)
         ->check(CLI::IsMember({"ab", "hue"}))
         ->capture_default_str();
     command->add_option("--tolerance", options->tolerance, "Largest difference that is accepted");
+    command->add_option("--tolerances", options->tolerances,
+                        "TOML file of limits by group of patches; examples/ has two");
+    command->add_flag("--substrate-corrected", options->substrate_corrected,
+                      "Judge too by aims that are moved to the sample's paper (ISO 13655)");
     command->add_flag("--all", options->all, "List every pair in the table, not the worst ten");
     command->footer(kFooter);
     return {command, [options] { return run(*options); }};

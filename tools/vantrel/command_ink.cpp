@@ -19,7 +19,7 @@ Outcome run(const InkOptions &options)
     const InkRequest request{
         .patch = options.patch,
         .against = options.against,
-        .illuminant = illuminant_of(options.illuminant),
+        .illuminant = optional_illuminant(options.illuminant),
         .status = status_of(options.status),
         .paper = options.paper,
         .order = options.order,

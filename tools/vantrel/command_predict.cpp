@@ -17,7 +17,7 @@ struct PredictOptions : Options {
 Outcome run(const PredictOptions &options)
 {
     const PredictRequest request{
-        .illuminant = illuminant_of(options.illuminant),
+        .illuminant = optional_illuminant(options.illuminant),
         .status = status_of(options.status),
         .paper = options.paper,
         .order = options.order,

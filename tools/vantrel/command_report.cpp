@@ -23,7 +23,7 @@ Outcome run(const ReportOptions &options)
     if (!(options.n_factor > 0) || !std::isfinite(options.n_factor))
         throw RequestError{"--n-factor takes a number above 0"};
     const ReportRequest request{
-        .illuminant = illuminant_of(options.illuminant),
+        .illuminant = optional_illuminant(options.illuminant),
         .status = status_of(options.status),
         .paper = options.paper,
         .n_factor = options.n_factor,
@@ -35,7 +35,7 @@ Outcome run(const ReportOptions &options)
     std::vector<Report> sheets;
     std::vector<std::string> warnings;
     for (const std::string &file : options.files) {
-        sheets.push_back(report_of(sheet_of(file, options), request));
+        sheets.push_back(report_of(sheet_of(file, options, true), request));
         for (const std::string &warning : sheets.back().warnings)
             warnings.push_back(warning);
     }

@@ -27,10 +27,10 @@ void add_common_options(CLI::App &command, Options &options)
 
 void add_sheet_options(CLI::App &command, Options &options)
 {
-    command
-        .add_option("--illuminant", options.illuminant,
-                    "Illuminant and observer: " + illuminant_names())
-        ->capture_default_str();
+    command.add_option(
+        "--illuminant", options.illuminant,
+        "Illuminant and observer (default: what the file states, or else D50_2DEG): " +
+            illuminant_names());
     command.add_option("--status", options.status, "Density status: " + status_names())
         ->capture_default_str();
     command.add_option("--paper", options.paper,
@@ -81,7 +81,13 @@ std::optional<ILLUM_OBS> optional_illuminant(const std::string &name)
     return name.empty() ? std::nullopt : std::optional(illuminant_of(name));
 }
 
-Measurement sheet_of(const std::string &path, const Options &options)
+std::string complaint_of(const std::string &file, const InputError &error)
+{
+    return fmt::format("{}{}: {}", file, error.line ? fmt::format(":{}", error.line) : "",
+                       error.reason);
+}
+
+Measurement sheet_of(const std::string &path, const Options &options, bool colours)
 {
     const std::string file = printable(path);
     try {
@@ -89,13 +95,13 @@ Measurement sheet_of(const std::string &path, const Options &options)
         if (options.scale != "auto")
             reading.scale = options.scale == "percent" ? Scale::percent : Scale::fraction;
         reading.condition = options.condition;
+        reading.colours = colours;
         reading.tell = progress_bar();
         Measurement sheet = read_measurement(read_file(path), reading);
         sheet.file = file;
         return sheet;
     } catch (const InputError &error) {
-        throw RequestError{fmt::format(
-            "{}{}: {}", file, error.line ? fmt::format(":{}", error.line) : "", error.reason)};
+        throw RequestError{complaint_of(file, error)};
     }
 }
 

@@ -18,7 +18,7 @@ namespace vantrel::program {
 using namespace sheets;
 
 struct Options {
-    std::string illuminant = "D50_2DEG";
+    std::string illuminant; // what the file states, or D50, where it is empty
     std::string status = "E_STATUS";
     std::string paper; // name or id
     std::string scale = "auto";
@@ -60,8 +60,11 @@ int status_of(const std::string &name);
 // Nothing where the name is empty.
 std::optional<ILLUM_OBS> optional_illuminant(const std::string &name);
 
-// Reads a file; throws RequestError.
-Measurement sheet_of(const std::string &path, const Options &options);
+// Reads a file; one of colours alone will do where `colours` says so. Throws RequestError.
+Measurement sheet_of(const std::string &path, const Options &options, bool colours = false);
+
+// "sheet.txt:12: …"
+std::string complaint_of(const std::string &file, const InputError &error);
 
 bool shows_colour(const Options &options);
 

@@ -13,13 +13,29 @@ function verdict(result) {
   const labelOf = labeller(result);
   const { max, max_patch: patch } = result.statistics[formula];
   const worst = [`The largest ${labelOf(formula)} is ${fixed(max)}, at `, named(patch)];
-  if (result.passed === null || result.tolerance === null)
+  const word = result.verdict;
+  if (!word)
     return h('div', { class: 'verdict' }, h('p', { class: 'word' }, 'No tolerance given'),
       h('p', {}, worst, '.'));
-  return h('div', { class: `verdict ${result.passed ? 'passed' : 'failed'}` },
-    h('p', { class: 'word' }, result.passed ? 'Passed' : 'Failed'),
-    h('p', {}, worst, `; the tolerance is ${result.tolerance}.`));
+  return h('div', { class: `verdict ${word}` },
+    h('p', { class: 'word' }, word[0].toUpperCase() + word.slice(1)),
+    h('p', {}, worst, result.tolerance === null ? '.' : `; the tolerance is ${result.tolerance}.`),
+    result.corrected ? h('p', {}, `Substrate-corrected: ${result.corrected.verdict}.`) : null);
 }
+
+const digits = (limit) => (limit.formula === 'density' ? 3 : 2);
+const statisticNames = { maximum: 'largest', mean: 'mean', p95: '95th percentile' };
+
+const limitsTable = (caption, limits) => (limits?.length ? smallTable(caption, [
+  { label: 'Patches', text: (limit) => limit.patches },
+  { label: 'Quantity', text: (limit) => `${limit.label}, ${statisticNames[limit.statistic]}` },
+  { label: 'Judged', number: true, text: (limit) => `${limit.judged} of ${limit.found}` },
+  { label: 'Measured', number: true, text: (limit) => fixed(limit.measured, digits(limit)) },
+  { label: 'Limit', number: true, text: (limit) => fixed(limit.limit, digits(limit)) },
+  { label: 'Margin', number: true, text: (limit) => fixed(limit.margin, digits(limit)) },
+  { label: 'Verdict', text: (limit) => limit.verdict },
+  { label: 'Largest at', text: (limit) => [named(limit.max_patch ?? ''), limit.note ?? ''] },
+], limits) : null);
 
 function unpaired(result) {
   const side = (title, names) => names.length
@@ -105,6 +121,8 @@ export function comparePage(result) {
       ['Largest', fixed(max), named(statistics[formula].max_patch)],
     ]) : statisticsTable(result),
     unpaired(result),
+    limitsTable(result.tolerances ?? 'Limits', result.limits),
+    limitsTable(`${result.tolerances}, substrate-corrected`, result.corrected?.limits),
     h('div', { class: 'tables' }, smallTable(`The worst ${worst.length} by ${labelOf(formula)}`, [
       { label: 'Patch', text: (pair) => [swatch(pair.reference.rgb), swatch(pair.sample.rgb),
         named(pair.name)] },
@@ -114,7 +132,8 @@ export function comparePage(result) {
       { label: 'Reference L*a*b*', number: true, text: (pair) => labText(pair.reference.lab) },
       { label: 'Sample L*a*b*', number: true, text: (pair) => labText(pair.sample.lab) },
     ], worst)),
-    h('div', { class: 'pictures' }, histogram.element, plane.element, spectra.element,
+    h('div', { class: 'pictures' }, histogram.element, plane.element,
+      pairs.some((pair) => pair.sample.refl) ? spectra.element : null,
       swatches(pairs.map((pair) => ({ name: pair.name, rgb: bothColours(pair) })),
         'The reference upper left, the sample lower right, as a screen can show them.')),
     searchTable({

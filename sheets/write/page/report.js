@@ -98,7 +98,8 @@ const toneTable = (curves) => h('details', {}, h('summary', {}, 'Numbers'),
 
 // The spectra, to which chosen patches are added, and what follows the choice.
 export function spectraPicture(fixedSeries, says) {
-  let series = fixedSeries;
+  const measured = (all) => all.filter((one) => one.refl); // not colours alone
+  let series = measured(fixedSeries);
   const keys = h('div');
   const numbers = h('div');
   const refresh = () => {
@@ -108,7 +109,7 @@ export function spectraPicture(fixedSeries, says) {
   refresh();
   const spectra = picture('Spectra', (width) => spectraPlot(series)(width), says, keys, numbers);
   return { element: spectra.element, add(more) {
-    series = [...fixedSeries, ...more];
+    series = measured([...fixedSeries, ...more]);
     refresh();
     spectra.draw();
   } };
@@ -214,7 +215,8 @@ function sheetSection(sheet, id, heading) {
         sheet.inks.length ? count(sheet.inks.length, 'ink') : null,
         sheet.illuminant, sheet.status, sheet.n_factor !== 1 ? `n = ${sheet.n_factor}` : null,
         source.condition,
-        `measured at ${source.first_nm}–${source.last_nm} nm in ${count(source.bands, 'band')}`,
+        source.bands ? `measured at ${source.first_nm}–${source.last_nm} nm in ` +
+          count(source.bands, 'band') : 'colours alone, no spectra',
         source.averaged ? 'averaged to 10 nm and corrected for the width' : null,
         source.interpolated ? 'interpolated to 10 nm' : null,
         source.held ? 'the last value held to 400 or 700 nm' : null,
@@ -222,7 +224,7 @@ function sheetSection(sheet, id, heading) {
       ].filter(Boolean).join(' · '))),
     keyFigures(sheet, solids),
     swatches(sheet.patches, 'In the order of the file, as a screen can show them.'),
-    h('div', { class: 'pictures' }, spectra.element, ...(curves.length ? tonePictures(curves) : []),
+    h('div', { class: 'pictures' }, source.bands ? spectra.element : null, ...(curves.length ? tonePictures(curves) : []),
       plane.element, distances.element, attributeTables(sheet)),
     searchTable({
       caption: 'All patches', noun: 'patch', columns: columnsOf(sheet), rows: sheet.patches,

@@ -1,0 +1,17 @@
+// The pairs of a comparison as limits judge them.
+#pragma once
+
+#include "judge/compare.h"
+#include "judge/limits.h"
+#include "judge/paper.h"
+
+#include <vector>
+
+namespace vantrel::sheets {
+
+// Gains of tints are against the solid of the same ink on the same side, over that side's paper.
+std::vector<ControlPatch> control_patches(const std::vector<PairReport> &pairs,
+                                          const Paper &reference_paper, const Paper &sample_paper,
+                                          int status);
+
+} // namespace vantrel::sheets

@@ -1,0 +1,88 @@
+#include "judge/stated.h"
+
+#include "judge/colour.h"
+#include "read/illuminant.h"
+#include "read/text.h"
+
+#include <fmt/format.h>
+
+namespace vantrel::sheets {
+namespace {
+
+constexpr double kOwnColoursAgree = 0.5; // mean ΔE*ab
+
+// Mean ΔE*ab between a file's own L*a*b* and those of its spectra; nothing where it has none.
+std::optional<double> mean_difference(const Measurement &sheet, ILLUM_OBS illuminant)
+{
+    double sum = 0;
+    std::size_t count = 0;
+    for (const Patch &patch : sheet.patches) {
+        if (!patch.lab)
+            continue;
+        const CIELABCOORD lab = lab_of(patch.refl, illuminant);
+        double delta_e = 0;
+        LabToDElab(&*patch.lab, &lab, &delta_e);
+        sum += delta_e;
+        ++count;
+    }
+    return count ? std::optional(sum / static_cast<double>(count)) : std::nullopt;
+}
+
+void check_own_colours(const Measurement &sheet, ILLUM_OBS illuminant,
+                       std::vector<std::string> &warnings)
+{
+    if (sheet.kind == Kind::colours)
+        return;
+    const ILLUM_OBS own = sheet.colours.illuminant.value_or(illuminant);
+    const auto mean = mean_difference(sheet, own);
+    if (!mean || *mean <= kOwnColoursAgree)
+        return;
+    ILLUM_OBS best = own;
+    double least = *mean;
+    for (int i = 0; i < NUM_ILLUM_OBS; ++i) {
+        const auto other = static_cast<ILLUM_OBS>(i);
+        if (const double difference = *mean_difference(sheet, other); difference < least) {
+            best = other;
+            least = difference;
+        }
+    }
+    const std::string fit = fmt::format(
+        "{}{} fits best, {:.2f}", least > kOwnColoursAgree ? "none of the eighteen agrees, " : "",
+        name_of(best), least);
+    warnings.push_back(fmt::format("{}: its own L*a*b* are {:.2f} ΔE*ab in the mean from those of "
+                                   "its spectra under {}; {}",
+                                   sheet.file, *mean, name_of(own), fit));
+}
+
+} // namespace
+
+IlluminantChoice illuminant_for(const std::optional<ILLUM_OBS> &wish,
+                                const std::vector<const Measurement *> &sheets,
+                                std::vector<std::string> &warnings)
+{
+    IlluminantChoice out{D50_2DEG, "default"};
+    if (wish)
+        out = {*wish, "request"};
+    for (const Measurement *sheet : sheets)
+        if (out.by == "default" && sheet->colours.illuminant)
+            out = {*sheet->colours.illuminant, "file"};
+    for (const Measurement *sheet : sheets) {
+        const Colours &colours = sheet->colours;
+        const std::string_view taken = name_of(out.illuminant);
+        if (colours.illuminant && *colours.illuminant != out.illuminant)
+            warnings.push_back(fmt::format("{}: its colours are for {}; {} is taken", sheet->file,
+                                           name_of(*colours.illuminant), taken));
+        else if (!colours.illuminant && !colours.stated.empty())
+            warnings.push_back(fmt::format(
+                "{}: its colours are for {}, which is none of the eighteen; {} is taken",
+                sheet->file, in_quotes(colours.stated), taken));
+        else if (!colours.illuminant && sheet->kind == Kind::colours)
+            warnings.push_back(
+                fmt::format("{}: it does not say for which illuminant its colours are; {} is taken",
+                            sheet->file, taken));
+        check_own_colours(*sheet, out.illuminant, warnings);
+    }
+    return out;
+}
+
+} // namespace vantrel::sheets

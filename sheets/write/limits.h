@@ -1,0 +1,25 @@
+// Limits and how they were held, as a table, JSON and columns.
+#pragma once
+
+#include "judge/limits.h"
+#include "write/flat.h"
+#include "write/json_text.h"
+#include "write/table_text.h"
+
+#include <string>
+#include <vector>
+
+namespace vantrel::sheets {
+
+void add_limits(Lines &lines, const std::string &title, const std::vector<LimitResult> &limits);
+
+// "2 of 7 limits failed, 1 could not be judged"
+std::string counts_of(const std::vector<LimitResult> &limits);
+
+Json limits_json(const std::vector<LimitResult> &limits);
+
+// The limits have to live as long as the columns.
+Flat flat_of(const std::vector<LimitResult> &limits, const std::string &aims,
+             const std::string &description);
+
+} // namespace vantrel::sheets
