@@ -18,7 +18,7 @@ const bundle = (entry, options) =>
     minify: true,
     write: false,
     nodePaths: [modules],
-    target: ['chrome109', 'firefox115', 'safari16'],
+    target: ['chrome111', 'firefox115', 'safari16'],
     ...options,
   });
 

@@ -1,7 +1,7 @@
 // The pictures: SVG by Observable Plot, drawn again when their width changes.
 
 import * as Plot from '@observablehq/plot';
-import { h, named, swatch } from './dom.js';
+import { colourOf, h, named, swatch } from './dom.js';
 
 export const mostPoints = 2000;
 const bands = Array.from({ length: 31 }, (_, i) => 400 + 10 * i);
@@ -42,20 +42,20 @@ export function picture(title, plot, label, ...more) {
 
 export function legend(series) {
   return h('ul', { class: 'legend' }, series.map((one) =>
-    h('li', { class: one.dashed ? 'dashed' : null }, swatch(one.rgb), named(one.name))));
+    h('li', { class: one.dashed ? 'dashed' : null }, swatch(one.colour), named(one.name))));
 }
 
 // A line in its own colour on an edge that sets it off from any ground.
 const edged = (data, options, dashed) => [
   Plot.line(data, { ...options, stroke: 'currentColor', strokeWidth: 4, strokeOpacity: 0.45 }),
-  Plot.line(data, { ...options, stroke: self('rgb'), strokeWidth: 2.5,
+  Plot.line(data, { ...options, stroke: self('colour'), strokeWidth: 2.5,
     strokeDasharray: dashed ? '5 3' : null }),
 ];
 
-// series: [{ name, rgb, refl, dashed }, …]
+// series: [{ name, colour, refl, dashed }, …]
 export function spectraPlot(series) {
   const points = series.flatMap((one, z) => one.refl.map((refl, i) =>
-    ({ z, name: one.name, rgb: one.rgb, dashed: one.dashed, nm: bands[i], refl })));
+    ({ z, name: one.name, colour: one.colour, dashed: one.dashed, nm: bands[i], refl })));
   const top = Math.max(100, ...points.map((point) => point.refl));
   const way = { x: 'nm', y: 'refl', z: 'z' };
   return (width) => ({
@@ -71,10 +71,10 @@ export function spectraPlot(series) {
   });
 }
 
-// curves: [{ name, rgb, weights }, …], signed, the largest 100
+// curves: [{ name, colour, weights }, …], signed, the largest 100
 export function weightsPlot(curves) {
-  const points = curves.flatMap(({ name, rgb, weights }) =>
-    weights.map((weight, i) => ({ name, rgb, weight, nm: bands[i] })));
+  const points = curves.flatMap(({ name, colour, weights }) =>
+    weights.map((weight, i) => ({ name, colour, weight, nm: bands[i] })));
   const way = { x: 'nm', y: 'weight', z: 'name' };
   return (width) => ({
     height: Math.min(380, Math.max(260, width * 0.6)),
@@ -89,10 +89,10 @@ export function weightsPlot(curves) {
   });
 }
 
-// curves: [{ name, rgb, points: [{ nominal, area, gain }, …] }, …]; what: 'area' or 'gain'
+// curves: [{ name, colour, points: [{ nominal, area, gain }, …] }, …]; what: 'area' or 'gain'
 export function tonePlot(curves, what) {
   const points = curves.flatMap((curve, z) =>
-    curve.points.map((point) => ({ ...point, z, name: curve.name, rgb: curve.rgb })));
+    curve.points.map((point) => ({ ...point, z, name: curve.name, colour: curve.colour })));
   const top = what === 'area' ? 100 : 10;
   const way = { x: 'nominal', y: what, z: 'z' };
   return (width) => ({
@@ -105,7 +105,7 @@ export function tonePlot(curves, what) {
       what === 'area'
         ? Plot.line([[0, 0], [100, 100]], { strokeDasharray: '3 3', strokeOpacity: 0.6 }) : null,
       edged(points, way),
-      Plot.dot(points, { ...way, r: 3, fill: self('rgb'), stroke: 'currentColor',
+      Plot.dot(points, { ...way, r: 3, fill: self('colour'), stroke: 'currentColor',
         strokeOpacity: 0.6 }),
       Plot.tip(points, Plot.pointer({ ...way, title: (point) =>
         `${point.name} ${point.nominal} %\nArea ${point.area.toFixed(2)} %, ` +
@@ -114,9 +114,9 @@ export function tonePlot(curves, what) {
   });
 }
 
-// points: [{ name, rgb, lab, reference, chosen }, …], `reference` another L*a*b* or nothing
+// points: [{ name, lab, reference, chosen }, …], `reference` another L*a*b* or nothing
 export function planePlot(points, paper) {
-  const place = (lab, point) => ({ a: lab[1], b: lab[2], name: point.name, rgb: point.rgb, lab });
+  const place = (lab, { name }) => ({ a: lab[1], b: lab[2], name, lab, colour: colourOf({ lab }) });
   const measured = points.map((point) => ({ ...place(point.lab, point), chosen: point.chosen }));
   const aims = points.filter((point) => point.reference).map((point) => ({
     ...place(point.reference, point), to: point.lab }));
@@ -140,7 +140,7 @@ export function planePlot(points, paper) {
         Plot.link(aims, { x1: 'a', y1: 'b', x2: (d) => d.to[1], y2: (d) => d.to[2],
           strokeOpacity: 0.6 }),
         Plot.dot(aims, { x: 'a', y: 'b', r: many ? 3 : 5, strokeWidth: 1.25 }),
-        Plot.dot(measured, { x: 'a', y: 'b', r: many ? 2 : 4, fill: self('rgb'),
+        Plot.dot(measured, { x: 'a', y: 'b', r: many ? 2 : 4, fill: self('colour'),
           stroke: 'currentColor', strokeWidth: 0.75, strokeOpacity: 0.6 }),
         Plot.dot(measured.filter((d) => d.chosen), { x: 'a', y: 'b', r: 8, strokeWidth: 2 }),
         Plot.dot(whites, { x: 'a', y: 'b', r: 6, symbol: 'diamond', strokeWidth: 1.5 }),

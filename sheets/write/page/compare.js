@@ -1,7 +1,7 @@
 // vantrel compare: the verdict, and the pairs that it rests on.
 
 import { histogramPlot, mostPoints, picture, planePlot } from './charts.js';
-import { count, figures, fixed, h, named, smallTable, spread, swatch } from './dom.js';
+import { colourOf, count, figures, fixed, h, named, smallTable, spread, swatch } from './dom.js';
 import { spectraPicture, swatches } from './report.js';
 import { searchTable } from './table.js';
 
@@ -68,13 +68,13 @@ function pairColumns(result) {
 }
 
 const spectraOf = (pair) => [
-  { name: `${pair.name}, reference`, rgb: pair.reference.rgb, refl: pair.reference.refl,
-    dashed: true },
-  { name: `${pair.name}, sample`, rgb: pair.sample.rgb, refl: pair.sample.refl },
+  { name: `${pair.name}, reference`, colour: colourOf(pair.reference),
+    refl: pair.reference.refl, dashed: true },
+  { name: `${pair.name}, sample`, colour: colourOf(pair.sample), refl: pair.sample.refl },
 ];
 
 const bothColours = ({ reference, sample }) =>
-  `linear-gradient(to bottom right, ${reference.rgb} 50%, ${sample.rgb} 50%)`;
+  `linear-gradient(to bottom right, ${colourOf(reference)} 50%, ${colourOf(sample)} 50%)`;
 
 const overview = (result) => h('header', {},
   h('h1', {}, named(result.sample.file), ' against ', named(result.reference.file)),
@@ -100,7 +100,7 @@ export function comparePage(result) {
   const always = new Set(worst);
   const thinned = [...always, ...spread(pairs.filter((pair) => !always.has(pair)), mostPoints)];
   const points = () => [...thinned.filter((pair) => !chosen.has(pair)), ...chosen].map((pair) =>
-    ({ name: pair.name, rgb: pair.sample.rgb, lab: pair.sample.lab, reference: pair.reference.lab,
+    ({ name: pair.name, lab: pair.sample.lab, reference: pair.reference.lab,
       chosen: chosen.has(pair) }));
   const plane = picture('a*b* plane', (width) => planePlot(points(), paper?.sample.lab)(width), () =>
     (thinned.length < pairs.length ? `${count(thinned.length, 'patch')} of ` +
@@ -124,7 +124,7 @@ export function comparePage(result) {
     limitsTable(result.tolerances ?? 'Limits', result.limits),
     limitsTable(`${result.tolerances}, substrate-corrected`, result.corrected?.limits),
     h('div', { class: 'tables' }, smallTable(`The worst ${worst.length} by ${labelOf(formula)}`, [
-      { label: 'Patch', text: (pair) => [swatch(pair.reference.rgb), swatch(pair.sample.rgb),
+      { label: 'Patch', text: (pair) => [swatch(colourOf(pair.reference)), swatch(colourOf(pair.sample)),
         named(pair.name)] },
       ...formulas.map((name) => ({ label: labelOf(name), number: true,
         text: (pair) => fixed(pair[name]) })),
@@ -134,11 +134,11 @@ export function comparePage(result) {
     ], worst)),
     h('div', { class: 'pictures' }, histogram.element, plane.element,
       pairs.some((pair) => pair.sample.refl) ? spectra.element : null,
-      swatches(pairs.map((pair) => ({ name: pair.name, rgb: bothColours(pair) })),
+      swatches(pairs.map((pair) => ({ name: pair.name, colour: bothColours(pair) })),
         'The reference upper left, the sample lower right, as a screen can show them.')),
     searchTable({
       caption: 'All patches', noun: 'patch', columns: pairColumns(result), rows: pairs,
-      rgb: (pair) => pair.sample.rgb, text: (pair) => `${pair.name} ${pair.sample.name} ${pair.verbal}`,
+      colour: (pair) => colourOf(pair.sample), text: (pair) => `${pair.name} ${pair.sample.name} ${pair.verbal}`,
       onChoose(all) {
         chosen = new Set([...all].slice(-4));
         spectra.add([...chosen].filter((pair) => pair !== worst[0]).flatMap(spectraOf));

@@ -16,7 +16,7 @@ export function h(tag, attributes = {}, ...children) {
 // Text of a file, which may run from right to left.
 export const named = (text) => h('bdi', {}, text);
 
-export const swatch = (rgb) => h('span', { class: 'swatch', colour: rgb, 'aria-hidden': 'true' });
+export const swatch = (colour) => h('span', { class: 'swatch', colour, 'aria-hidden': 'true' });
 
 const missing = '–';
 export const fixed = (value, decimals = 2) => (value === null || value === undefined ? missing
@@ -25,6 +25,10 @@ export const triple = (values, decimals = 2) =>
   values.map((value) => fixed(value, decimals)).join('  ');
 export const count = (number, noun) =>
   `${number.toLocaleString('en')} ${noun}${number === 1 ? '' : noun.endsWith('h') ? 'es' : 's'}`;
+
+// The colour that a patch has, whatever its illuminant, for an eye that is used to the white of the
+// screen.
+export const colourOf = ({ lab }) => `lab(${lab.map((value) => fixed(value)).join(' ')})`;
 
 // [[term, text or element, what it means], …] as a row of figures.
 export function figures(entries) {

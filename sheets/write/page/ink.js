@@ -1,7 +1,7 @@
 // vantrel ink: one patch, under every status and illuminant, and beside another one.
 
 import { legend, picture, weightsPlot } from './charts.js';
-import { figures, fixed, h, named, smallTable, swatch, triple } from './dom.js';
+import { colourOf, figures, fixed, h, named, smallTable, swatch, triple } from './dom.js';
 import { spectraPicture } from './report.js';
 
 const number = (label, value, decimals = 2) =>
@@ -34,7 +34,7 @@ function densityTable({ statuses }) {
 }
 
 const colourTable = ({ illuminants, against }) => smallTable('Colours', [
-  { label: 'Illuminant', text: (row) => [swatch(row.rgb), row.illuminant] },
+  { label: 'Illuminant', text: (row) => [swatch(colourOf(row)), row.illuminant] },
   ...['L*', 'a*', 'b*'].map((label, i) => number(label, (row) => row.lab[i])),
   number('C*', (row) => row.lch[1]), number('h', (row) => row.lch[2]),
   ...(!against ? [] : [
@@ -43,8 +43,8 @@ const colourTable = ({ illuminants, against }) => smallTable('Colours', [
 ], illuminants);
 
 function weightsPicture(against) {
-  const curves = [{ name: 'along a*', rgb: '#c8385e', weights: against.a_weights },
-    { name: 'along b*', rgb: '#3f7fd0', weights: against.b_weights }];
+  const curves = [{ name: 'along a*', colour: '#c8385e', weights: against.a_weights },
+    { name: 'along b*', colour: '#3f7fd0', weights: against.b_weights }];
   const peak = ({ name, weights }) => {
     const most = weights.reduce((best, one, i) =>
       (Math.abs(one) > Math.abs(weights[best]) ? i : best), 0);
@@ -57,11 +57,12 @@ function weightsPicture(against) {
 
 export function inkPage(result) {
   const { patch, against } = result;
-  const series = [{ name: patch.name, rgb: patch.rgb, refl: patch.refl },
-    ...(against ? [{ name: against.name, rgb: against.rgb, refl: against.refl, dashed: true }] : [])];
+  const series = [{ name: patch.name, colour: colourOf(patch), refl: patch.refl },
+    ...(against ? [{ name: against.name, colour: colourOf(against), refl: against.refl,
+      dashed: true }] : [])];
   return [
     h('header', {},
-      h('h1', {}, swatch(patch.rgb), named(patch.name)),
+      h('h1', {}, swatch(colourOf(patch)), named(patch.name)),
       h('p', { class: 'about' }, named(result.file), ` · id `, named(patch.id), ' · ',
         Object.entries(patch.device).map(([ink, percent]) => `${ink} ${percent}`).join(' '))),
     keyFigures(result),

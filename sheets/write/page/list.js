@@ -20,7 +20,6 @@ export function listPage({ list, rows }) {
           decimals: rows.some((row) => typeof row[field] === 'number') ? digits(rows, field)
             : undefined })),
       ],
-      rgb: () => null,
       text: (row) => Object.values(row).join(' '),
     }),
   ];

@@ -1,6 +1,6 @@
 // vantrel predict: what two models expect of each combination, beside the measurement.
 
-import { count, fixed, h, named } from './dom.js';
+import { colourOf, count, fixed, h, named } from './dom.js';
 import { searchTable } from './table.js';
 
 const nameOf = (prediction) => prediction.measured?.name ??
@@ -28,7 +28,7 @@ export function predictPage(result) {
           ...(side === 'measured' ? [] : [difference(side)])]),
       ],
       rows: result.predictions,
-      rgb: (row) => (row.measured ?? row.halftone).rgb,
+      colour: (row) => colourOf(row.measured ?? row.halftone),
       text: (row) => `${nameOf(row)} ${row.inks.map((ink) => ink.name).join(' ')}`,
     }),
   ];

@@ -2,7 +2,7 @@
 
 import { histogramPlot, legend, mostPoints, picture, planePlot, spectraPlot, tonePlot }
   from './charts.js';
-import { count, figures, fixed, h, named, smallTable, spread, swatch, triple } from './dom.js';
+import { colourOf, count, figures, fixed, h, named, smallTable, spread, swatch, triple } from './dom.js';
 import { searchTable } from './table.js';
 
 const mostSwatches = 2000;
@@ -39,7 +39,7 @@ function solidName(ink, patch) {
 
 // One curve an ink, from paper to solid.
 const toneCurves = (sheet, solids) => sheet.tone_values.map(({ ink, solid, values }) =>
-  ({ name: solidName(ink, solid), rgb: solids.get(ink)?.rgb ?? 'gray', points: [
+  ({ name: solidName(ink, solid), colour: solids.has(ink) ? colourOf(solids.get(ink)) : 'gray', points: [
     { nominal: 0, area: 0, gain: 0 },
     ...values.map((value) =>
       ({ nominal: value.nominal, area: value.dot_area, gain: value.dot_gain })),
@@ -57,7 +57,7 @@ function keyFigures(sheet, solids) {
       ['to ', named(paper.metamerism.paper), ` under ${paper.metamerism.illuminant}; DIN 6172 ` +
         fixed(paper.metamerism.din6172)]],
     ...[...solids].slice(0, 8).map(([ink, solid]) =>
-      [['Density ', swatch(solid.rgb)], fixed(solid.density, 3),
+      [['Density ', swatch(colourOf(solid))], fixed(solid.density, 3),
         [named(solidName(ink, solid.name)), solid.response ? `, ${solid.response}` : '']]),
     gain && ['Largest gain', fixed(gain.dot_gain), named(gain.name)],
     contrast && ['Largest contrast', fixed(contrast.print_contrast), named(contrast.name)],
@@ -75,10 +75,10 @@ export function swatches(patches, note) {
       thinned + note)),
     cards
       ? h('ul', { class: 'cards' }, shown.map((patch) =>
-        h('li', {}, swatch(patch.rgb), named(patch.name))))
+        h('li', {}, swatch(patch.colour), named(patch.name))))
       : h('div', { class: 'mosaic', role: 'img', 'aria-label':
           `${thinned}Swatches of the patches in the order of the file; the table names them.` },
-      shown.map((patch) => h('span', { class: 'swatch', colour: patch.rgb, title: patch.name }))));
+      shown.map((patch) => h('span', { class: 'swatch', colour: patch.colour, title: patch.name }))));
 }
 
 const spectrumTable = (series) => h('details', {}, h('summary', {}, 'Numbers'),
@@ -130,7 +130,7 @@ function tonePictures(curves) {
 
 function attributeTables(sheet) {
   const having = (field) => sheet.patches.filter((patch) => patch[field] !== null).slice(0, 200);
-  const name = { label: 'Patch', text: (patch) => [swatch(patch.rgb), named(patch.name)] };
+  const name = { label: 'Patch', text: (patch) => [swatch(colourOf(patch)), named(patch.name)] };
   const number = (label, field, decimals = 2) =>
     ({ label, number: true, text: (patch) => fixed(patch[field], decimals) });
   const blocks = [
@@ -191,9 +191,9 @@ function sheetSection(sheet, id, heading) {
     ({ ...patch, chosen: chosen.has(patch) }));
   const farthest = largest(sheet.patches, 'de00_to_paper');
   const series = [
-    ...(paperPatch ? [{ ...paperPatch, dashed: true }] : []),
+    ...(paperPatch ? [{ ...paperPatch, colour: colourOf(paperPatch), dashed: true }] : []),
     ...[...solids].slice(0, 12).map(([ink, solid]) =>
-      ({ ...solid, name: solidName(ink, solid.name) })),
+      ({ ...solid, colour: colourOf(solid), name: solidName(ink, solid.name) })),
   ];
   const spectra = spectraPicture(series, () => 'The paper (broken line)' +
     `${solids.size ? ` and ${count(solids.size, 'solid')}` : ''}; choose patches in the table ` +
@@ -223,15 +223,18 @@ function sheetSection(sheet, id, heading) {
         source.scaled_to_percent ? 'brought to percent' : null,
       ].filter(Boolean).join(' · '))),
     keyFigures(sheet, solids),
-    swatches(sheet.patches, 'In the order of the file, as a screen can show them.'),
-    h('div', { class: 'pictures' }, source.bands ? spectra.element : null, ...(curves.length ? tonePictures(curves) : []),
+    swatches(sheet.patches.map((patch) => ({ name: patch.name, colour: colourOf(patch) })),
+      'In the order of the file, as a screen can show them.'),
+    h('div', { class: 'pictures' }, source.bands ? spectra.element : null,
+      ...(curves.length ? tonePictures(curves) : []),
       plane.element, distances.element, attributeTables(sheet)),
     searchTable({
       caption: 'All patches', noun: 'patch', columns: columnsOf(sheet), rows: sheet.patches,
-      rgb: (patch) => patch.rgb, text: (patch) => `${patch.name} ${patch.id}`,
+      colour: colourOf, text: (patch) => `${patch.name} ${patch.id}`,
       onChoose(all) {
         chosen = new Set([...all].slice(-mostChosen));
-        spectra.add([...chosen].filter((patch) => !always.has(patch)));
+        spectra.add([...chosen].filter((patch) => !always.has(patch))
+          .map((patch) => ({ ...patch, colour: colourOf(patch) })));
         plane.draw();
       },
     }));

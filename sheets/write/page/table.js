@@ -25,9 +25,9 @@ const features = () => tableFeatures({
 });
 
 // columns: [{ label, title, value: (row) => text or number or null, decimals }, …], of which the
-// first names the row; `rgb` and `text` give the row's swatch and what the search looks into. With
+// first names the row; `colour` and `text` give the row's swatch and what the search looks into. With
 // `onChoose` the rows can be chosen.
-export function searchTable({ caption, noun, columns, rows, rgb, text, onChoose }) {
+export function searchTable({ caption, noun, columns, rows, colour, text, onChoose }) {
   const used = columns.filter((column, i) =>
     i === 0 || rows.some((row) => (column.value(row) ?? null) !== null));
   const table = constructTable({
@@ -70,7 +70,7 @@ export function searchTable({ caption, noun, columns, rows, rgb, text, onChoose 
       const value = column.value(row);
       if (i) return h('td', { class: typeof column.decimals === 'number' ? 'number' : null },
         typeof column.decimals === 'number' ? fixed(value, column.decimals) : named(value ?? '–'));
-      const name = [rgb(row) ? swatch(rgb(row)) : null, named(value)];
+      const name = [colour ? swatch(colour(row)) : null, named(value)];
       return h('th', { scope: 'row' }, !onChoose ? name : h('button', { type: 'button',
         class: 'choose', 'aria-pressed': String(chosen.has(row)), onclick: (event) => {
           if (!chosen.delete(row)) chosen.add(row);
