@@ -34,7 +34,8 @@ const limitsTable = (caption, limits) => (limits?.length ? smallTable(caption, [
   { label: 'Limit', number: true, text: (limit) => fixed(limit.limit, digits(limit)) },
   { label: 'Margin', number: true, text: (limit) => fixed(limit.margin, digits(limit)) },
   { label: 'Verdict', text: (limit) => limit.verdict },
-  { label: 'Largest at', text: (limit) => [named(limit.max_patch ?? ''), limit.note ?? ''] },
+  { label: 'Largest at', text: (limit) => [named(limit.max_patch ?? ''),
+    limit.max_patch && limit.note ? '; ' : '', limit.note ?? ''] },
 ], limits) : null);
 
 function unpaired(result) {
@@ -124,8 +125,8 @@ export function comparePage(result) {
     limitsTable(result.tolerances ?? 'Limits', result.limits),
     limitsTable(`${result.tolerances}, substrate-corrected`, result.corrected?.limits),
     h('div', { class: 'tables' }, smallTable(`The worst ${worst.length} by ${labelOf(formula)}`, [
-      { label: 'Patch', text: (pair) => [swatch(colourOf(pair.reference)), swatch(colourOf(pair.sample)),
-        named(pair.name)] },
+      { label: 'Patch', text: (pair) => [swatch(colourOf(pair.reference)),
+        swatch(colourOf(pair.sample)), named(pair.name)] },
       ...formulas.map((name) => ({ label: labelOf(name), number: true,
         text: (pair) => fixed(pair[name]) })),
       { label: 'Difference', text: (pair) => pair.verbal ?? '–' },
@@ -138,7 +139,8 @@ export function comparePage(result) {
         'The reference upper left, the sample lower right, as a screen can show them.')),
     searchTable({
       caption: 'All patches', noun: 'patch', columns: pairColumns(result), rows: pairs,
-      colour: (pair) => colourOf(pair.sample), text: (pair) => `${pair.name} ${pair.sample.name} ${pair.verbal}`,
+      colour: (pair) => colourOf(pair.sample),
+      text: (pair) => `${pair.name} ${pair.sample.name} ${pair.verbal}`,
       onChoose(all) {
         chosen = new Set([...all].slice(-4));
         spectra.add([...chosen].filter((pair) => pair !== worst[0]).flatMap(spectraOf));
