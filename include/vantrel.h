@@ -626,7 +626,8 @@ VANTREL_API void GetAChromaticConstants(double *L1, double *L2, double *C1, doub
 /**
  * Effective dot area of a halftone tint (Yule and Nielsen 1951; with n = 1 Murray and Davies 1936).
  * @param[in]  solidDensity,tintDensity  densities of the solid and of the tint of the same ink
- * @param[in]  nFactor                   n, any number but 0
+ * @param[in]  nFactor                   n, any number but 0; from some 1e8 on places are lost, and
+ *                                       the limit 100 Dt / Ds is nearer
  * @param[out] dotArea                   percent, not clamped; 100 for a solid of density 0
  * @return 1; 0 for a null pointer or an n-factor of 0.
  */

@@ -1,6 +1,13 @@
 #include "judge/densitometer.h"
 
 namespace vantrel::sheets {
+namespace {
+
+// Above it 1 - 10^(-D / n) has lost so many places that the limit of large n, D's own share, is the
+// better value; both are right to eight places there.
+constexpr double kLargestNFactor = 1e8;
+
+} // namespace
 
 std::optional<int> Densitometer::response(const Spectrum &refl) const
 {
@@ -32,11 +39,13 @@ std::optional<double> Densitometer::dot_area(const Spectrum &solid, const Spectr
                                              double n_factor) const
 {
     const auto filter = response(solid);
-    double area = 0;
-    if (!filter || !(density(solid, *filter) > 0) ||
-        !DensityToDotArea(density(solid, *filter), density(tint, *filter), n_factor, &area))
+    if (!filter || !(density(solid, *filter) > 0))
         return std::nullopt;
-    return area;
+    const double Ds = density(solid, *filter), Dt = density(tint, *filter);
+    if (n_factor > kLargestNFactor)
+        return 100 * (Dt / Ds);
+    double area = 0;
+    return DensityToDotArea(Ds, Dt, n_factor, &area) ? std::optional(area) : std::nullopt;
 }
 
 std::optional<double> Densitometer::print_contrast(const Spectrum &solid,

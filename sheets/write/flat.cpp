@@ -11,16 +11,35 @@
 namespace vantrel::sheets {
 namespace {
 
-// What spreadsheets compute: =1+1, +A1, @SUM(A1), -A1. Numbers stay as they are.
-bool is_formula(const std::string &text)
+// Whether a spreadsheet computes a text that begins with this: =1+1, +A1, @SUM(A1), -A1, and the
+// same in the full width of East Asian type.
+bool is_formula(std::string_view text)
 {
-    return !text.empty() && std::string_view("=+-@").find(text[0]) != std::string_view::npos &&
-           !number_in(text);
+    for (const std::string_view sign : {"=", "+", "-", "@", "\uff1d", "\uff0b", "\uff0d", "\uff20"})
+        if (text.starts_with(sign))
+            return true;
+    return false;
+}
+
+// Text with an apostrophe wherever a spreadsheet would begin a formula, be it one that takes
+// semicolons or tabs for the ends of cells. Numbers stay as they are.
+std::string without_formulas(std::string_view text)
+{
+    std::string out;
+    bool begins = true; // a cell
+    for (std::size_t i = 0; i < text.size(); ++i) {
+        if (begins && is_formula(text.substr(i)) && !number_in(text))
+            out += '\'';
+        out += text[i];
+        begins = text[i] == ';' || text[i] == '\t' || text[i] == '\n' || text[i] == '\r' ||
+                 (begins && (text[i] == ' ' || text[i] == '"'));
+    }
+    return out;
 }
 
 std::string csv_text(const std::string &text)
 {
-    std::string safe = is_formula(text) ? '\'' + text : text;
+    std::string safe = without_formulas(text);
     if (safe.find_first_of(",\"\r\n") == std::string::npos)
         return safe;
     std::string out = "\"";
