@@ -92,12 +92,14 @@ class Build:
     PROGRAMS = {"tests/library/CMakeFiles/vantrel_tests.dir/": [
                     ["--gtest_filter=Golden.*", "--gtest_fail_fast"],
                     ["--gtest_filter=-Golden.*", "--gtest_fail_fast"]],
-                "tests/bits/CMakeFiles/bits.dir/": [[ROOT / "tests/bits/digest.txt", os.devnull]]}
+                "tests/bits/CMakeFiles/bits.dir/": [[ROOT / "tests/bits/digest.txt", os.devnull]],
+                "tests/elementary/CMakeFiles/elementary.dir/": [["1000"]]}
 
     def __init__(self, folder, *flags):
         self.folder = folder
         self.flags = flags
-        subprocess.run(["nice", "ninja", "-C", folder, "-j2", "vantrel_tests", "bits"],
+        subprocess.run(["nice", "ninja", "-C", folder, "-j2", "vantrel_tests", "bits",
+                        "elementary"],
                        check=True, stdout=subprocess.DEVNULL)
         listed = json.loads((folder / "compile_commands.json").read_text())
         commands = [shlex.split(entry["command"]) for entry in listed]
@@ -134,7 +136,7 @@ class Build:
                 program = overlay / "program"
                 # The tests have a file of the library in themselves: the first definition counts.
                 if not succeeds(compiler, *self.flags, "-Wl,-z,muldefs", "-o", program, *own,
-                                *library, "-lgtest_main", "-lgtest", "-pthread"):
+                                *library, "-lgtest_main", "-lgtest", "-lmpfr", "-pthread"):
                     return False
                 if not all(succeeds(program, *run, seconds=SECONDS) for run in runs):
                     return False
