@@ -2,7 +2,9 @@
 
 #include <sstream>
 
-const std::vector<Function> kFunctions = {
+// A row of a name alone is the file of the functions after it.
+const std::vector<Function> kRows = {
+    {"src/colorimetry/vantrel.cpp"},
     {"GetNumIlluminantObservers", call(GetNumIlluminantObservers), ""},
     {"ReflToXYZ", call(ReflToXYZ), "31 k >3"},
     {"ReflToXYZs", call(ReflToXYZs), "31 k >31 >31 >31"},
@@ -25,10 +27,15 @@ const std::vector<Function> kFunctions = {
     {"XYZtoRGB", call(XYZtoRGB), "3 >1"},
     {"CalcLabch", call(CalcLabch), "31 k >5"},
     {"VerbalColorDifference", call(VerbalColorDifference), "31 31 k i >11 >11 >11"},
+    {"src/difference/vantrel.cpp"},
     {"LabToDElab", call(LabToDElab), "3 3 >1"},
     {"LabToDH", call(LabToDH), "3 3 >1"},
+    {"LabToDEcmc", call(LabToDEcmc), "3 3 d d >1"},
+    {"src/difference/cie94.cpp"},
     {"LabToDE94", call(LabToDE94), "3 3 d d >1"},
     {"CIELChToDE94", call(CIELChToDE94), "3 3 d d >1"},
+    {"ReflToDIN6172", call(ReflToDIN6172), "31 31 k k >1"},
+    {"src/difference/ciede2000.cpp"},
     {"LabToDE2000", call(LabToDE2000), "3 3 d d >1"},
     {"LabToDE2000Ex", call(LabToDE2000Ex), "3 3 d d d >1"},
     {"CIEDE2000::Calculate",
@@ -42,11 +49,10 @@ const std::vector<Function> kFunctions = {
      call(+[](double radians) { return CIEDE2000().ConvertToDegrees(radians); }), "d"},
     {"CIEDE2000::ConvertToRadians",
      call(+[](double degrees) { return CIEDE2000().ConvertToRadians(degrees); }), "d"},
-    {"LabToDEcmc", call(LabToDEcmc), "3 3 d d >1"},
-    {"ReflToDIN6172", call(ReflToDIN6172), "31 31 k k >1"},
+    {"src/density/dencalc.cpp"},
     {"GetNumStatuses", call(GetNumStatuses), ""},
     {"GetNumResponses", call(GetNumResponses), ""},
-    {"GetNumStatusResponses", call(GetNumStatusResponses), "s"},
+    {"GetNumStatusResponses", call(GetNumStatusResponses), "s=FALSE"},
     {"GetNormalizedDensityWeights", call(GetNormalizedDensityWeights), "s r >31 >1? >1? >1?"},
     {"ReflToDensity", call(ReflToDensity), "31 31? s i >1"},
     {"ReflToReflDensity", call(ReflToReflDensity), "31 s r >1"},
@@ -62,6 +68,7 @@ const std::vector<Function> kFunctions = {
     {"GetHiFiConstants", call(GetHiFiConstants), ">3? >7? >7? >7?"},
     {"SetHexachromeConstants", call(SetHexachromeConstants), "2! 7? 7?"},
     {"GetHexachromeConstants", call(GetHexachromeConstants), ">2? >7? >7?"},
+    {"src/density/specx.cpp"},
     {"CalculateSpectralXDensity", call(CalculateSpectralXDensity), "31 31? i >1? >1?"},
     // densities and bands of the first three peaks
     {"FindMaxDensityPoints",
@@ -99,10 +106,12 @@ const std::vector<Function> kFunctions = {
     {"IsChromaticLCH", call(IsChromaticLCH), "3"},
     {"SetAChromaticConstants", call(SetAChromaticConstants), "1! 1! 1! 1!"},
     {"GetAChromaticConstants", call(GetAChromaticConstants), ">1! >1! >1! >1!"},
-    {"ReflToBrightness", call(ReflToBrightness), "31 >1"},
-    {"Metamerism", call(Metamerism), "31 31 k k >1"},
+    {"src/paper/paper.cpp"},
+    {"ReflToBrightness", call(ReflToBrightness), "31=Refl >1=pBrightness"},
+    {"Metamerism", call(Metamerism), "31=StdRefls 31=SampRefls k k >1=pMetamerism"},
     {"ReflToWhiteE313_98", call(ReflToWhiteE313_98), "31 k >1"},
     {"CIEYxyToWhiteE313_98", call(CIEYxyToWhiteE313_98), "3 k >1"},
+    {"src/inks/inks.cpp"},
     {"Saunderson", call(Saunderson), "d d d"},
     {"UnSaunderson", call(UnSaunderson), "d d d"},
     {"EstimateReflsForThickness", call(EstimateReflsForThickness), "31! d 31! >31!"},
@@ -113,39 +122,43 @@ const std::vector<Function> kFunctions = {
     {"Combine3InkColors", call(Combine3InkColors), "31 31 31 >31"},
     {"CombineInkColorsEx", call(CombineInkColorsEx), "3 3 >3"},
     {"Combine3InkColorsEx", call(Combine3InkColorsEx), "3 3 3 >3"},
-    {"EstimateRefls", call(EstimateRefls), "i 93 3 31 >31"},
-    {"EstimateReflsForBestVisualColor", call(EstimateReflsForBestVisualColor), "i 93 3 31 >31"},
-    {"EstimateReflsEx", call(EstimateReflsEx), "i 31 31? 31? 3 31 >31"},
+    {"EstimateRefls", call(EstimateRefls), "i 93 3=piPercent 31=pdPaperRefls >31=pdEstimatedRefls"},
+    {"EstimateReflsForBestVisualColor", call(EstimateReflsForBestVisualColor),
+     "i 93 3=piPercent 31=pdPaperRefls >31=pdEstimatedRefls"},
+    {"EstimateReflsEx", call(EstimateReflsEx),
+     "i 31 31? 31? 3=piPercent 31=pdPaperRefls >31=pdEstimatedRefls"},
     {"EstimateReflsExForBestVisualColor", call(EstimateReflsExForBestVisualColor),
-     "i 31 31? 31? 3 31 >31"},
+     "i 31 31? 31? 3=piPercent 31=pdPaperRefls >31=pdEstimatedRefls"},
     {"EstimateColor", call(EstimateColor), "i 9 3 3 >3"},
     {"EstimateTintColor", call(EstimateTintColor), "3 i 3 >3"},
     {"CalculateTintColor", call(CalculateTintColor), "31 31 i k >1"},
     {"ReflToABErrorWeights", call(ReflToABErrorWeights), "31 31 k >31? >31?"},
+    {"src/print/dencalc.cpp"},
     {"DensityToDotArea", call(DensityToDotArea), "d d d >1"},
-    {"DensityFromDotArea", call(DensityFromDotArea), "d d d >1"},
+    {"DensityFromDotArea", call(DensityFromDotArea), "d d d >1=-"},
     {"ReflToDotArea", call(ReflToDotArea), "31 31 31? s r d >1"},
     {"ReflToDotGain", call(ReflToDotGain), "31 31 31? s r d i >1"},
-    {"DensityToPrintContrast", call(DensityToPrintContrast), "d d >1"},
-    {"ReflToPrintContrast", call(ReflToPrintContrast), "31 31 31? s r >1"},
-    {"DensityToTrap", call(DensityToTrap), "d d d >1"},
-    {"ReflToTrap", call(ReflToTrap), "31 31 31 31? s r >1"},
+    {"DensityToPrintContrast", call(DensityToPrintContrast), "d d >1=-"},
+    {"ReflToPrintContrast", call(ReflToPrintContrast), "31 31 31? s r=- >1"},
+    {"DensityToTrap", call(DensityToTrap), "d d d >1=-"},
+    {"ReflToTrap", call(ReflToTrap), "31 31 31 31? s r=- >1"},
     {"DensityToHueGray", call(DensityToHueGray), "d d d >1 >1"},
     {"ReflToHueGray", call(ReflToHueGray), "31 31? s >1 >1"},
-    {"DensitytoIntegratedRefl", call(DensitytoIntegratedRefl), "d s r >1"},
+    {"DensitytoIntegratedRefl", call(DensitytoIntegratedRefl), "d s r >1=-"},
     {"ReflToPolIntercept", call(ReflToPolIntercept), "31 d d d >1"},
-    {"DensityRatio", call(DensityRatio), "31! 31! s"},
+    {"DensityRatio", call(DensityRatio), "31! 31! s=-"},
     {"ColorAtEquivalentDensity", call(ColorAtEquivalentDensity), "31! 31! i >31!"},
+    {"src/polarisation/polfcns.cpp"},
     {"PolReflAdjust", call(PolReflAdjust), "31! i 4! >31! 124!"},
     {"PolReflAutoAdjust", call(PolReflAutoAdjust), "31! 4! >31! 124!"},
     {"PolDetermineDensityResponse", call(PolDetermineDensityResponse), "31! 4! s 31? 4! 124!"},
-    {"PolReflToDensity", call(PolReflToDensity), "31! 4! 31? 4! 124! s r >1"},
+    {"PolReflToDensity", call(PolReflToDensity), "31! 4! 31? 4! 124! s r=- >1"},
     {"PolReflToDensities", call(PolReflToDensities), "31 4! 31? 4! 124! s >9"},
     {"PolReflToHueGray", call(PolReflToHueGray), "31 4! 31? 4! 124! s >1 >1"},
-    {"PolReflToDotArea", call(PolReflToDotArea), "31! 4! 31! 4! 31? 4! 124! s r d >1"},
-    {"PolReflToDotGain", call(PolReflToDotGain), "31! 4! 31! 4! 31? 4! 124! s r d i >1"},
-    {"PolReflToPrintContrast", call(PolReflToPrintContrast), "31! 4! 31! 4! 31? 4! 124! s r >1"},
-    {"PolReflToTrap", call(PolReflToTrap), "31! 4! 31! 4! 31! 4! 31? 4! 124! s r >1"},
+    {"PolReflToDotArea", call(PolReflToDotArea), "31! 4! 31! 4! 31? 4! 124! s r=- d >1"},
+    {"PolReflToDotGain", call(PolReflToDotGain), "31! 4! 31! 4! 31? 4! 124! s r=- d i >1"},
+    {"PolReflToPrintContrast", call(PolReflToPrintContrast), "31! 4! 31! 4! 31? 4! 124! s r=- >1"},
+    {"PolReflToTrap", call(PolReflToTrap), "31! 4! 31! 4! 31! 4! 31? 4! 124! s r=- >1"},
 };
 
 Function::Function(const char *name_, std::function<double(std::vector<Slot> &)> call_,
@@ -155,6 +168,10 @@ Function::Function(const char *name_, std::function<double(std::vector<Slot> &)>
     std::istringstream tokens(signature);
     for (std::string token; tokens >> token;) {
         Argument &argument = arguments.emplace_back();
+        if (const std::size_t at = token.find('='); at != std::string::npos) {
+            argument.reported = token.substr(at + 1);
+            token.resize(at);
+        }
         argument.output = token.front() == '>';
         argument.nullable = token.back() == '?';
         argument.unchecked = token.back() == '!';
@@ -176,10 +193,23 @@ std::vector<Slot> Function::slots() const
     return slots;
 }
 
-const std::vector<Function> &functions() { return kFunctions; }
+const std::vector<Function> &functions()
+{
+    static const std::vector<Function> all = [] {
+        std::vector<Function> found;
+        for (std::string file; const Function &row : kRows) {
+            if (!row.call)
+                file = row.name;
+            else
+                found.emplace_back(row).file = file;
+        }
+        return found;
+    }();
+    return all;
+}
 
 const Function *find_function(const std::string &name)
 {
-    const auto it = std::ranges::find(kFunctions, name, &Function::name);
-    return it != kFunctions.end() ? &*it : nullptr;
+    const auto it = std::ranges::find(functions(), name, &Function::name);
+    return it != functions().end() ? &*it : nullptr;
 }

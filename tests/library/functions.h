@@ -23,7 +23,7 @@ struct Slot {
     bool null = false;
     bool written = false;
     bool overrun = false;
-    const Slot *in_place = nullptr; ///< the input in whose array an output goes, if it is as large
+    const Slot *in_place = nullptr; ///< the input of its type in whose array an output goes
     std::vector<std::byte> memory;
 
     static constexpr std::size_t kGuard = 64;
@@ -37,18 +37,20 @@ struct Argument {
     bool output = false;
     bool nullable = false;
     bool unchecked = false;
+    std::string reported = "0"; ///< the invariant that the checking build names; "-" for nothing
 };
 
 struct Function {
     std::string name;
     std::function<double(std::vector<Slot> &)> call;
     std::vector<Argument> arguments;
+    std::string file; ///< where the library defines it
 
     /// The signature gives the arguments as tokens in declared order: `N` input array, `>N` output
     /// array, `k` illuminant/observer, `s` status, `r` response, `d` double, `i` int; suffix `?`:
-    /// null is allowed, `!`: the caller's duty.
-    Function(const char *name, std::function<double(std::vector<Slot> &)> call,
-             const char *signature);
+    /// null is allowed, `!`: the caller's duty, `=EXPRESSION`: what is reported of it.
+    Function(const char *name, std::function<double(std::vector<Slot> &)> call = nullptr,
+             const char *signature = "");
 
     /// Slots of the right sizes, inputs all zero.
     std::vector<Slot> slots() const;
@@ -124,7 +126,8 @@ template <class P> struct Parameter {
     static Element *array(const Slot &slot)
     {
         const bool shared =
-            slot.in_place && slot.in_place->memory.size() == slot.values.size() * sizeof(Element);
+            slot.in_place && slot.in_place->values.size() >= slot.values.size() &&
+            slot.in_place->memory.size() == slot.in_place->values.size() * sizeof(Element);
         const std::byte *begin = shared        ? slot.in_place->memory.data()
                                  : slot.output ? slot.memory.data() + Slot::kGuard
                                                : slot.memory.data();

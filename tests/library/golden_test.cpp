@@ -42,6 +42,25 @@ void check_output(const Slot &slot, const std::string &expected, std::optional<d
     }
 }
 
+/// What a call says on standard error.
+std::string said(const Function &function, std::vector<Slot> &slots, double &result)
+{
+    testing::internal::CaptureStderr();
+    result = function.call(slots);
+    return testing::internal::GetCapturedStderr();
+}
+
+/// What the checking build says of a refused call, in one line.
+std::string report(const Function &function, const std::string &violated)
+{
+#ifdef VANTREL_CHECKED
+    if (!violated.empty() && violated != "-")
+        return "vantrel: " + function.name + " (" + function.file + "): violated: " + violated +
+               "\n";
+#endif
+    return "";
+}
+
 bool no_output_touched(const std::vector<Slot> &slots)
 {
     return std::none_of(slots.begin(), slots.end(),
@@ -59,7 +78,9 @@ TEST(Golden, EveryLine)
 {
     for (GoldenCase &golden : read_all_golden()) {
         SCOPED_TRACE(golden.where + " " + golden.function->name);
-        const double result = golden.function->call(golden.slots);
+        double result = 0;
+        EXPECT_EQ(said(*golden.function, golden.slots, result),
+                  report(*golden.function, golden.reported));
         EXPECT_PRED3(agrees, result, golden.returns, golden.tolerance) << "returned";
         std::size_t next = 0;
         for (const Slot &slot : golden.slots)
@@ -112,8 +133,26 @@ TEST(Boundary, RefusesNullsAndBadIndicesAndWritesNothing)
         for (std::size_t i = 0; i < good.slots.size(); ++i)
             for (auto &slots : spoilt_calls(good, i)) {
                 SCOPED_TRACE(good.function->name + " argument " + std::to_string(i));
-                EXPECT_EQ(good.function->call(slots), 0);
+                double result = 1;
+                EXPECT_EQ(said(*good.function, slots, result),
+                          report(*good.function, good.function->arguments[i].reported));
+                EXPECT_EQ(result, 0);
                 EXPECT_TRUE(no_output_touched(slots));
+            }
+}
+
+TEST(Boundary, AnOutputMayTakeTheArrayOfAnInput)
+{
+    const auto same = [](double a, double b) { return a == b || (std::isnan(a) && std::isnan(b)); };
+    for (const GoldenCase &golden : read_all_golden())
+        for (std::size_t out = 0; out < golden.slots.size(); ++out)
+            for (std::size_t in = 0; golden.slots[out].output && in < golden.slots.size(); ++in) {
+                SCOPED_TRACE(golden.where + " output " + std::to_string(out));
+                auto separate = golden.slots, shared = golden.slots;
+                shared[out].in_place = golden.slots[in].output ? nullptr : &shared[in];
+                EXPECT_EQ(golden.function->call(shared), golden.function->call(separate));
+                if (separate[out].written)
+                    EXPECT_TRUE(std::ranges::equal(shared[out].values, separate[out].values, same));
             }
 }
 
