@@ -287,10 +287,12 @@ template <class V> V sin_of_parts(const Angle<V> &angle, std::uint64_t quarters)
     const V r = angle.high, rest = angle.low;
     const V z = r * r;
     const V cube = z * r;
-    const V sine = r - ((z * (0.5 * rest - cube * polynomial(z, kS)) - rest) - cube * kS1);
+    const V z_error = product_error(r, r, z);
+    const V sine = r - ((z * (0.5 * rest - cube * polynomial(z, kS)) - (rest + z_error * r * kS1)) -
+                        cube * kS1);
     const V half = 0.5 * z;
     const V most = 1 - half;
-    const V dropped = r * rest + 0.5 * product_error(r, r, z);
+    const V dropped = r * rest + 0.5 * z_error;
     const V cosine = most + (((1 - most) - half) + (z * z * polynomial(z, kC) - dropped));
     const auto quadrant = angle.quadrant + quarters;
     const auto odd = -(quadrant & 1);

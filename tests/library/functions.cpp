@@ -210,6 +210,8 @@ const std::vector<Function> &functions()
 
 const Function *find_function(const std::string &name)
 {
-    const auto it = std::ranges::find(functions(), name, &Function::name);
-    return it != functions().end() ? &*it : nullptr;
+    const auto &all = functions(); // libc++ 14 has no std::ranges::find
+    const auto it =
+        std::find_if(all.begin(), all.end(), [&](const Function &f) { return f.name == name; });
+    return it != all.end() ? &*it : nullptr;
 }
