@@ -227,8 +227,8 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
                                         samples.patch(in_sample), terms));
         work.done(out.pairs.size());
     }
-    const std::vector<ControlPatch> controls =
-        control_patches(out.pairs, references.paper, samples.paper, request.status);
+    const std::vector<ControlPatch> controls = control_patches(
+        out.pairs, references.paper, samples.paper, request.status, reference.collection);
     out.statistics = all_statistics(out.pairs, &PairReport::delta_e);
     out.limits = judge_limits(request.tolerances, controls);
     out.verdict = verdict_of(request, out.statistics[0].max, out.limits);

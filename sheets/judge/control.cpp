@@ -2,6 +2,7 @@
 
 #include "judge/densitometer.h"
 
+#include <algorithm>
 #include <map>
 
 namespace vantrel::sheets {
@@ -17,7 +18,7 @@ bool is_tint(const ControlPatch &patch)
     return patch.inks.size() == 1 && patch.inks[0].second < 100;
 }
 
-ControlPatch control_patch(const PairReport &pair)
+ControlPatch control_patch(const PairReport &pair, const Paper &reference_paper, bool collection)
 {
     ControlPatch out;
     out.name = pair.reference.name;
@@ -32,7 +33,10 @@ ControlPatch control_patch(const PairReport &pair)
             if (percent != 0)
                 out.inks.emplace_back(field, percent);
         }
-    out.paper = known && out.inks.empty();
+    out.paper = known ? out.inks.empty() : pair.reference.name == reference_paper.name;
+    out.spot = collection || std::any_of(out.inks.begin(), out.inks.end(), [](const auto &ink) {
+                   return !ink.first.starts_with("CMYK_");
+               });
     return out;
 }
 
@@ -50,12 +54,12 @@ std::optional<double> gain_of(const Side &solid, const Side &tint, double nomina
 
 std::vector<ControlPatch> control_patches(const std::vector<PairReport> &pairs,
                                           const Paper &reference_paper, const Paper &sample_paper,
-                                          int status)
+                                          int status, bool collection)
 {
     std::vector<ControlPatch> out;
     std::map<std::string, const PairReport *> solids; // the first of each ink
     for (const PairReport &pair : pairs) {
-        out.push_back(control_patch(pair));
+        out.push_back(control_patch(pair, reference_paper, collection));
         if (is_solid(out.back()))
             solids.try_emplace(out.back().inks[0].first, &pair);
     }

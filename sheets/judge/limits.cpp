@@ -13,8 +13,6 @@ namespace {
 
 constexpr double kNeutralChroma = 10; // C*ab of an aim that passes for neutral
 
-bool is_process_ink(std::string_view field) { return field.starts_with("CMYK_"); }
-
 bool is_neutral(const ControlPatch &patch)
 {
     if (patch.inks.size() != 3 || !(std::hypot(patch.aim.a, patch.aim.b) <= kNeutralChroma))
@@ -47,8 +45,7 @@ bool is_in(Group group, const ControlPatch &patch)
     case Group::neutrals:
         return is_neutral(patch);
     case Group::spots:
-        return std::any_of(inks.begin(), inks.end(),
-                           [](const auto &ink) { return !is_process_ink(ink.first); });
+        return patch.spot;
     }
     return false;
 }

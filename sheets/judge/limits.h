@@ -14,6 +14,7 @@ namespace vantrel::sheets {
 struct ControlPatch {
     std::string name;
     bool paper = false; // bare
+    bool spot = false;  // of an ink other than cyan, magenta, yellow and black
     // Its inks above 0 %, by device field; empty where they are not known.
     std::vector<std::pair<std::string, double>> inks;
     CIELABCOORD aim{}, lab{};

@@ -54,18 +54,38 @@ void check_own_colours(const Measurement &sheet, ILLUM_OBS illuminant,
                                    sheet.file, *mean, name_of(own), fit));
 }
 
+// Spectra give colours under any illuminant: what a file of colours alone states comes first.
+IlluminantChoice choice(const std::optional<ILLUM_OBS> &wish,
+                        const std::vector<const Measurement *> &sheets)
+{
+    if (wish)
+        return {*wish, "request"};
+    const Measurement *first = nullptr;
+    for (const Measurement *sheet : sheets) {
+        if (!sheet->colours.illuminant)
+            continue;
+        const bool fixed = sheet->kind == Kind::colours;
+        if (!first || (fixed && first->kind != Kind::colours))
+            first = sheet;
+        else if (fixed && *sheet->colours.illuminant != *first->colours.illuminant)
+            throw RequestError{
+                fmt::format("{} holds colours for {}, {} for {}, both without spectra; with "
+                            "--illuminant they are compared as they stand",
+                            first->file, name_of(*first->colours.illuminant), sheet->file,
+                            name_of(*sheet->colours.illuminant))};
+    }
+    if (first)
+        return {*first->colours.illuminant, "file"};
+    return {D50_2DEG, "default"};
+}
+
 } // namespace
 
 IlluminantChoice illuminant_for(const std::optional<ILLUM_OBS> &wish,
                                 const std::vector<const Measurement *> &sheets,
                                 std::vector<std::string> &warnings)
 {
-    IlluminantChoice out{D50_2DEG, "default"};
-    if (wish)
-        out = {*wish, "request"};
-    for (const Measurement *sheet : sheets)
-        if (out.by == "default" && sheet->colours.illuminant)
-            out = {*sheet->colours.illuminant, "file"};
+    const IlluminantChoice out = choice(wish, sheets);
     for (const Measurement *sheet : sheets) {
         const Colours &colours = sheet->colours;
         const std::string_view taken = name_of(out.illuminant);

@@ -16,9 +16,11 @@ struct IlluminantChoice {
     operator ILLUM_OBS() const { return illuminant; }
 };
 
-// The one asked for, or else what the first of the files states that states any, or else D50, 2
-// degrees. Warns where a file states another one, one that the library does not have, or, holding
-// colours alone, none, and where the L*a*b* that a file holds beside its spectra are not theirs.
+// The one asked for, or else what the first of the files states that states any, files of colours
+// alone before others, or else D50, 2 degrees. Throws RequestError where two files of colours alone
+// state different ones. Warns where a file states another one, one that the library does not have,
+// or, holding colours alone, none, and where the L*a*b* that a file holds beside its spectra are
+// not theirs.
 IlluminantChoice illuminant_for(const std::optional<ILLUM_OBS> &wish,
                                 const std::vector<const Measurement *> &sheets,
                                 std::vector<std::string> &warnings);

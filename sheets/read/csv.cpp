@@ -257,10 +257,14 @@ void read_csv(std::string_view text, Sheet &sheet)
     Columns columns;
     if (read_rows(text, sheet, true) || read_rows(text, sheet, false))
         return;
-    if (!columns.find(text))
+    if (!columns.find(text)) {
+        const std::string_view start = trimmed(text);
         throw InputError{0,
-                         "no measurement file: it names no fields of CGATS text "
-                         "(BEGIN_DATA_FORMAT), is no XML, and has no CSV header with wavelengths"};
+                         fmt::format("no measurement file: it names no fields of CGATS text "
+                                     "(BEGIN_DATA_FORMAT), is no XML, and has no CSV header with "
+                                     "wavelengths, L*a*b* or XYZ; it begins with {}",
+                                     in_quotes(start.substr(0, start.find_first_of("\r\n"))))};
+    }
     columns.read(sheet);
 }
 

@@ -40,7 +40,9 @@ private:
     std::vector<double> wavelengths(const Node &spectrum, const Settings &settings,
                                     std::size_t count);
     void read_spectrum(const Node &spectrum, const Settings &settings, Patch &patch);
-    CIELABCOORD read_colour(const Node &colour);
+    std::array<double, 3> coordinates(const Node &colour, const std::array<const char *, 3> &names);
+    bool is_of_other_illuminant(const Settings &settings);
+    std::optional<CIELABCOORD> read_colour(const Node &colour);
     std::vector<Node> objects(const Node &collection) const;
 
     const Settings &settings_of(const Node &values)
@@ -65,6 +67,9 @@ private:
     bool step_missing = false;
     std::size_t without = 0;  // objects with no spectrum
     std::size_t repeated = 0; // spectra of an object under a condition that it has already
+    std::optional<std::pair<std::string_view, std::string_view>>
+        first_stated;                   // illuminant, observer
+    std::size_t of_others = 0;          // colours for others than these
     std::vector<std::size_t> line_ends; // once a line is asked for
 };
 
@@ -170,20 +175,51 @@ void Reader::read_spectrum(const Node &spectrum, const Settings &settings, Patch
                      .of(values);
 }
 
-CIELABCOORD Reader::read_colour(const Node &colour)
+std::array<double, 3> Reader::coordinates(const Node &colour,
+                                          const std::array<const char *, 3> &names)
 {
-    const Settings &settings = settings_of(colour);
-    sheet.header.take("ILLUMINANT", settings.illuminant);
-    sheet.header.take("OBSERVER", settings.observer);
     std::array<double, 3> out{};
     for (std::size_t i = 0; i < 3; ++i) {
-        const Node node =
-            child(colour, (sheet.xyz ? std::array{"X", "Y", "Z"} : std::array{"L", "A", "B"})[i]);
+        const Node node = child(colour, names[i]);
         out[i] = number(node ? node : colour, node.child_value());
         if (std::abs(out[i]) > kLargestColour)
             throw InputError{line_of(colour), "a colour is too large"};
     }
-    return {out[0], out[1], out[2]};
+    return out;
+}
+
+// Colours of a second illuminant or observer are counted and left out.
+bool Reader::is_of_other_illuminant(const Settings &settings)
+{
+    if (settings.illuminant.empty() && settings.observer.empty())
+        return false;
+    const std::pair stated{settings.illuminant, settings.observer};
+    if (!first_stated) {
+        first_stated = stated;
+        sheet.header.take("ILLUMINANT", settings.illuminant);
+        sheet.header.take("OBSERVER", settings.observer);
+    }
+    if (*first_stated == stated)
+        return false;
+    ++of_others;
+    return true;
+}
+
+// L*a*b*, or X, Y and Z under the illuminant that the file states, or else D50 and 2 degrees.
+std::optional<CIELABCOORD> Reader::read_colour(const Node &colour)
+{
+    const bool xyz = is(colour, "ColorCIEXYZ");
+    if ((!xyz && !is(colour, "ColorCIELab")) || is_of_other_illuminant(settings_of(colour)))
+        return std::nullopt;
+    std::array<double, 3> out =
+        xyz ? coordinates(colour, {"X", "Y", "Z"}) : coordinates(colour, {"L", "A", "B"});
+    if (xyz) {
+        const std::array<double, 3> values = out;
+        XYZToCIELab(values.data(), sheet.header.colours().illuminant.value_or(D50_2DEG),
+                    out.data());
+    } else
+        sheet.colour_space = "L*a*b*";
+    return CIELABCOORD{out[0], out[1], out[2]};
 }
 
 void Reader::read_target(const Node &object)
@@ -237,8 +273,12 @@ void Reader::read_object(const Node &object)
     };
     std::vector<Own> own;
     for (const Node &node : values.children())
-        if (is(node, sheet.xyz ? "ColorCIEXYZ" : "ColorCIELab"))
-            own.push_back({read_colour(node), settings_of(node).condition});
+        if (const auto lab = read_colour(node)) {
+            const Condition condition = settings_of(node).condition;
+            if (std::none_of(own.begin(), own.end(),
+                             [&](const Own &other) { return other.condition == condition; }))
+                own.push_back({*lab, condition});
+        }
     const auto own_under = [&](Condition condition) -> std::optional<CIELABCOORD> {
         for (const Own &colour : own)
             if (colour.condition == condition || !colour.condition)
@@ -352,6 +392,10 @@ void Reader::read()
         sheet.warn(0, fmt::format("target objects without a measurement: {}", unused));
     sheet.collection = std::all_of(sheet.patches.begin(), sheet.patches.end(),
                                    [](const Patch &patch) { return patch.device.empty(); });
+    if (of_others > 0)
+        sheet.warn(0,
+                   fmt::format("colours for another illuminant or observer than {}, left out: {}",
+                               in_quotes(sheet.header.colours().stated), of_others));
     if (repeated > 0)
         sheet.warn(
             0, fmt::format("further spectra of an object under the same condition, left out: {}",
@@ -363,8 +407,7 @@ void Reader::read()
 void read_cxf(std::string_view text, Sheet &sheet)
 {
     sheet.fractions = true;
-    sheet.xyz = text.find("ColorCIELab") == std::string_view::npos &&
-                text.find("ColorCIEXYZ") != std::string_view::npos;
+    sheet.colour_space = "XYZ"; // until there is any L*a*b*
     Reader(text, sheet).read();
 }
 

@@ -59,6 +59,15 @@ std::optional<int> observer_in(std::string_view text)
     return std::nullopt;
 }
 
+// The first word that names one of the library's illuminants.
+std::optional<ILLUM_OBS> illuminant_in(std::string_view text, int degrees)
+{
+    std::optional<ILLUM_OBS> out;
+    while (!out && !text.empty())
+        out = illuminant_named(fmt::format("{}_{}DEG", next_word(text), degrees));
+    return out;
+}
+
 } // namespace
 
 Condition condition_in(std::string_view text)
@@ -111,17 +120,27 @@ void Header::take(std::string_view keyword, std::string_view value)
 
     const std::string words = upper(value);
     if (key == "WEIGHTINGFUNCTION" && words.starts_with("ILLUMINANT"))
-        keep(illuminant, value.substr(std::min(value.find_first_not_of(" ,", 10), value.size())));
+        keep_illuminant(value.substr(std::min(value.find_first_not_of(" ,", 10), value.size())));
     else if (key == "WEIGHTINGFUNCTION" && words.starts_with("OBSERVER"))
         keep(observer, value.substr(std::min(value.find_first_not_of(" ,", 8), value.size())));
-    else if (key == "ILLUMINATIONNAME" || key == "ILLUMINANT")
-        keep(illuminant, value);
+    else if (key == "ILLUMINATIONNAME" || key == "ILLUMINANT" ||
+             (key == "WEIGHTINGFUNCTION" && illuminant_in(value, 2)))
+        keep_illuminant(value);
     else if (key == "OBSERVERANGLE" || key == "OBSERVER")
         keep(observer, value);
     else if (key == "MEASUREMENTSOURCE") {
-        keep(illuminant, behind(words, "ILLUMINATION="));
+        keep_illuminant(behind(words, "ILLUMINATION="));
         keep(observer, behind(words, "OBSERVERANGLE="));
     }
+}
+
+void Header::keep_illuminant(std::string_view value)
+{
+    const std::string stated = printable(trimmed(value));
+    if (illuminant.empty())
+        illuminant = stated;
+    else if (illuminant_in(stated, 2) && illuminant_in(stated, 2) != illuminant_in(illuminant, 2))
+        other_illuminant = stated;
 }
 
 bool Header::transmission() const { return contains(quantity, "TRANSMI"); }
@@ -136,11 +155,13 @@ bool Header::light() const
 Colours Header::colours() const
 {
     Colours out;
-    out.stated = illuminant + (illuminant.empty() || observer.empty() ? "" : ", ") + observer;
-    const auto degrees = observer.empty() ? 2 : observer_in(observer);
-    std::string_view text = illuminant;
-    while (degrees && !out.illuminant && !text.empty())
-        out.illuminant = illuminant_named(fmt::format("{}_{}DEG", next_word(text), *degrees));
+    out.stated = illuminant.empty() && !observer.empty()
+                     ? "observer " + observer
+                     : illuminant + (observer.empty() ? "" : ", ") + observer;
+    const auto degrees =
+        observer.empty() ? observer_in(illuminant).value_or(2) : observer_in(observer);
+    if (degrees)
+        out.illuminant = illuminant_in(illuminant, *degrees);
     return out;
 }
 

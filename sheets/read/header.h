@@ -19,6 +19,7 @@ struct Header {
     Origin origin;
     std::string quantity; // what was measured: "REFLECTIVE", "TRANSMITTANCE", "EMISSION"
     std::string illuminant, observer; // of the file's own colours
+    std::string other_illuminant;     // that the file states too
     Condition condition;              // the one that was named last
 
     // The first to say something is believed, but for the condition.
@@ -30,6 +31,9 @@ struct Header {
 
     // Without an observer it is that of 2 degrees (ISO 13655).
     Colours colours() const;
+
+private:
+    void keep_illuminant(std::string_view value);
 };
 
 } // namespace vantrel::sheets

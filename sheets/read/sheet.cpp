@@ -1,5 +1,7 @@
 #include "read/sheet.h"
 
+#include "read/text.h"
+
 #include <fmt/format.h>
 
 #include <algorithm>
@@ -220,12 +222,14 @@ Measurement Sheet::measurement()
         throw InputError{0, "neither spectra nor L*a*b* nor XYZ in this file"};
     if (kind == Kind::colours && !reading.colours)
         throw InputError{0, fmt::format("{} {} of {}, no spectra", patches.size(),
-                                        patches.size() == 1 ? "patch" : "patches",
-                                        xyz ? "XYZ" : "L*a*b*")};
+                                        patches.size() == 1 ? "patch" : "patches", colour_space)};
     choose_condition();
     if (kind != Kind::colours)
         bring_to_percent();
     const Colours colours = header.colours();
+    if (!header.other_illuminant.empty())
+        warn(0, fmt::format("the illuminant is said to be {}, and {} elsewhere: the first is taken",
+                            in_quotes(header.illuminant), in_quotes(header.other_illuminant)));
     if (xyz)
         bring_to_lab(colours);
     check_inks();

@@ -41,6 +41,7 @@ public:
     Kind kind = Kind::reflectance;
     bool collection = false;
     bool xyz = false; // the lab of the patches holds X, Y, Z
+    std::string_view colour_space = "L*a*b*";
     std::vector<Patch> patches;
     bool named = false; // any of them, by a name or an id of its own
 

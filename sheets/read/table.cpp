@@ -226,6 +226,8 @@ void Table::find_colours(const std::vector<std::string> &keys)
     const Colour colour = colour_in(keys);
     lab = colour.columns;
     sheet.xyz = colour.found() && colour.xyz;
+    if (sheet.xyz)
+        sheet.colour_space = "XYZ";
     if (!colour.illuminant.empty()) {
         const std::size_t degrees = colour.illuminant.ends_with('2') ? 1 : 2;
         const auto end = colour.illuminant.size() - degrees;

@@ -217,8 +217,7 @@ void write_table(const Comparison &comparison, const Sink &sink, const TableStyl
 void write_json(const Comparison &comparison, const Sink &sink)
 {
     Json names = Json::array(), labels = Json::object(), weights = Json::object();
-    for (std::size_t i = 0; i < comparison.metrics.size(); ++i) {
-        const Metric &metric = comparison.metrics[i];
+    for (const Metric &metric : comparison.metrics) {
         const std::string name(names_of(metric.formula).key);
         names.push_back(name);
         labels[name] = title_of(metric);
