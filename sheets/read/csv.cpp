@@ -211,10 +211,8 @@ void Columns::read(Sheet &sheet)
     if (!next_record(rest, separator, at, row))
         throw InputError{line, "a quoted text is not closed"};
     std::vector<Patch> patches(row.values.size() - 1);
-    for (std::size_t i = 0; i < patches.size(); ++i) {
+    for (std::size_t i = 0; i < patches.size(); ++i)
         patches[i].name = printable(row.values[i + 1]);
-        sheet.named = sheet.named || !patches[i].name.empty();
-    }
     std::vector<double> wavelengths;
     std::vector<std::vector<double>> values(patches.size());
     rest = rows;
@@ -243,9 +241,6 @@ void Columns::read(Sheet &sheet)
     const Bands &bands = sheet.bands_at(wavelengths, line);
     for (std::size_t i = 0; i < patches.size(); ++i) {
         patches[i].refl = bands.of(values[i]);
-        patches[i].id = std::to_string(i + 1);
-        if (patches[i].name.empty())
-            patches[i].name = patches[i].id;
         sheet.add(std::move(patches[i]), sheet.header.condition, line);
     }
 }

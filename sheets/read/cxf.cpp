@@ -17,8 +17,6 @@ namespace {
 using Devices = std::vector<std::pair<std::string, double>>;
 
 constexpr std::ptrdiff_t kMostSigns = 32'000'000; // bounds the memory that the parsed text takes
-constexpr std::size_t kLongestInkName = 80;
-constexpr double kLargestColour = 1e6; // as of reflectances in percent
 
 class Reader {
 public:
@@ -115,7 +113,7 @@ Devices Reader::device_values(const Node &object)
                 const std::string_view called =
                     spot ? std::string_view(spot.child_value()) : attribute(part, "Name");
                 inks.emplace_back(
-                    cut(printable(trimmed(called)), kLongestInkName),
+                    ink_name(trimmed(called)),
                     number(part, percent ? percent.child_value() : attribute(part, "Percentage")));
             } else if (is(colour, "ColorRGB") && (name == "R" || name == "G" || name == "B")) {
                 rgb.emplace_back(fmt::format("RGB_{}", name), number(part, part.child_value()));
@@ -126,8 +124,7 @@ Devices Reader::device_values(const Node &object)
     }
     if (rgb.empty())
         if (const auto tint = tints.find(attribute(object, "Id")); tint != tints.end())
-            return {{cut(printable(tint->second.ink), kLongestInkName),
-                     number(tint->second.node, tint->second.percent)}};
+            return {{ink_name(tint->second.ink), number(tint->second.node, tint->second.percent)}};
     return rgb;
 }
 
@@ -182,7 +179,7 @@ std::array<double, 3> Reader::coordinates(const Node &colour,
     for (std::size_t i = 0; i < 3; ++i) {
         const Node node = child(colour, names[i]);
         out[i] = number(node ? node : colour, node.child_value());
-        if (std::abs(out[i]) > kLargestColour)
+        if (std::abs(out[i]) > kLargest)
             throw InputError{line_of(colour), "a colour is too large"};
     }
     return out;
@@ -245,17 +242,11 @@ void Reader::name(Patch &patch, const Node &object)
         patch.device = target->second.device;
     const std::string_view type = attribute(object, "ObjectType");
     if (!place.empty() && !type.empty() && attribute(object, "Name").starts_with(type)) {
-        std::string named = sample_name_of(object);
-        if (named.empty() && target != targets.end())
-            named = target->second.name;
         patch.id = printable(place);
-        patch.name = named.empty() ? patch.id : named;
+        patch.name = sample_name_of(object);
+        if (patch.name.empty() && target != targets.end())
+            patch.name = target->second.name;
     }
-    sheet.named = sheet.named || !patch.id.empty() || !patch.name.empty();
-    if (patch.id.empty())
-        patch.id = std::to_string(sheet.patches.size() + 1);
-    if (patch.name.empty())
-        patch.name = patch.id;
 }
 
 void Reader::read_object(const Node &object)

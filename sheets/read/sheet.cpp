@@ -14,9 +14,9 @@ namespace vantrel::sheets {
 namespace {
 
 constexpr std::size_t kMostWarnings = 20;
-constexpr double kFaintest = 5;         // no sheet is darker throughout
-constexpr double kLightest = 105;       // L*
-constexpr double kLargestPercent = 1e6; // beyond it colours overflow, and no instrument measures it
+constexpr double kFaintest = 5;   // no sheet is darker throughout
+constexpr double kLightest = 105; // L*
+constexpr std::size_t kLongestInkName = 80;
 
 std::string name_of(const Condition &condition)
 {
@@ -40,6 +40,8 @@ double largest_in(const std::vector<Patch> &patches)
 }
 
 } // namespace
+
+std::string ink_name(std::string_view written) { return cut(printable(written), kLongestInkName); }
 
 const Bands &Sheet::bands_at(const std::vector<double> &wavelengths, std::size_t line)
 {
@@ -122,6 +124,21 @@ void Sheet::choose_condition()
         origin.condition = name_of(chosen);
 }
 
+// The place stands for an id that is missing, and the id for a name. Whether any patch has either.
+bool Sheet::name_patches()
+{
+    bool named = false;
+    for (std::size_t i = 0; i < patches.size(); ++i) {
+        auto &[id, name, refl, device, lab, line] = patches[i];
+        named = named || !id.empty() || !name.empty();
+        if (id.empty())
+            id = std::to_string(i + 1);
+        if (name.empty())
+            name = id;
+    }
+    return named;
+}
+
 // Paper with optical brightener reads up to 1.4.
 double Sheet::largest_fraction() const { return fractions ? 3 : 2; }
 
@@ -150,7 +167,7 @@ void Sheet::bring_to_percent()
         for (double &value : patch.refl) {
             if (origin.scaled)
                 value *= factor;
-            if (!(std::abs(value) <= kLargestPercent))
+            if (!(std::abs(value) <= kLargest))
                 throw InputError{patch.line, "a value is too large in percent"};
         }
     if (scale_by == "values")
@@ -224,6 +241,7 @@ Measurement Sheet::measurement()
         throw InputError{0, fmt::format("{} {} of {}, no spectra", patches.size(),
                                         patches.size() == 1 ? "patch" : "patches", colour_space)};
     choose_condition();
+    const bool named = name_patches();
     if (kind != Kind::colours)
         bring_to_percent();
     const Colours colours = header.colours();

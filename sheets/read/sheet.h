@@ -13,6 +13,13 @@
 
 namespace vantrel::sheets {
 
+// Of reflectances in percent and of colours: beyond it colours overflow, and no instrument measures
+// it.
+inline constexpr double kLargest = 1e6;
+
+// The name of an ink as a file writes it, for a device value.
+std::string ink_name(std::string_view written);
+
 class Sheet {
 public:
     explicit Sheet(Reading reading) : reading(std::move(reading)) {}
@@ -20,7 +27,8 @@ public:
     // The bands of spectra at these wavelengths; throws InputError.
     const Bands &bands_at(const std::vector<double> &wavelengths, std::size_t line);
 
-    // The patch's reflectances are still on the file's scale.
+    // The patch's reflectances are still on the file's scale; its id and name are empty where the
+    // file gives none.
     void add(Patch patch, Condition condition, std::size_t line);
 
     // What the perfect white reads, and the keyword that says so; throws InputError where another
@@ -43,7 +51,6 @@ public:
     bool xyz = false; // the lab of the patches holds X, Y, Z
     std::string_view colour_space = "L*a*b*";
     std::vector<Patch> patches;
-    bool named = false; // any of them, by a name or an id of its own
 
     // Throws InputError.
     Measurement measurement();
@@ -51,6 +58,7 @@ public:
 private:
     void warn_of(const Source &source, std::size_t line);
     void choose_condition();
+    bool name_patches();
     void bring_to_percent();
     double largest_fraction() const;
     void warn_of_guess(double largest);

@@ -14,8 +14,6 @@ namespace vantrel::sheets {
 namespace {
 
 constexpr std::size_t kNone = static_cast<std::size_t>(-1);
-constexpr std::size_t kLongestInkName = 80;
-constexpr double kLargestColour = 1e6; // as of reflectances in percent
 
 // The column of the first of these fields that there is.
 std::size_t column_of(const std::vector<std::string> &keys,
@@ -281,7 +279,7 @@ void Table::find_devices(const std::vector<std::string> &keys, std::size_t line)
         if (device.empty())
             continue;
         free_names = free_names || !(standard || free);
-        device = cut(printable(device), kLongestInkName);
+        device = ink_name(device);
         if (const auto [before, added] = seen.try_emplace(device, i); !added)
             throw_twice(fields[i], before->second, i, line);
         devices.push_back({i, std::move(device)});
@@ -336,7 +334,7 @@ std::vector<std::pair<std::string, double>> Table::device_values(const Row &row,
     std::vector<std::pair<std::string, double>> out;
     const auto blank = [&](std::size_t column) { return trimmed(row.values[column]).empty(); };
     if (tint != kNone && !blank(tint)) {
-        std::string of = cut(text_at(row, ink), kLongestInkName);
+        std::string of = ink_name(text_at(row, ink));
         out.emplace_back(of.empty() ? "TINT" : std::move(of), value_at(row, tint, line));
         return out;
     }
@@ -356,7 +354,7 @@ std::optional<CIELABCOORD> Table::colour(const Row &row, std::size_t line) const
         if (!value && values.empty())
             throw InputError{line, fmt::format("{} is {}, not a number", printable(fields[lab[i]]),
                                                in_quotes(trimmed(row.values[lab[i]])))};
-        if (!value || std::abs(*value) > kLargestColour)
+        if (!value || std::abs(*value) > kLargest)
             return std::nullopt;
         out[i] = *value;
     }
@@ -403,11 +401,6 @@ void Table::add(const Row &row, Condition given, std::size_t line)
                 name = i; // the first column of words
     patch.id = text_at(row, id);
     patch.name = text_at(row, name);
-    sheet.named = sheet.named || ink != kNone || !patch.id.empty() || !patch.name.empty();
-    if (patch.id.empty())
-        patch.id = std::to_string(sheet.patches.size() + 1);
-    if (patch.name.empty() && ink == kNone)
-        patch.name = patch.id;
     percent_signs = false;
     patch.device = device_values(row, line);
     free_names = free_names && !percent_signs;
@@ -441,8 +434,6 @@ void Table::finish()
             if (percent == 0 && printed != patches.end())
                 of = printed->device[0].first;
         }
-        if (patch.name.empty())
-            patch.name = patch.id;
     }
 }
 
