@@ -14,6 +14,22 @@ if(NOT version STREQUAL PROJECT_VERSION)
   message(FATAL_ERROR "include/vantrel.h is of version ${version}, not ${PROJECT_VERSION}")
 endif()
 
+# Every operation is rounded to a double by itself. The old floating-point unit of i386 keeps more.
+set(CMAKE_TRY_COMPILE_TARGET_TYPE_BEFORE ${CMAKE_TRY_COMPILE_TARGET_TYPE})
+set(CMAKE_TRY_COMPILE_TARGET_TYPE STATIC_LIBRARY)
+include(CheckCXXSourceCompiles)
+check_cxx_source_compiles("#include <float.h>
+#if FLT_EVAL_METHOD != 0 && FLT_EVAL_METHOD != 1
+#error
+#endif
+" VANTREL_ROUNDS_TO_DOUBLE)
+set(CMAKE_TRY_COMPILE_TARGET_TYPE ${CMAKE_TRY_COMPILE_TARGET_TYPE_BEFORE})
+if(NOT VANTREL_ROUNDS_TO_DOUBLE)
+  message(FATAL_ERROR "This compiler computes doubles with more places than they have (the x87 unit "
+                      "of i386), so that results would differ from those of every other machine. "
+                      "With -msse2 -mfpmath=sse it does not.")
+endif()
+
 # The same bits from every compiler: no fused multiply-adds. Nothing reads errno after a call of the
 # mathematics library, so that a square root is one instruction.
 if(MSVC)

@@ -30,7 +30,7 @@ install_packages() {
             { echo "Please install, as root: apt-get install ${missing[*]}" >&2; exit 1; }
         root=(sudo)
     fi
-    echo "Installing ${missing[*]}" >&2
+    echo "Installing system-wide by apt-get, ${root[*]:+by sudo }as root: ${missing[*]}" >&2
     {
         "${root[@]}" apt-get -qq update
         "${root[@]}" env DEBIAN_FRONTEND=noninteractive \
@@ -51,6 +51,7 @@ build() {
 python_environment() {
     local folder=$1
     shift
+    echo "Installing into $folder alone by pip, as $(id -un): $*" >&2
     [[ -x $folder/bin/python ]] || python3 -m venv "$folder"
     "$folder/bin/pip" install --quiet --disable-pip-version-check \
         --config-settings=build-dir="$PWD/$folder/cmake" "$@"

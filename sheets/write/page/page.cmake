@@ -18,7 +18,7 @@ elseif(NOT VANTREL_NODE OR NOT VANTREL_NPM)
 elseif(NOT EXISTS ${page_modules} OR ${page_dir}/package-lock.json IS_NEWER_THAN ${page_modules})
   file(COPY ${page_dir}/package.json ${page_dir}/package-lock.json ${page_dir}/.npmrc
        DESTINATION ${page_build})
-  message(STATUS "Fetching the packages of the page")
+  message(STATUS "Fetching the packages of the page, those of ${page_lock}, by npm into ${page_build}")
   execute_process(COMMAND ${VANTREL_NPM} ci --loglevel=error WORKING_DIRECTORY ${page_build}
                   OUTPUT_QUIET RESULT_VARIABLE page_failed TIMEOUT 300)
   if(page_failed)
