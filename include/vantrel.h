@@ -31,8 +31,9 @@
  *   of threads at once, as long as no thread calls a `Set…Constants` function (or writes
  *   #den_weight) meanwhile.
  * - Arithmetic runs in the rounding mode of the caller and changes neither the mode nor what is
- *   trapped. Under another mode than to nearest, results differ in their last places, and a value
- *   that is rounded, cut or compared may fall to the other side. Infinities and not-a-numbers come
+ *   trapped. Under another mode than to nearest, results agree to ten places (in single precision
+ *   to six, a polarisation intercept to eight), and a value that is rounded, cut or compared may
+ *   fall to the other side. Infinities and not-a-numbers come
  *   out of divisions by zero, logarithms of zero and overflows on purpose: a host that has these
  *   exceptions trapped must mask them around a call.
  * - A host may define functions with these names itself: the library calls none of its own by an

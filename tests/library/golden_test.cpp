@@ -9,6 +9,7 @@
 #include <cxxabi.h>
 #include <fstream>
 #include <limits>
+#include <map>
 #include <set>
 
 namespace {
@@ -89,22 +90,27 @@ TEST(Golden, EveryLine)
     }
 }
 
-// A host that rounds upward gets other last places, or the other branch where two meet (those of L*
-// to 0.00001 of its value).
+// A host that rounds upward gets other last places, those of the polarisation intercept and of what
+// is in single precision sooner, or the other branch where two meet (those of L* to 0.00001).
 TEST(Golden, AnotherRoundingModeChangesLastPlaces)
 {
+    const std::map<std::string, double> sooner = {
+        {"CalcLabch", 1e-6}, {"ReflToPolIntercept", 1e-8}, {"XYZToCIELab", 1e-5}};
     for (GoldenCase &golden : one_good_call_each()) {
         SCOPED_TRACE(golden.where + " " + golden.function->name);
+        const auto found = sooner.find(golden.function->name);
+        const double places = found == sooner.end() ? 1e-10 : found->second;
         std::vector<Slot> upward = golden.slots;
-        golden.function->call(golden.slots);
+        const double result = golden.function->call(golden.slots);
         std::fesetround(FE_UPWARD);
-        golden.function->call(upward);
+        const double upward_result = golden.function->call(upward);
         EXPECT_EQ(std::fegetround(), FE_UPWARD);
         std::fesetround(FE_TONEAREST);
+        EXPECT_PRED3(agrees, upward_result, result, places * std::fmax(1, std::fabs(result)));
         for (std::size_t i = 0; i < upward.size(); ++i)
             for (std::size_t e = 0; e < upward[i].values.size(); ++e)
                 EXPECT_PRED3(agrees, upward[i].values[e], golden.slots[i].values[e],
-                             1e-5 * std::fmax(1, std::fabs(golden.slots[i].values[e])));
+                             places * std::fmax(1, std::fabs(golden.slots[i].values[e])));
     }
 }
 
