@@ -3,11 +3,14 @@
 #include "judge/control.h"
 #include "judge/densitometer.h"
 #include "judge/paper.h"
+#include "judge/repeats.h"
 #include "judge/substrate.h"
+#include "read/text.h"
 
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <map>
 #include <utility>
 
 namespace vantrel::sheets {
@@ -21,7 +24,6 @@ struct Sheet {
     Paper paper;
 
     bool has_spectra() const { return measurement.kind != Kind::colours; }
-    const Patch &patch(std::size_t place) const { return measurement.patches[place]; }
 };
 
 // What all pairs are judged by.
@@ -54,10 +56,17 @@ std::optional<int> response_of(const Sheet &sheet, const Patch &patch, int statu
     return Densitometer(sheet.paper.refl, status).response(patch.refl);
 }
 
-Side side_of(const Sheet &sheet, const Patch &patch, const Terms &terms,
+Side side_of(const Sheet &sheet, const Repeats &repeats, const Terms &terms,
              const std::optional<int> &response)
 {
-    Side side{patch.id, patch.name, colour_of(sheet.measurement, patch, terms.illuminant), {}, {}};
+    const Patch &patch = repeats.patch;
+    Side side{.id = patch.id,
+              .name = patch.name,
+              .colour = colour_of(sheet.measurement, patch, terms.illuminant),
+              .refl = {},
+              .density = {},
+              .repeats = repeats.count,
+              .spread = repeats.spread};
     if (!sheet.has_spectra())
         return side;
     side.refl = patch.refl;
@@ -79,16 +88,18 @@ void compare_spectra(PairReport &pair, const Spectrum &reference, const Spectrum
     pair.din6172 = din6172;
 }
 
-PairReport pair_report(const Sheet &references, const Patch &reference, const Sheet &samples,
-                       const Patch &sample, const Terms &terms)
+PairReport pair_report(const Sheet &references, const Sheet &samples, const Pair &pair,
+                       const Terms &terms)
 {
+    const Repeats reference = mean_of(references.measurement, pair.reference, terms.illuminant),
+                  sample = mean_of(samples.measurement, pair.sample, terms.illuminant);
     PairReport out;
     const int status = terms.request.status;
-    out.response = references.has_spectra() ? response_of(references, reference, status)
-                                            : response_of(samples, sample, status);
+    out.response = references.has_spectra() ? response_of(references, reference.patch, status)
+                                            : response_of(samples, sample.patch, status);
     out.reference = side_of(references, reference, terms, out.response);
     out.sample = side_of(samples, sample, terms, out.response);
-    out.device = reference.device.empty() ? sample.device : reference.device;
+    out.device = reference.patch.device.empty() ? sample.patch.device : reference.patch.device;
     for (const Metric &metric : terms.request.metrics)
         out.delta_e.push_back(metric(out.reference.colour.lab, out.sample.colour.lab));
     if (out.reference.refl && out.sample.refl)
@@ -116,14 +127,17 @@ std::vector<Statistics> all_statistics(const std::vector<PairReport> &pairs,
     return out;
 }
 
-// By the largest difference in the first metric, and by the limits.
-std::optional<Verdict> verdict_of(const CompareRequest &request, double largest,
-                                  const std::vector<LimitResult> &limits)
+// By the largest difference in the first metric, by the limits, and by what found no partner.
+std::optional<Verdict> verdict_of(const CompareRequest &request, const Coverage &coverage,
+                                  double largest, const std::vector<LimitResult> &limits)
 {
     if (!request.tolerance && request.tolerances.limits.empty())
         return std::nullopt;
     const bool above = request.tolerance && !(largest <= *request.tolerance);
-    return worse(above ? Verdict::failed : Verdict::passed, verdict_of(limits));
+    return worse(above                 ? Verdict::failed
+                 : coverage.complete() ? Verdict::passed
+                                       : Verdict::incomplete,
+                 verdict_of(limits));
 }
 
 // The aim of the least L* among all of the reference.
@@ -138,7 +152,8 @@ const Patch &darkest_of(const Measurement &reference, ILLUM_OBS illuminant)
 
 SubstrateCorrected substrate_corrected(std::vector<PairReport> &pairs,
                                        std::vector<ControlPatch> controls, const Sheet &reference,
-                                       const Sheet &sample, const Terms &terms)
+                                       const Sheet &sample, const Terms &terms,
+                                       const Coverage &coverage)
 {
     const Patch &darkest = darkest_of(reference.measurement, terms.illuminant);
     const CIELABCOORD black = lab_of(reference.measurement, darkest, terms.illuminant);
@@ -159,7 +174,7 @@ SubstrateCorrected substrate_corrected(std::vector<PairReport> &pairs,
     }
     out.statistics = all_statistics(pairs, &PairReport::corrected_delta_e);
     out.limits = judge_limits(terms.request.tolerances, controls);
-    out.verdict = verdict_of(terms.request, out.statistics[0].max, out.limits);
+    out.verdict = verdict_of(terms.request, coverage, out.statistics[0].max, out.limits);
     return out;
 }
 
@@ -172,12 +187,46 @@ void warn_of_conditions(const Measurement &reference, const Measurement &sample,
                                        first, sample.file, second));
 }
 
-std::vector<std::string> names_of(const Measurement &sheet, const std::vector<std::size_t> &places)
+std::vector<Unpaired> unpaired_of(const Measurement &sheet, const std::vector<std::size_t> &places)
 {
-    std::vector<std::string> out;
+    std::vector<Unpaired> out;
     for (const std::size_t place : places)
-        out.push_back(sheet.patches[place].name);
+        out.push_back({sheet.patches[place].id, sheet.patches[place].name});
     return out;
+}
+
+// Where most aims serve several patches, one in each zone, say, and some serve fewer.
+void warn_of_uneven(const Pairs &pairs, const Measurement &reference, const Measurement &sample,
+                    std::vector<std::string> &warnings)
+{
+    std::map<std::size_t, std::size_t> served, often; // patches of an aim; aims of as many patches
+    for (const Pair &pair : pairs.matched)
+        served[pair.reference.front()] += pair.sample.size();
+    for (const auto &[aim, patches] : served)
+        ++often[patches];
+    const std::size_t most =
+        std::max_element(often.begin(), often.end(), [](const auto &first, const auto &second) {
+            return first.second < second.second;
+        })->first;
+    std::string fewer;
+    std::size_t aims = 0;
+    for (const auto &[aim, patches] : served)
+        if (patches < most && ++aims <= 3)
+            fewer += fmt::format("{}{} ({})", fewer.empty() ? "" : ", ",
+                                 in_quotes(reference.patches[aim].name), patches);
+    if (aims > 0)
+        warnings.push_back(fmt::format("{}: most aims have {} patches, {} have fewer: {}{}",
+                                       sample.file, most, aims, fewer, aims > 3 ? ", …" : ""));
+}
+
+Coverage coverage_of(const Pairs &pairs, const Measurement &reference, const Measurement &sample,
+                     bool allow_missing)
+{
+    return {.aims = reference.patches.size() - pairs.only_reference.size(),
+            .of_aims = reference.patches.size(),
+            .patches = sample.patches.size() - pairs.only_sample.size(),
+            .of_patches = sample.patches.size(),
+            .allow_missing = allow_missing};
 }
 
 } // namespace
@@ -195,7 +244,7 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
     const Sheet samples{sample, paper_of(sample, request.paper, warnings)};
     const Terms terms{request, illuminant.illuminant,
                       request.second_illuminant.value_or(usual_second(illuminant.illuminant))};
-    const Pairs pairs = pairs_of(reference, sample, request.pairing);
+    const Pairs pairs = pairs_of(reference, sample, request.pairing, warnings);
     Comparison out{.reference = reference.file,
                    .sample = sample.file,
                    .reference_paper = references.paper.name,
@@ -204,13 +253,15 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
                    .second_illuminant = terms.second_illuminant,
                    .status = request.status,
                    .paired_by = pairs.by,
+                   .passed_over = pairs.passed_over,
                    .metrics = request.metrics,
                    .tolerance = request.tolerance,
                    .pairs = {},
                    .statistics = {},
                    .worst = {},
-                   .only_reference = names_of(reference, pairs.only_reference),
-                   .only_sample = names_of(sample, pairs.only_sample),
+                   .coverage = coverage_of(pairs, reference, sample, request.allow_missing),
+                   .only_reference = unpaired_of(reference, pairs.only_reference),
+                   .only_sample = unpaired_of(sample, pairs.only_sample),
                    .tolerances = request.tolerances.name,
                    .limits = {},
                    .corrected = {},
@@ -221,19 +272,20 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
         if (!alone->empty())
             out.warnings.push_back(fmt::format("{}: {} of {} patches have no partner", sheet->file,
                                                alone->size(), sheet->patches.size()));
+    warn_of_uneven(pairs, reference, sample, out.warnings);
     const Work work{request.tell, "Comparing", pairs.matched.size()};
-    for (const auto &[in_reference, in_sample] : pairs.matched) {
-        out.pairs.push_back(pair_report(references, references.patch(in_reference), samples,
-                                        samples.patch(in_sample), terms));
+    for (const Pair &pair : pairs.matched) {
+        out.pairs.push_back(pair_report(references, samples, pair, terms));
         work.done(out.pairs.size());
     }
     const std::vector<ControlPatch> controls = control_patches(
         out.pairs, references.paper, samples.paper, request.status, reference.collection);
     out.statistics = all_statistics(out.pairs, &PairReport::delta_e);
     out.limits = judge_limits(request.tolerances, controls);
-    out.verdict = verdict_of(request, out.statistics[0].max, out.limits);
+    out.verdict = verdict_of(request, out.coverage, out.statistics[0].max, out.limits);
     if (request.substrate_corrected)
-        out.corrected = substrate_corrected(out.pairs, controls, references, samples, terms);
+        out.corrected =
+            substrate_corrected(out.pairs, controls, references, samples, terms, out.coverage);
     out.worst = largest_first(values_of(out.pairs, &PairReport::delta_e, 0));
     out.worst.resize(std::min(out.worst.size(), kMostWorst));
     return out;

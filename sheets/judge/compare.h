@@ -17,7 +17,8 @@
 namespace vantrel::sheets {
 
 struct CompareRequest {
-    Pairing pairing = Pairing::automatic;
+    PairingRequest pairing;
+    bool allow_missing = false;          // the verdict stands where patches or aims have no partner
     std::vector<Metric> metrics;         // at least one; the first decides
     std::optional<ILLUM_OBS> illuminant; // as the files state where it is empty, or else D50
     std::optional<ILLUM_OBS>
@@ -38,6 +39,8 @@ struct Side {
     Colour colour;
     std::optional<Spectrum> refl;  // missing where the file holds colours alone
     std::optional<double> density; // in the response that reads the pair
+    std::size_t repeats = 1;       // of which this is the mean
+    std::optional<double> spread;  // of several: the largest ΔE00 from their mean
 };
 
 struct PairReport {
@@ -52,6 +55,9 @@ struct PairReport {
     // Against the aim as it is on the sample's paper.
     std::optional<CIELABCOORD> corrected_aim;
     std::vector<double> corrected_delta_e; // for each metric
+
+    // That of the patch which is judged.
+    const std::string &name() const { return sample.name; }
 };
 
 // The same judgement against aims that were moved to the sample's paper.
@@ -63,6 +69,24 @@ struct SubstrateCorrected {
     std::optional<Verdict> verdict;
 };
 
+struct Unpaired {
+    std::string id, name;
+};
+
+// How much was judged.
+struct Coverage {
+    std::size_t aims = 0, of_aims = 0;       // of the reference
+    std::size_t patches = 0, of_patches = 0; // of the sample
+    bool allow_missing = false;              // as asked for
+
+    // The sample is a strip of the chart: it has at most half of its patches.
+    bool is_strip() const { return patches == of_patches && 2 * aims <= of_aims; }
+    bool complete() const
+    {
+        return allow_missing || is_strip() || (patches == of_patches && aims == of_aims);
+    }
+};
+
 struct Comparison {
     std::string reference, sample;             // files
     std::string reference_paper, sample_paper; // names; densities are over these
@@ -70,12 +94,14 @@ struct Comparison {
     ILLUM_OBS second_illuminant;
     int status;
     Pairing paired_by;
+    std::vector<PairingTry> passed_over; // by automatic pairing
     std::vector<Metric> metrics;
     std::optional<double> tolerance;
     std::vector<PairReport> pairs;
     std::vector<Statistics> statistics; // of the pairs, for each metric
     std::vector<std::size_t> worst;     // ten at most, by the first metric
-    std::vector<std::string> only_reference, only_sample;
+    Coverage coverage;
+    std::vector<Unpaired> only_reference, only_sample;
     std::string tolerances; // their name
     std::vector<LimitResult> limits;
     std::optional<SubstrateCorrected> corrected;

@@ -21,7 +21,7 @@ bool is_tint(const ControlPatch &patch)
 ControlPatch control_patch(const PairReport &pair, const Paper &reference_paper, bool collection)
 {
     ControlPatch out;
-    out.name = pair.reference.name;
+    out.name = pair.name();
     out.aim = pair.reference.colour.lab;
     out.lab = pair.sample.colour.lab;
     out.aim_density = pair.reference.density;

@@ -76,6 +76,7 @@ struct Measurement {
     std::string file;           // its name, safe to print
     std::vector<Patch> patches; // at least one
     bool named = false;         // the file has names or ids; without any, places stand for them
+    bool has_ids = false;       // of its own; otherwise places stand for them
     Kind kind = Kind::reflectance;
     bool collection = false; // of colours, a spot library, say: no paper among them
     Source source;

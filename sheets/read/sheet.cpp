@@ -241,6 +241,8 @@ Measurement Sheet::measurement()
         throw InputError{0, fmt::format("{} {} of {}, no spectra", patches.size(),
                                         patches.size() == 1 ? "patch" : "patches", colour_space)};
     choose_condition();
+    const bool has_ids = std::any_of(patches.begin(), patches.end(),
+                                     [](const Patch &patch) { return !patch.id.empty(); });
     const bool named = name_patches();
     if (kind != Kind::colours)
         bring_to_percent();
@@ -256,6 +258,7 @@ Measurement Sheet::measurement()
     return {.file = {},
             .patches = std::move(patches),
             .named = named,
+            .has_ids = has_ids,
             .kind = kind,
             .collection = collection,
             .source = std::move(origin),

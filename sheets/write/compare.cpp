@@ -29,7 +29,7 @@ void add_pairs(Lines &lines, const Comparison &comparison, const std::vector<std
     const std::size_t widest = 69 - (colour ? 10 : 0) - 7 * (comparison.metrics.size() + 3);
     std::size_t width = 5;
     for (const std::size_t i : chosen)
-        width = std::max(width, characters(cut(comparison.pairs[i].reference.name, widest - 1)));
+        width = std::max(width, characters(cut(comparison.pairs[i].name(), widest - 1)));
     std::string head = fmt::format("{:<{}}{}", "Patch", width, colour ? "          " : "");
     for (const Metric &metric : comparison.metrics)
         head += fmt::format("{:>7}", names_of(metric.formula).title);
@@ -38,7 +38,7 @@ void add_pairs(Lines &lines, const Comparison &comparison, const std::vector<std
     for (const std::size_t i : chosen) {
         const PairReport &pair = comparison.pairs[i];
         const CIELABCOORD &aim = pair.reference.colour.lab, &lab = pair.sample.colour.lab;
-        std::string line = fmt::format("{:<{}}", cut(pair.reference.name, widest - 1), width);
+        std::string line = fmt::format("{:<{}}", cut(pair.name(), widest - 1), width);
         if (colour)
             line += ' ' + swatch(pair.reference.colour.rgb) + swatch(pair.sample.colour.rgb) + ' ';
         for (const double delta_e : pair.delta_e)
@@ -61,29 +61,78 @@ void add_statistics(Lines &lines, const Comparison &comparison,
         const Statistics &all = statistics[i];
         lines.add(fmt::format("{:<22}{:>8}{:>8}{:>8}  {}", title_of(comparison.metrics[i]),
                               fixed(all.mean), fixed(all.p95), fixed(all.max),
-                              cut(comparison.pairs[all.max_at].reference.name, kWidestName)));
+                              cut(comparison.pairs[all.max_at].name(), kWidestName)));
     }
 }
 
-void add_unpaired(Lines &lines, const std::string &file, const std::vector<std::string> &names)
+// "by device values (by name 0 of 72 patches; by id 2 of 72 patches, 70 disagreeing)": with the
+// keys that did not pair as many.
+std::string pairing_of(const Comparison &comparison)
 {
-    if (names.empty())
+    const Coverage &coverage = comparison.coverage;
+    std::string others;
+    for (const PairingTry &tried : comparison.passed_over)
+        if (tried.disagreeing || tried.sample + tried.reference < coverage.patches + coverage.aims)
+            others += fmt::format(
+                "{}{} {} of {} patches{}", others.empty() ? "" : "; ", phrase_of(tried.by),
+                tried.sample, coverage.of_patches,
+                tried.disagreeing ? fmt::format(", {} disagreeing", tried.disagreeing) : "");
+    return phrase_of(comparison.paired_by) + (others.empty() ? "" : " (" + others + ")");
+}
+
+void add_repeats(Lines &lines, const Comparison &comparison)
+{
+    for (const auto &[side, file] : {std::pair{&PairReport::reference, &comparison.reference},
+                                     std::pair{&PairReport::sample, &comparison.sample}}) {
+        const Side *widest = nullptr;
+        std::size_t patches = 0;
+        for (const PairReport &pair : comparison.pairs) {
+            const Side &one = pair.*side;
+            patches += one.spread ? 1 : 0;
+            if (one.spread && (!widest || *one.spread > *widest->spread))
+                widest = &one;
+        }
+        if (widest)
+            lines.add(
+                fmt::format("\nMeans of repeats in {}: {} patches; the widest, {}, has {} up to "
+                            "ΔE00 {} from their mean",
+                            *file, patches, cut(widest->name, kWidestInText), widest->repeats,
+                            fixed(widest->spread)));
+    }
+}
+
+void add_unpaired(Lines &lines, const std::string &file, const std::vector<Unpaired> &unpaired)
+{
+    if (unpaired.empty())
         return;
     constexpr std::size_t most = 10;
     std::string line = fmt::format("\nWithout a partner in {}: ", file);
-    for (std::size_t i = 0; i < names.size() && i < most; ++i)
-        line += (i ? ", " : "") + cut(names[i], kWidestInText);
-    if (names.size() > most)
-        line += fmt::format(" and {} more", names.size() - most);
+    for (std::size_t i = 0; i < unpaired.size() && i < most; ++i)
+        line += (i ? ", " : "") + cut(unpaired[i].name, kWidestInText);
+    if (unpaired.size() > most)
+        line += fmt::format(" and {} more", unpaired.size() - most);
     lines.add(line);
 }
 
-// "Failed: 3 of 5 pairs are above ΔE00 2; all 7 limits are held"
-std::string sentence_of(Verdict verdict, const Comparison &comparison,
+// "judged 160 of 160 patches by 20 of 72 aims, as a strip"
+std::string told(const Coverage &coverage)
+{
+    std::string out = fmt::format("judged {} of {} patches by {} of {} aims", coverage.patches,
+                                  coverage.of_patches, coverage.aims, coverage.of_aims);
+    if (coverage.is_strip())
+        return out + ", as a strip of them";
+    return out + (coverage.allow_missing ? ", which is allowed" : "");
+}
+
+// "Failed: 3 of 5 pairs are above ΔE00 2; all 7 limits are held; judged 5 of 5 patches by 5 of 5
+// aims"
+std::string sentence_of(const std::optional<Verdict> &verdict, const Comparison &comparison,
                         std::vector<double> PairReport::*differences,
                         const std::vector<LimitResult> &limits)
 {
-    std::string word(name_of(verdict));
+    if (!verdict)
+        return "No tolerance given; " + told(comparison.coverage);
+    std::string word(name_of(*verdict));
     word[0] = static_cast<char>(word[0] - 'a' + 'A');
     std::string reasons;
     if (comparison.tolerance) {
@@ -98,7 +147,12 @@ std::string sentence_of(Verdict verdict, const Comparison &comparison,
     }
     if (!limits.empty())
         reasons += (reasons.empty() ? "" : "; ") + counts_of(limits);
-    return fmt::format("{}: {}", word, reasons);
+    return fmt::format("{}: {}; {}", word, reasons, told(comparison.coverage));
+}
+
+std::string sentence_of(const Comparison &comparison)
+{
+    return sentence_of(comparison.verdict, comparison, &PairReport::delta_e, comparison.limits);
 }
 
 std::string limits_title(const Comparison &comparison)
@@ -109,9 +163,7 @@ std::string limits_title(const Comparison &comparison)
 void add_verdicts(Lines &lines, const Comparison &comparison)
 {
     add_limits(lines, limits_title(comparison), comparison.limits);
-    if (comparison.verdict)
-        lines.add('\n' + sentence_of(*comparison.verdict, comparison, &PairReport::delta_e,
-                                     comparison.limits));
+    lines.add('\n' + sentence_of(comparison));
     if (!comparison.corrected)
         return;
     const SubstrateCorrected &corrected = *comparison.corrected;
@@ -123,7 +175,7 @@ void add_verdicts(Lines &lines, const Comparison &comparison)
     add_limits(lines, limits_title(comparison) + ", substrate-corrected", corrected.limits);
     if (corrected.verdict)
         lines.add(fmt::format("\nSubstrate-corrected: {}",
-                              sentence_of(*corrected.verdict, comparison,
+                              sentence_of(corrected.verdict, comparison,
                                           &PairReport::corrected_delta_e, corrected.limits)));
 }
 
@@ -134,12 +186,33 @@ Json side_json(const Side &side)
             {"rgb", hex(side.colour.rgb)},
             {"lab", lab_json(side.colour.lab)},
             {"density", or_null(side.density)},
-            {"refl", or_null(side.refl)}};
+            {"refl", or_null(side.refl)},
+            {"repeats", side.repeats},
+            {"spread", or_null(side.spread)}};
+}
+
+Json names_json(const std::vector<Unpaired> &unpaired)
+{
+    Json out = Json::array();
+    for (const Unpaired &patch : unpaired)
+        out.push_back(patch.name);
+    return out;
+}
+
+Json tries_json(const std::vector<PairingTry> &tries)
+{
+    Json out = Json::array();
+    for (const PairingTry &tried : tries)
+        out.push_back({{"by", name_of(tried.by)},
+                       {"aims", tried.reference},
+                       {"patches", tried.sample},
+                       {"disagreeing", tried.disagreeing}});
+    return out;
 }
 
 Json pair_json(const PairReport &pair, const Comparison &comparison)
 {
-    Json out = {{"name", pair.reference.name},
+    Json out = {{"name", pair.name()},
                 {"reference", side_json(pair.reference)},
                 {"sample", side_json(pair.sample)}};
     for (std::size_t i = 0; i < pair.delta_e.size(); ++i)
@@ -168,7 +241,7 @@ Json statistics_json(const Comparison &comparison, const std::vector<Statistics>
             {"mean", statistics[i].mean},
             {"p95", statistics[i].p95},
             {"max", statistics[i].max},
-            {"max_patch", comparison.pairs[statistics[i].max_at].reference.name}};
+            {"max_patch", comparison.pairs[statistics[i].max_at].name()}};
     return out;
 }
 
@@ -193,9 +266,9 @@ void write_table(const Comparison &comparison, const Sink &sink, const TableStyl
     if (comparison.sample_paper != comparison.reference_paper)
         paper += ", the sample over " + cut(comparison.sample_paper, kWidestInText);
     Lines lines(sink);
-    lines.add(fmt::format("{} against {}: {} {} by {}", comparison.sample, comparison.reference,
+    lines.add(fmt::format("{} against {}: {} {} {}", comparison.sample, comparison.reference,
                           comparison.pairs.size(), comparison.pairs.size() == 1 ? "pair" : "pairs",
-                          name_of(comparison.paired_by)));
+                          pairing_of(comparison)));
     lines.add(fmt::format("{}, metamerism with {}; {} over {}", said(comparison.illuminant),
                           name_of(comparison.second_illuminant), status_name(comparison.status),
                           paper));
@@ -209,6 +282,7 @@ void write_table(const Comparison &comparison, const Sink &sink, const TableStyl
                           title_of(comparison.metrics[0])));
     add_pairs(lines, comparison, comparison.worst, style.colour);
     add_statistics(lines, comparison, comparison.statistics);
+    add_repeats(lines, comparison);
     add_unpaired(lines, comparison.reference, comparison.only_reference);
     add_unpaired(lines, comparison.sample, comparison.only_sample);
     add_verdicts(lines, comparison);
@@ -226,6 +300,16 @@ void write_json(const Comparison &comparison, const Sink &sink)
     }
     const Json head = {
         {"command", "compare"},
+        {"verdict", comparison.verdict ? Json(name_of(*comparison.verdict)) : Json()},
+        {"says", sentence_of(comparison)},
+        {"judged",
+         {{"patches", comparison.coverage.patches},
+          {"of_patches", comparison.coverage.of_patches},
+          {"aims", comparison.coverage.aims},
+          {"of_aims", comparison.coverage.of_aims},
+          {"strip", comparison.coverage.is_strip()},
+          {"allow_missing", comparison.coverage.allow_missing}}},
+        {"warnings", comparison.warnings},
         {"reference", {{"file", comparison.reference}, {"paper", comparison.reference_paper}}},
         {"sample", {{"file", comparison.sample}, {"paper", comparison.sample_paper}}},
         {"illuminant", name_of(comparison.illuminant)},
@@ -233,11 +317,11 @@ void write_json(const Comparison &comparison, const Sink &sink)
         {"second_illuminant", name_of(comparison.second_illuminant)},
         {"status", status_name(comparison.status)},
         {"paired_by", name_of(comparison.paired_by)},
+        {"passed_over", tries_json(comparison.passed_over)},
         {"formulas", names},
         {"labels", labels},
         {"weights", weights},
         {"tolerance", or_null(comparison.tolerance)},
-        {"verdict", comparison.verdict ? Json(name_of(*comparison.verdict)) : Json()},
         {"passed", comparison.verdict ? Json(*comparison.verdict == Verdict::passed) : Json()},
         {"tolerances", comparison.tolerances.empty() ? Json() : Json(comparison.tolerances)},
         {"limits", limits_json(comparison.limits)},
@@ -245,7 +329,8 @@ void write_json(const Comparison &comparison, const Sink &sink)
         {"statistics", statistics_json(comparison, comparison.statistics)},
         {"worst", comparison.worst},
         {"unpaired",
-         {{"reference", comparison.only_reference}, {"sample", comparison.only_sample}}},
+         {{"reference", names_json(comparison.only_reference)},
+          {"sample", names_json(comparison.only_sample)}}},
     };
     write_with_array(
         head, "pairs", comparison.pairs.size(),
@@ -253,12 +338,45 @@ void write_json(const Comparison &comparison, const Sink &sink)
     sink.write("\n");
 }
 
+namespace {
+
+// The patches of either sheet that were not judged.
+Flat flat_of_unpaired(const Comparison &comparison)
+{
+    const std::vector<Unpaired> &sample = comparison.only_sample,
+                                &reference = comparison.only_reference;
+    const auto of_sample = [&sample](std::string Unpaired::*text) {
+        return [&sample, text](std::size_t i) {
+            return i < sample.size() ? sample[i].*text : std::string();
+        };
+    };
+    const auto of_reference = [&sample, &reference](std::string Unpaired::*text) {
+        return [&sample, &reference, text](std::size_t i) {
+            return i < sample.size() ? std::string() : reference[i - sample.size()].*text;
+        };
+    };
+    Flat flat;
+    flat.description =
+        fmt::format("Without a partner in {} and {}", comparison.sample, comparison.reference);
+    flat.rows = sample.size() + reference.size();
+    flat.text("id", "SAMPLE_ID", of_sample(&Unpaired::id));
+    flat.text("name", "SAMPLE_NAME", of_sample(&Unpaired::name));
+    flat.text("reference_id", "REFERENCE_ID", of_reference(&Unpaired::id));
+    flat.text("reference_name", "REFERENCE_NAME", of_reference(&Unpaired::name));
+    flat.text("verdict", "VERDICT", [](std::size_t) { return "no partner"; });
+    return flat;
+}
+
+} // namespace
+
 std::vector<Flat> flat_of(const Comparison &comparison)
 {
     const std::vector<PairReport> &pairs = comparison.pairs;
     Flat flat;
-    flat.description = fmt::format("{} against {}: {}, {}", comparison.sample, comparison.reference,
-                                   name_of(comparison.illuminant), status_name(comparison.status));
+    flat.description =
+        fmt::format("{} against {}, {}: {}, {}. {}", comparison.sample, comparison.reference,
+                    pairing_of(comparison), name_of(comparison.illuminant),
+                    status_name(comparison.status), sentence_of(comparison));
     flat.rows = pairs.size();
     flat.text("id", "SAMPLE_ID", [&pairs](std::size_t i) { return pairs[i].sample.id; });
     flat.text("name", "SAMPLE_NAME", [&pairs](std::size_t i) { return pairs[i].sample.name; });
@@ -291,10 +409,22 @@ std::vector<Flat> flat_of(const Comparison &comparison)
     flat.number("density", "DENSITY", [&pairs](std::size_t i) { return pairs[i].sample.density; });
     flat.number("reference_density", "REFERENCE_DENSITY",
                 [&pairs](std::size_t i) { return pairs[i].reference.density; });
+    flat.exact("repeats", "REPEATS",
+               [&pairs](std::size_t i) { return static_cast<double>(pairs[i].sample.repeats); });
+    flat.number("spread", "SPREAD", [&pairs](std::size_t i) { return pairs[i].sample.spread; });
+    flat.exact("reference_repeats", "REFERENCE_REPEATS",
+               [&pairs](std::size_t i) { return static_cast<double>(pairs[i].reference.repeats); });
+    flat.number("reference_spread", "REFERENCE_SPREAD",
+                [&pairs](std::size_t i) { return pairs[i].reference.spread; });
+    flat.text("verdict", "VERDICT", [&comparison](std::size_t) {
+        return comparison.verdict ? std::string(name_of(*comparison.verdict)) : std::string();
+    });
     if (pairs.front().sample.refl)
         flat.spectrum(
             [&pairs](std::size_t i) -> const Spectrum & { return *pairs[i].sample.refl; });
     std::vector<Flat> tables = {flat};
+    if (!comparison.only_sample.empty() || !comparison.only_reference.empty())
+        tables.push_back(flat_of_unpaired(comparison));
     if (!comparison.limits.empty())
         tables.push_back(flat_of(comparison.limits, "reference", limits_title(comparison)));
     if (comparison.corrected && !comparison.corrected->limits.empty())

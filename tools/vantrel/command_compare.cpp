@@ -18,6 +18,10 @@ namespace {
 struct CompareOptions : Options {
     std::string reference, sample;
     std::string pairing = "auto";
+    bool force_pairs = false;
+    std::string repeats = "mean";
+    bool allow_missing = false;
+    std::string sample_condition; // the same as of the reference where it is empty
     std::vector<std::string> formulas = {"de2000"};
     std::vector<std::string> weights; // FORMULA=A,B
     std::string second_illuminant;    // its default follows the first
@@ -84,7 +88,7 @@ std::vector<Metric> metrics_of(const CompareOptions &options)
 
 Pairing pairing_of(const std::string &name)
 {
-    for (const Pairing pairing : {Pairing::name, Pairing::id, Pairing::order})
+    for (const Pairing pairing : {Pairing::name, Pairing::id, Pairing::device, Pairing::order})
         if (name == name_of(pairing))
             return pairing;
     return Pairing::automatic;
@@ -109,8 +113,13 @@ Outcome run(const CompareOptions &options)
 {
     if (options.tolerance && !(*options.tolerance >= 0 && std::isfinite(*options.tolerance)))
         throw RequestError{"--tolerance takes a number from 0 up"};
+    if (options.force_pairs && options.pairing == "auto")
+        throw RequestError{"--force-pairs takes a key named by --pair"};
     const CompareRequest request{
-        .pairing = pairing_of(options.pairing),
+        .pairing = {.by = pairing_of(options.pairing),
+                    .force = options.force_pairs,
+                    .each = options.repeats == "each"},
+        .allow_missing = options.allow_missing,
         .metrics = metrics_of(options),
         .illuminant = optional_illuminant(options.illuminant),
         .second_illuminant = optional_illuminant(options.second_illuminant),
@@ -122,8 +131,14 @@ Outcome run(const CompareOptions &options)
         .paper = options.paper,
         .tell = progress_bar(),
     };
-    const Measurement reference = sheet_of(options.reference, options, true);
-    const Measurement sample = sheet_of(options.sample, options, true);
+    Measurement reference = sheet_of(options.reference, options, true);
+    Options of_sample = options;
+    if (!options.sample_condition.empty())
+        of_sample.condition = options.sample_condition;
+    Measurement sample = sheet_of(options.sample, of_sample, true);
+    if (reference.file == sample.file && reference.source.condition != sample.source.condition)
+        for (Measurement *sheet : {&reference, &sample})
+            sheet->file += fmt::format(" ({})", sheet->source.condition);
     Comparison comparison = compare(reference, sample, request);
     const auto verdict = comparison.corrected ? comparison.corrected->verdict : comparison.verdict;
     std::vector<std::string> warnings = comparison.warnings;
@@ -134,14 +149,16 @@ Outcome run(const CompareOptions &options)
 }
 
 constexpr const char *kFooter =
-    "Patches pair by name, by id or by their place in the file; of several with the same name the "
-    "first\npairs with the first. auto goes by name, or else by id, where at least half of the "
-    "shorter sheet's\npatches find a partner, or else by place where the sheets are equally long. "
-    "Patches without a\npartner are told, and do not count.\n\n"
+    "Patches pair by name, id, device values or place in the file. auto takes the key that pairs "
+    "most,\nunless device values disagree. An aim serves any number of patches; of patches with "
+    "the "
+    "same name\nthe mean is judged.\n\n"
     "With --tolerance the sheet fails, and the exit status is 1, when any pair is above it in the "
-    "first\nformula; with --tolerances when one of the limits fails or could not be judged. With\n"
-    "--substrate-corrected the exit status is that of the corrected verdict. The 95th percentile "
-    "is the smallest difference that at least 95 % of the "
+    "first\nformula; with --tolerances when one of the limits fails or could not be judged. Where "
+    "patches or\naims find no partner the verdict is incomplete, and the exit status 1, unless the "
+    "sample is a strip\nof at most half of the aims. With --substrate-corrected the exit status is "
+    "that of the "
+    "corrected\nverdict. The 95th percentile is the smallest difference that at least 95 % of the "
     "pairs do not\nexceed. CIE94 and CMC weigh by the colour of the reference. Metamerism is the "
     "sum of the two\nDelta E*ab under the two illuminants; DIN 6172 tells how far the difference "
     "moves between them.\nDensities are over each sheet's own paper, in the response that reads "
@@ -163,9 +180,22 @@ Command add_compare(CLI::App &app)
         ->required();
     command->add_option("SAMPLE", options->sample, "Measurement file of the sheet")->required();
     add_sheet_options(*command, *options);
-    command->add_option("--pair", options->pairing, "Pair patches by: auto, name, id or order")
-        ->check(CLI::IsMember({"auto", "name", "id", "order"}))
+    command
+        ->add_option("--pair", options->pairing,
+                     "Pair patches by: auto, name, id, device (values) or order")
+        ->check(CLI::IsMember({"auto", "name", "id", "device", "order"}))
         ->capture_default_str();
+    command->add_flag("--force-pairs", options->force_pairs,
+                      "Take pairs too whose device values disagree");
+    command
+        ->add_option("--repeats", options->repeats,
+                     "Judge the mean of several measurements of a patch, or each of them")
+        ->check(CLI::IsMember({"mean", "each"}))
+        ->capture_default_str();
+    command->add_flag("--allow-missing", options->allow_missing,
+                      "Patches and aims without a partner leave the verdict complete");
+    add_condition_option(*command, "--sample-condition", options->sample_condition,
+                         "Measurement condition to read from the sample (default: --condition)");
     command
         ->add_option("--formula", options->formulas,
                      "Colour differences, with commas between: " + formula_keys() +

@@ -40,12 +40,17 @@ void add_sheet_options(CLI::App &command, Options &options)
                     "Scale of a file's reflectances: auto, percent, or fraction for 0 to 1")
         ->check(CLI::IsMember({"auto", "percent", "fraction"}))
         ->capture_default_str();
-    command
-        .add_option("--condition", options.condition,
-                    "Measurement condition to read from a file with several: M0, M1, M2 or M3 "
-                    "(default: M1, or else the first)")
-        ->check(CLI::IsMember({"M0", "M1", "M2", "M3"}, CLI::ignore_case));
+    add_condition_option(command, "--condition", options.condition,
+                         "Measurement condition to read from a file with several: M0, M1, M2 or M3 "
+                         "(default: M1, or else the first)");
     add_common_options(command, options);
+}
+
+void add_condition_option(CLI::App &command, const std::string &name, std::string &condition,
+                          const std::string &description)
+{
+    command.add_option(name, condition, description)
+        ->check(CLI::IsMember({"M0", "M1", "M2", "M3"}, CLI::ignore_case));
 }
 
 void add_order_option(CLI::App &command, std::vector<std::string> &order)

@@ -51,6 +51,8 @@ Command add_list(CLI::App &app);
 // The options that every command has, and those of commands that measure a sheet.
 void add_common_options(CLI::App &command, Options &options);
 void add_sheet_options(CLI::App &command, Options &options);
+void add_condition_option(CLI::App &command, const std::string &name, std::string &condition,
+                          const std::string &description);
 void add_order_option(CLI::App &command, std::vector<std::string> &order);
 
 // What the options name; throw RequestError.

@@ -1,7 +1,8 @@
 // vantrel compare: the verdict, and the pairs that it rests on.
 
 import { histogramPlot, mostPoints, picture, planePlot } from './charts.js';
-import { colourOf, count, figures, fixed, h, named, smallTable, spread, swatch } from './dom.js';
+import { colourOf, count, figures, fixed, h, named, smallTable, spread, swatch,
+  warnings } from './dom.js';
 import { spectraPicture, swatches } from './report.js';
 import { searchTable } from './table.js';
 
@@ -13,14 +14,26 @@ function verdict(result) {
   const labelOf = labeller(result);
   const { max, max_patch: patch } = result.statistics[formula];
   const worst = [`The largest ${labelOf(formula)} is ${fixed(max)}, at `, named(patch)];
-  const word = result.verdict;
-  if (!word)
-    return h('div', { class: 'verdict' }, h('p', { class: 'word' }, 'No tolerance given'),
-      h('p', {}, worst, '.'));
-  return h('div', { class: `verdict ${word}` },
-    h('p', { class: 'word' }, word[0].toUpperCase() + word.slice(1)),
-    h('p', {}, worst, result.tolerance === null ? '.' : `; the tolerance is ${result.tolerance}.`),
-    result.corrected ? h('p', {}, `Substrate-corrected: ${result.corrected.verdict}.`) : null);
+  const [, word, rest] = result.says.match(/^(.*?)[:;] (.*)$/s);
+  return h('div', { class: `verdict ${result.verdict ?? ''}` },
+    h('p', { class: 'word' }, word),
+    h('p', {}, `${rest[0].toUpperCase()}${rest.slice(1)}. `, worst, '.'),
+    result.corrected?.verdict
+      ? h('p', {}, `Substrate-corrected: ${result.corrected.verdict}.`) : null);
+}
+
+// The widest of the means of several measurements.
+function repeats(result) {
+  const side = (key) => {
+    const means = result.pairs.map((pair) => pair[key]).filter(({ spread }) => spread !== null);
+    if (!means.length)
+      return null;
+    const widest = means.reduce((one, other) => (other.spread > one.spread ? other : one));
+    return h('p', { class: 'note' }, `${count(means.length, 'patch')} of the ${key} as the mean of ` +
+      'repeats; the widest, ', named(widest.name),
+    `, has ${widest.repeats} up to ΔE00 ${fixed(widest.spread)} from their mean.`);
+  };
+  return [side('reference'), side('sample')];
 }
 
 const digits = (limit) => (limit.formula === 'density' ? 3 : 2);
@@ -77,10 +90,12 @@ const spectraOf = (pair) => [
 const bothColours = ({ reference, sample }) =>
   `linear-gradient(to bottom right, ${colourOf(reference)} 50%, ${colourOf(sample)} 50%)`;
 
+const pairings = { name: 'name', id: 'id', device: 'device values', order: 'place in the file' };
+
 const overview = (result) => h('header', {},
   h('h1', {}, named(result.sample.file), ' against ', named(result.reference.file)),
   h('p', { class: 'about' }, [count(result.pairs.length, 'patch'),
-    `paired by ${result.paired_by}`, result.illuminant, result.status].join(' · ')));
+    `paired by ${pairings[result.paired_by]}`, result.illuminant, result.status].join(' · ')));
 
 const statisticsTable = (result) => smallTable('Differences', [
   { label: 'Formula', text: labeller(result) },
@@ -116,11 +131,13 @@ export function comparePage(result) {
   return [
     overview(result),
     verdict(result),
+    warnings(result.warnings),
     formulas.length === 1 ? figures([
       [`${labelOf(formula)} mean`, fixed(mean)],
       ['95th percentile', fixed(p95)],
       ['Largest', fixed(max), named(statistics[formula].max_patch)],
     ]) : statisticsTable(result),
+    repeats(result),
     unpaired(result),
     limitsTable(result.tolerances ?? 'Limits', result.limits),
     limitsTable(`${result.tolerances}, substrate-corrected`, result.corrected?.limits),
@@ -140,7 +157,7 @@ export function comparePage(result) {
     searchTable({
       caption: 'All patches', noun: 'patch', columns: pairColumns(result), rows: pairs,
       colour: (pair) => colourOf(pair.sample),
-      text: (pair) => `${pair.name} ${pair.sample.name} ${pair.verbal}`,
+      text: (pair) => `${pair.name} ${pair.reference.name} ${pair.verbal}`,
       onChoose(all) {
         chosen = new Set([...all].slice(-4));
         spectra.add([...chosen].filter((pair) => pair !== worst[0]).flatMap(spectraOf));

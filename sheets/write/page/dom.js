@@ -48,6 +48,10 @@ export function smallTable(caption, columns, rows) {
       h('tr', {}, columns.map((column) => cell('td', column, column.text(row))))))));
 }
 
+// What the program warned of, line by line.
+export const warnings = (lines) => (lines.length
+  ? h('ul', { class: 'note' }, lines.map((line) => h('li', {}, named(line)))) : null);
+
 // At most `most` of the items, evenly spread over all of them.
 export function spread(items, most) {
   if (items.length <= most) return items;
