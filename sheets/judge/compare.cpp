@@ -2,7 +2,6 @@
 
 #include "judge/control.h"
 #include "judge/densitometer.h"
-#include "judge/paper.h"
 #include "judge/repeats.h"
 #include "judge/substrate.h"
 #include "read/text.h"
@@ -11,6 +10,7 @@
 
 #include <algorithm>
 #include <map>
+#include <tuple>
 #include <utility>
 
 namespace vantrel::sheets {
@@ -155,6 +155,8 @@ SubstrateCorrected substrate_corrected(std::vector<PairReport> &pairs,
                                        const Sheet &sample, const Terms &terms,
                                        const Coverage &coverage)
 {
+    for (const Sheet *sheet : {&reference, &sample})
+        require_paper(sheet->paper.choice, sheet->measurement.file, "--substrate-corrected");
     const Patch &darkest = darkest_of(reference.measurement, terms.illuminant);
     const CIELABCOORD black = lab_of(reference.measurement, darkest, terms.illuminant);
     SubstrateCorrected out;
@@ -176,6 +178,36 @@ SubstrateCorrected substrate_corrected(std::vector<PairReport> &pairs,
     out.limits = judge_limits(terms.request.tolerances, controls);
     out.verdict = verdict_of(terms.request, coverage, out.statistics[0].max, out.limits);
     return out;
+}
+
+std::optional<PaperDifference> papers_of(const Sheet &references, const Sheet &samples,
+                                         const Terms &terms)
+{
+    const Paper &reference = references.paper, &sample = samples.paper;
+    if (!reference.choice.exists() || !sample.choice.exists())
+        return std::nullopt;
+    PaperDifference out{
+        delta_e00(lab_of(reference, terms.illuminant), lab_of(sample, terms.illuminant)), {}};
+    if (references.has_spectra() && samples.has_spectra()) {
+        double sum = 0;
+        Metamerism(reference.refl.data(), sample.refl.data(), terms.illuminant,
+                   terms.second_illuminant, &sum);
+        out.metamerism = sum;
+    }
+    return out;
+}
+
+// Of densities on both sides, from those of the pairs.
+void warn_of_papers(Comparison &comparison)
+{
+    for (const auto &[file, paper, side] :
+         {std::tuple{&comparison.reference, &comparison.reference_paper, &PairReport::reference},
+          std::tuple{&comparison.sample, &comparison.sample_paper, &PairReport::sample}}) {
+        std::vector<std::optional<double>> densities;
+        for (const PairReport &pair : comparison.pairs)
+            densities.push_back((pair.*side).density);
+        warn_of_paper(*file, *paper, densities, comparison.warnings);
+    }
 }
 
 void warn_of_conditions(const Measurement &reference, const Measurement &sample,
@@ -240,15 +272,16 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
     const IlluminantChoice illuminant =
         illuminant_for(request.illuminant, {&reference, &sample}, warnings);
     warn_of_conditions(reference, sample, warnings);
-    const Sheet references{reference, paper_of(reference, request.paper, warnings)};
-    const Sheet samples{sample, paper_of(sample, request.paper, warnings)};
+    const Sheet references{reference, paper_of(reference, request.paper, illuminant, warnings)};
+    const Sheet samples{sample, paper_of(sample, request.paper, illuminant, warnings)};
     const Terms terms{request, illuminant.illuminant,
                       request.second_illuminant.value_or(usual_second(illuminant.illuminant))};
     const Pairs pairs = pairs_of(reference, sample, request.pairing, warnings);
     Comparison out{.reference = reference.file,
                    .sample = sample.file,
-                   .reference_paper = references.paper.name,
-                   .sample_paper = samples.paper.name,
+                   .reference_paper = references.paper.choice,
+                   .sample_paper = samples.paper.choice,
+                   .papers = papers_of(references, samples, terms),
                    .illuminant = illuminant,
                    .second_illuminant = terms.second_illuminant,
                    .status = request.status,
@@ -278,6 +311,7 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
         out.pairs.push_back(pair_report(references, samples, pair, terms));
         work.done(out.pairs.size());
     }
+    warn_of_papers(out);
     const std::vector<ControlPatch> controls = control_patches(
         out.pairs, references.paper, samples.paper, request.status, reference.collection);
     out.statistics = all_statistics(out.pairs, &PairReport::delta_e);

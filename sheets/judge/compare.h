@@ -5,6 +5,7 @@
 #include "judge/formulas.h"
 #include "judge/limits.h"
 #include "judge/pairs.h"
+#include "judge/paper.h"
 #include "judge/stated.h"
 #include "judge/statistics.h"
 #include "read/measurement.h"
@@ -28,7 +29,7 @@ struct CompareRequest {
     std::optional<double> tolerance;
     Tolerances tolerances; // none where it has no limits
     bool substrate_corrected = false;
-    std::string paper; // of both sheets, by name or id; the usual one where it is empty
+    std::string paper; // of both sheets, as paper_of() takes it
     Tell tell{};
 };
 
@@ -69,6 +70,12 @@ struct SubstrateCorrected {
     std::optional<Verdict> verdict;
 };
 
+// From the paper of the reference to that of the sample.
+struct PaperDifference {
+    double de00 = 0;
+    std::optional<double> metamerism; // missing where a side has no spectra
+};
+
 struct Unpaired {
     std::string id, name;
 };
@@ -89,7 +96,8 @@ struct Coverage {
 
 struct Comparison {
     std::string reference, sample;             // files
-    std::string reference_paper, sample_paper; // names; densities are over these
+    PaperChoice reference_paper, sample_paper; // densities are over these
+    std::optional<PaperDifference> papers;     // where both have one
     IlluminantChoice illuminant;
     ILLUM_OBS second_illuminant;
     int status;

@@ -33,7 +33,7 @@ ControlPatch control_patch(const PairReport &pair, const Paper &reference_paper,
             if (percent != 0)
                 out.inks.emplace_back(field, percent);
         }
-    out.paper = known ? out.inks.empty() : pair.reference.name == reference_paper.name;
+    out.paper = known ? out.inks.empty() : pair.reference.name == reference_paper.choice.name;
     out.spot = collection || std::any_of(out.inks.begin(), out.inks.end(), [](const auto &ink) {
                    return !ink.first.starts_with("CMYK_");
                });
@@ -44,7 +44,7 @@ ControlPatch control_patch(const PairReport &pair, const Paper &reference_paper,
 std::optional<double> gain_of(const Side &solid, const Side &tint, double nominal,
                               const Paper &paper, int status)
 {
-    if (!solid.refl || !tint.refl)
+    if (!solid.refl || !tint.refl || !paper.choice.exists())
         return std::nullopt;
     const auto area = Densitometer(paper.refl, status).dot_area(*solid.refl, *tint.refl, 1);
     return area ? std::optional(*area - nominal) : std::nullopt;

@@ -45,7 +45,7 @@ PatchStudy study_of(const Measurement &sheet, const InkRequest &request)
 {
     std::vector<std::string> warnings = reading_warnings(sheet);
     const IlluminantChoice illuminant = illuminant_for(request.illuminant, {&sheet}, warnings);
-    const Paper paper = paper_of(sheet, request.paper, warnings);
+    const Paper paper = paper_of(sheet, request.paper, illuminant, warnings);
     const Patch &patch = patch_named(sheet, request.patch);
     const Patch *other = request.against.empty() ? nullptr : &patch_named(sheet, request.against);
     const Inks inks(sheet, request.order);
@@ -53,9 +53,9 @@ PatchStudy study_of(const Measurement &sheet, const InkRequest &request)
     PatchStudy out{.file = sheet.file,
                    .illuminant = illuminant,
                    .status = request.status,
-                   .paper = paper.name,
+                   .paper = paper.choice,
                    .patch = patch_report(patch, conditions),
-                   .as_paper = paper_report({patch.name, patch.refl, {}}, illuminant),
+                   .as_paper = paper_report({{patch.name, "by name"}, patch.refl, {}}, illuminant),
                    .statuses = {},
                    .illuminants = {},
                    .against = {},

@@ -36,7 +36,7 @@ struct PatchStudy {
     std::string file;
     IlluminantChoice illuminant;
     int status;
-    std::string paper;
+    PaperChoice paper;
     PatchReport patch;
     PaperReport as_paper; // brightness and whiteness of this patch
     std::array<StatusReading, NUM_STATUSES> statuses;
@@ -50,7 +50,7 @@ struct InkRequest {
     std::string against;                 // likewise; none where it is empty
     std::optional<ILLUM_OBS> illuminant; // as the file states where it is empty, or else D50
     int status = E_STATUS;
-    std::string paper;              // by name or id; the usual one where it is empty
+    std::string paper;              // as paper_of() takes it
     std::vector<std::string> order; // of printing, as Inks takes it
 };
 

@@ -1,7 +1,6 @@
 #include "judge/predict.h"
 
 #include "judge/inks.h"
-#include "judge/paper.h"
 #include "read/text.h"
 
 #include <fmt/format.h>
@@ -153,11 +152,12 @@ Predictions predict(const Measurement &sheet, const PredictRequest &request)
     const Inks inks(sheet, request.order);
     std::vector<std::string> warnings = reading_warnings(sheet);
     const IlluminantChoice illuminant = illuminant_for(request.illuminant, {&sheet}, warnings);
-    const Paper paper = paper_of(sheet, request.paper, warnings);
+    const Paper paper = paper_of(sheet, request.paper, illuminant, warnings);
+    require_paper(paper.choice, sheet.file, "a prediction");
     Predictions out{.file = sheet.file,
                     .illuminant = illuminant,
                     .status = request.status,
-                    .paper = paper.name,
+                    .paper = paper.choice,
                     .all = {},
                     .warnings = std::move(warnings)};
     if (request.inks.empty()) {

@@ -3,6 +3,7 @@
 
 #include "judge/colour.h"
 #include "judge/densitometer.h"
+#include "judge/paper.h"
 #include "judge/stated.h"
 #include "read/measurement.h"
 
@@ -46,7 +47,7 @@ struct Predictions {
     std::string file;
     IlluminantChoice illuminant;
     int status;
-    std::string paper;
+    PaperChoice paper;
     std::vector<Prediction> all;
     std::size_t left_out = 0; // measured overprints that cannot be predicted
     std::vector<std::string> warnings;
@@ -55,7 +56,7 @@ struct Predictions {
 struct PredictRequest {
     std::optional<ILLUM_OBS> illuminant; // as the file states where it is empty, or else D50
     int status = E_STATUS;
-    std::string paper;              // by name or id; the usual one where it is empty
+    std::string paper;              // as paper_of() takes it
     std::vector<std::string> order; // of printing, as Inks takes it
     // The combination to predict, each NAME:PERCENT, in the order of printing; every measured
     // overprint of two or three inks where it is empty.

@@ -49,11 +49,24 @@ void measure_inks(PatchReport &row, const Patch &patch, const Inks &inks,
     }
 }
 
-MetamerismReport metamerism_of(const Paper &paper, const Patch &second, ILLUM_OBS illuminant,
-                               const std::optional<ILLUM_OBS> &second_illuminant)
+MetamerismReport metamerism_of(const Measurement &sheet, const Paper &paper, ILLUM_OBS illuminant,
+                               const ReportRequest &request, std::vector<std::string> &warnings)
 {
-    MetamerismReport out{.paper = second.name,
-                         .illuminant = second_illuminant.value_or(usual_second(illuminant)),
+    const Measurement &other = request.second_sheet ? *request.second_sheet : sheet;
+    for (const Measurement *one : {&sheet, &other})
+        if (one->kind == Kind::colours)
+            throw RequestError{
+                fmt::format("{} holds colours alone, and metamerism takes spectra", one->file)};
+    require_paper(paper.choice, sheet.file, "metamerism");
+    if (request.second_sheet)
+        for (const std::string &warning : reading_warnings(other))
+            warnings.push_back(warning);
+    const Paper second = paper_of(other, request.second_paper, illuminant, warnings);
+    require_paper(second.choice, other.file, "metamerism");
+    MetamerismReport out{.file = request.second_sheet ? other.file : "",
+                         .paper = second.choice,
+                         .illuminant = request.second_illuminant.value_or(usual_second(illuminant)),
+                         .de00 = delta_e00(lab_of(paper, illuminant), lab_of(second, illuminant)),
                          .sum = 0,
                          .din6172 = 0};
     Metamerism(paper.refl.data(), second.refl.data(), illuminant, out.illuminant, &out.sum);
@@ -100,27 +113,32 @@ PatchReport patch_report(const Patch &patch, const Conditions &conditions)
     row.name = patch.name;
     row.device = patch.device;
     row.colour = colour_of(conditions.sheet, patch, conditions.illuminant);
-    row.to_paper = delta_e00(lab_of(conditions.paper, conditions.illuminant), row.colour.lab);
+    const Paper &paper = conditions.paper;
+    if (paper.choice.exists())
+        row.to_paper = delta_e00(lab_of(paper, conditions.illuminant), row.colour.lab);
     row.lch = lch_of(row.colour.lab);
     if (conditions.sheet.kind == Kind::colours)
         return row;
     row.refl = patch.refl;
 
-    const Densitometer densitometer(conditions.paper.refl, conditions.status);
+    const Densitometer densitometer(paper.refl, conditions.status);
     const DensityReading reading = densitometer.read(patch.refl);
     row.response = reading.response;
     row.density = reading.density;
-    measure_inks(row, patch, conditions.inks, densitometer, conditions.n_factor);
+    if (paper.choice.exists())
+        measure_inks(row, patch, conditions.inks, densitometer, conditions.n_factor);
     return row;
 }
 
 PaperReport paper_report(const Paper &paper, ILLUM_OBS illuminant)
 {
-    PaperReport out{.name = paper.name,
-                    .lab = lab_of(paper, illuminant),
-                    .brightness = {},
-                    .whiteness = {},
-                    .no_whiteness = {}};
+    PaperReport out{
+        .choice = paper.choice, .lab = {}, .brightness = {}, .whiteness = {}, .no_whiteness = {}};
+    if (!paper.choice.exists()) {
+        out.no_whiteness = "there is no paper";
+        return out;
+    }
+    out.lab = lab_of(paper, illuminant);
     if (paper.lab) {
         out.no_whiteness = "there are no spectra";
         return out;
@@ -143,14 +161,10 @@ Report report_of(const Measurement &sheet, const ReportRequest &request)
 {
     std::vector<std::string> warnings = reading_warnings(sheet);
     const IlluminantChoice illuminant = illuminant_for(request.illuminant, {&sheet}, warnings);
-    const Paper paper = paper_of(sheet, request.paper, warnings);
+    const Paper paper = paper_of(sheet, request.paper, illuminant, warnings);
     std::optional<MetamerismReport> metamerism;
-    if (!request.second_paper.empty() && sheet.kind == Kind::colours)
-        throw RequestError{
-            fmt::format("{} holds colours alone, and metamerism takes spectra", sheet.file)};
-    if (!request.second_paper.empty())
-        metamerism = metamerism_of(paper, patch_named(sheet, request.second_paper), illuminant,
-                                   request.second_illuminant);
+    if (request.second_sheet || !request.second_paper.empty())
+        metamerism = metamerism_of(sheet, paper, illuminant, request, warnings);
     const Inks inks(sheet, request.order);
     Report report{.file = sheet.file,
                   .illuminant = illuminant,
@@ -169,6 +183,10 @@ Report report_of(const Measurement &sheet, const ReportRequest &request)
         report.patches.push_back(patch_report(patch, conditions));
         work.done(report.patches.size());
     }
+    std::vector<std::optional<double>> densities;
+    for (const PatchReport &patch : report.patches)
+        densities.push_back(patch.density);
+    warn_of_paper(sheet.file, paper.choice, densities, report.warnings);
     report.tone_curves = tone_curves(sheet, inks, report.patches);
     return report;
 }

@@ -17,11 +17,13 @@ namespace vantrel::sheets {
 struct ReportRequest {
     std::optional<ILLUM_OBS> illuminant; // as the file states where it is empty, or else D50
     int status = E_STATUS;
-    std::string paper; // by name or id; the usual one where it is empty
+    std::string paper; // as paper_of() takes it
     double n_factor = 1;
     std::vector<std::string> order; // of printing, as Inks takes it
-    // The patch that the paper's metamerism is told against, by name or id; none where it is empty.
+    // The paper that the first is compared with, as paper_of() takes it, of another sheet where
+    // there is one; none where both are missing.
     std::string second_paper;
+    const Measurement *second_sheet = nullptr;
     std::optional<ILLUM_OBS> second_illuminant; // the usual one where it is empty
     Tell tell{};
 };
@@ -34,9 +36,9 @@ struct PatchReport {
     std::optional<Spectrum> refl; // missing where the file holds colours alone
     Colour colour;
     CIELCHCOORD lch{};
-    double to_paper = 0;                       // ΔE00
+    std::optional<double> to_paper;            // ΔE00
     std::optional<int> response;               // the one that reads this patch
-    std::optional<double> density;             // in it, over the paper
+    std::optional<double> density;             // in it, over the paper, absolute without one
     std::optional<double> dot_area, dot_gain;  // of a tint of one ink
     std::optional<double> print_contrast;      // of a tint of 75 to 80 %
     std::optional<double> hue_error, grayness; // of a solid
@@ -44,8 +46,8 @@ struct PatchReport {
 };
 
 struct PaperReport {
-    std::string name;
-    CIELABCOORD lab{};
+    PaperChoice choice;
+    std::optional<CIELABCOORD> lab;
     std::optional<double> brightness;
     std::optional<double> whiteness;
     std::string no_whiteness; // the reason
@@ -53,8 +55,10 @@ struct PaperReport {
 
 // How a second paper differs from the first under two illuminants.
 struct MetamerismReport {
-    std::string paper;
+    std::string file; // of the second; empty where it is on the same sheet
+    PaperChoice paper;
     ILLUM_OBS illuminant; // the second one
+    double de00;          // under the first
     double sum;           // of the two ΔE*ab
     double din6172;
 };

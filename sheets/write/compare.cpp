@@ -191,6 +191,11 @@ Json side_json(const Side &side)
             {"spread", or_null(side.spread)}};
 }
 
+Json sheet_json(const std::string &file, const PaperChoice &paper)
+{
+    return {{"file", file}, {"paper", name_json(paper)}, {"paper_chosen", paper.reason}};
+}
+
 Json names_json(const std::vector<Unpaired> &unpaired)
 {
     Json out = Json::array();
@@ -262,14 +267,14 @@ Json corrected_json(const Comparison &comparison)
 
 void write_table(const Comparison &comparison, const Sink &sink, const TableStyle &style)
 {
-    std::string paper = cut(comparison.reference_paper, kWidestInText);
-    if (comparison.sample_paper != comparison.reference_paper)
-        paper += ", the sample over " + cut(comparison.sample_paper, kWidestInText);
+    std::string paper = over(comparison.reference_paper);
+    if (const std::string own = over(comparison.sample_paper); own != paper)
+        paper += ", the sample " + own;
     Lines lines(sink);
     lines.add(fmt::format("{} against {}: {} {} {}", comparison.sample, comparison.reference,
                           comparison.pairs.size(), comparison.pairs.size() == 1 ? "pair" : "pairs",
                           pairing_of(comparison)));
-    lines.add(fmt::format("{}, metamerism with {}; {} over {}", said(comparison.illuminant),
+    lines.add(fmt::format("{}, metamerism with {}; {} {}", said(comparison.illuminant),
                           name_of(comparison.second_illuminant), status_name(comparison.status),
                           paper));
     if (style.all_pairs) {
@@ -282,6 +287,10 @@ void write_table(const Comparison &comparison, const Sink &sink, const TableStyl
                           title_of(comparison.metrics[0])));
     add_pairs(lines, comparison, comparison.worst, style.colour);
     add_statistics(lines, comparison, comparison.statistics);
+    if (const auto &papers = comparison.papers)
+        lines.add(
+            fmt::format("\nBetween the papers: ΔE00 {}{}", fixed(papers->de00),
+                        papers->metamerism ? ", metamerism " + fixed(papers->metamerism) : ""));
     add_repeats(lines, comparison);
     add_unpaired(lines, comparison.reference, comparison.only_reference);
     add_unpaired(lines, comparison.sample, comparison.only_sample);
@@ -310,8 +319,12 @@ void write_json(const Comparison &comparison, const Sink &sink)
           {"strip", comparison.coverage.is_strip()},
           {"allow_missing", comparison.coverage.allow_missing}}},
         {"warnings", comparison.warnings},
-        {"reference", {{"file", comparison.reference}, {"paper", comparison.reference_paper}}},
-        {"sample", {{"file", comparison.sample}, {"paper", comparison.sample_paper}}},
+        {"reference", sheet_json(comparison.reference, comparison.reference_paper)},
+        {"sample", sheet_json(comparison.sample, comparison.sample_paper)},
+        {"papers", comparison.papers
+                       ? Json({{"de00", comparison.papers->de00},
+                               {"metamerism", or_null(comparison.papers->metamerism)}})
+                       : Json()},
         {"illuminant", name_of(comparison.illuminant)},
         {"illuminant_by", comparison.illuminant.by},
         {"second_illuminant", name_of(comparison.second_illuminant)},
@@ -416,6 +429,10 @@ std::vector<Flat> flat_of(const Comparison &comparison)
                [&pairs](std::size_t i) { return static_cast<double>(pairs[i].reference.repeats); });
     flat.number("reference_spread", "REFERENCE_SPREAD",
                 [&pairs](std::size_t i) { return pairs[i].reference.spread; });
+    flat.text("paper", "PAPER",
+              [&comparison](std::size_t) { return said(comparison.sample_paper); });
+    flat.text("reference_paper", "REFERENCE_PAPER",
+              [&comparison](std::size_t) { return said(comparison.reference_paper); });
     flat.text("verdict", "VERDICT", [&comparison](std::size_t) {
         return comparison.verdict ? std::string(name_of(*comparison.verdict)) : std::string();
     });

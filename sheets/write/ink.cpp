@@ -27,11 +27,12 @@ void add_summary(Lines &lines, const PatchStudy &study, bool colour)
     const PatchReport &patch = study.patch;
     lines.add(fmt::format("{} ({}) of {}{}", cut(patch.name, kWidestName), patch.id, study.file,
                           device_values(patch)));
-    lines.add(fmt::format("{}, {} over {}", said(study.illuminant), status_name(study.status),
-                          cut(study.paper, kWidestInText)));
-    lines.add(fmt::format("\n{}L*a*b* {}, C* {}, h {}, ΔE00 to the paper {}",
+    lines.add(fmt::format("{}, {} {}", said(study.illuminant), status_name(study.status),
+                          over(study.paper)));
+    lines.add(fmt::format("\n{}L*a*b* {}, C* {}, h {}{}",
                           colour ? swatch(patch.colour.rgb) + ' ' : "", fixed(patch.colour.lab),
-                          fixed(patch.lch.C), fixed(patch.lch.h), fixed(patch.to_paper)));
+                          fixed(patch.lch.C), fixed(patch.lch.h),
+                          patch.to_paper ? ", ΔE00 to the paper " + fixed(patch.to_paper) : ""));
     std::string print =
         patch.response ? fmt::format("Density {} {}", response_name(study.status, *patch.response),
                                      fixed(patch.density, 3))
@@ -191,7 +192,7 @@ Flat bands(const PatchStudy &study)
 Flat densities(const PatchStudy &study)
 {
     Flat flat;
-    flat.description = fmt::format("Densities of {} over {}", study.patch.name, study.paper);
+    flat.description = fmt::format("Densities of {} {}", study.patch.name, over(study.paper));
     flat.rows = NUM_STATUSES;
     flat.text("table", "", [](std::size_t) { return "densities"; });
     flat.text("status", "STATUS",
@@ -202,6 +203,7 @@ Flat densities(const PatchStudy &study)
     });
     flat.number("density", "DENSITY",
                 [&study](std::size_t i) { return study.statuses[i].reading.density; });
+    flat.text("paper", "PAPER", [&study](std::size_t) { return said(study.paper); });
     for (int response = 0; response < NUM_RESPONSES; ++response) {
         const std::string name = "D_" + response_code(E_STATUS, response);
         flat.number(name, name, [&study, response](std::size_t i) {
@@ -264,7 +266,9 @@ void write_json(const PatchStudy &study, const Sink &sink)
                 {"illuminant", name_of(study.illuminant)},
                 {"illuminant_by", study.illuminant.by},
                 {"status", status_name(study.status)},
-                {"paper", study.paper},
+                {"warnings", study.warnings},
+                {"paper", name_json(study.paper)},
+                {"paper_chosen", study.paper.reason},
                 {"patch", patch_json(study.patch, study.status)},
                 {"brightness", or_null(study.as_paper.brightness)},
                 {"whiteness", or_null(study.as_paper.whiteness)}};

@@ -9,6 +9,8 @@ namespace vantrel::sheets {
 
 Json lab_json(const CIELABCOORD &lab) { return {lab.L, lab.a, lab.b}; }
 
+Json name_json(const PaperChoice &paper) { return paper.exists() ? Json(paper.name) : Json(); }
+
 void add_reading(Json &object, const DensityReading &reading, int status)
 {
     object["response"] = reading.response ? Json(response_name(status, *reading.response)) : Json();
@@ -26,7 +28,7 @@ Json patch_json(const PatchReport &patch, int status)
             {"rgb", hex(patch.colour.rgb)},
             {"lab", lab_json(patch.colour.lab)},
             {"lch", {patch.lch.L, patch.lch.C, patch.lch.h}},
-            {"de00_to_paper", patch.to_paper},
+            {"de00_to_paper", or_null(patch.to_paper)},
             {"response", patch.response ? Json(response_name(status, *patch.response)) : Json()},
             {"response_id", or_null(patch.response)},
             {"density", or_null(patch.density)},

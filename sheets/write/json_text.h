@@ -3,6 +3,7 @@
 
 #include "judge/colour.h"
 #include "judge/densitometer.h"
+#include "judge/paper.h"
 #include "write/sink.h"
 
 #include <nlohmann/json.hpp>
@@ -25,6 +26,8 @@ template <typename Value> Json or_null(const std::optional<Value> &value)
 struct PatchReport; // judge/report.h
 
 Json lab_json(const CIELABCOORD &lab);
+
+Json name_json(const PaperChoice &paper); // null where there is none
 
 // Adds `response` and `density`.
 void add_reading(Json &object, const DensityReading &reading, int status);

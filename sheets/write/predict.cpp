@@ -107,7 +107,7 @@ void write_table(const Predictions &predictions, const Sink &sink, const TableSt
         width = std::max(width, characters(title(prediction)));
     Lines lines(sink);
     lines.add(fmt::format("{}: {}, on {}", predictions.file, said(predictions.illuminant),
-                          cut(predictions.paper, kWidestName)));
+                          said(predictions.paper)));
     if (predictions.all.size() == 1)
         lines.add(inks_of(predictions.all[0], kWidestInText));
     const std::string gap = colour ? "    " : "";
@@ -146,7 +146,9 @@ void write_json(const Predictions &predictions, const Sink &sink)
         {"illuminant", name_of(predictions.illuminant)},
         {"illuminant_by", predictions.illuminant.by},
         {"status", status_name(predictions.status)},
-        {"paper", predictions.paper},
+        {"warnings", predictions.warnings},
+        {"paper", name_json(predictions.paper)},
+        {"paper_chosen", predictions.paper.reason},
         {"left_out", predictions.left_out},
     };
     write_with_array(
@@ -176,7 +178,7 @@ std::vector<Flat> flat_of(const Predictions &predictions)
     };
     Flat flat;
     flat.description = fmt::format("Predictions from {}: {}, on {}", predictions.file,
-                                   name_of(predictions.illuminant), predictions.paper);
+                                   name_of(predictions.illuminant), said(predictions.paper));
     flat.rows = 2 * all.size();
     flat.text("file", "", [&predictions](std::size_t) { return predictions.file; });
     flat.text("name", "SAMPLE_NAME", [&all, model](std::size_t i) {
@@ -210,6 +212,7 @@ std::vector<Flat> flat_of(const Predictions &predictions)
     flat.number("measured_density", "MEASURED_DENSITY", [measured](std::size_t i) {
         return measured(i) ? measured(i)->reading.density : std::nullopt;
     });
+    flat.text("paper", "PAPER", [&predictions](std::size_t) { return said(predictions.paper); });
     flat.spectrum([estimate](std::size_t i) -> const Spectrum & { return estimate(i).refl; });
     return {flat};
 }

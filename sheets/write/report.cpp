@@ -41,12 +41,17 @@ std::string spectra_of(const Source &source)
 
 void add_head(Lines &lines, const Report &report)
 {
-    const std::string paper = cut(report.paper.name, kWidestInText);
     lines.add(fmt::format("{}: {} {}", report.file, report.patches.size(),
                           report.patches.size() == 1 ? "patch" : "patches"));
-    lines.add(fmt::format("{}, {}, ΔE00 and density over {}, dot area with n = {:g}",
-                          said(report.illuminant), status_name(report.status), paper,
-                          report.n_factor));
+    const PaperChoice &paper = report.paper.choice;
+    lines.add(
+        paper.exists()
+            ? fmt::format("{}, {}, ΔE00 and density over {}, dot area with n = {:g}",
+                          said(report.illuminant), status_name(report.status), said(paper),
+                          report.n_factor)
+            : fmt::format("{}, {}, densities {}: ΔE00 to it, dot area and gain, contrast,\nhue "
+                          "error, grayness and trap are left out",
+                          said(report.illuminant), status_name(report.status), over(paper)));
     lines.add(report.source.bands ? spectra_of(report.source) : "Colours alone, no spectra");
 }
 
@@ -60,8 +65,9 @@ void add_patches(Lines &lines, const Report &report, std::size_t width, bool col
         const CIELABCOORD &lab = patch.colour.lab;
         std::string line = fmt::format("{:<{}} {}", cut(patch.name, kWidestName), width,
                                        colour ? swatch(patch.colour.rgb) : "");
-        for (const double value : {lab.L, lab.a, lab.b, patch.lch.C, patch.lch.h, patch.to_paper})
+        for (const double value : {lab.L, lab.a, lab.b, patch.lch.C, patch.lch.h})
             line += fmt::format("{:>8}", fixed(value));
+        line += fmt::format("{:>8}", fixed(patch.to_paper));
         lines.add(line +
                   fmt::format("{:>4}{:>7}{:>7}{:>7}",
                               patch.response ? response_code(report.status, *patch.response) : "",
@@ -73,17 +79,21 @@ void add_patches(Lines &lines, const Report &report, std::size_t width, bool col
 void add_paper(Lines &lines, const Report &report)
 {
     const PaperReport &paper = report.paper;
+    if (!paper.lab)
+        return;
     lines.add("");
     lines.add(
         fmt::format("Paper: brightness {}, whiteness {}, L*a*b* {}",
                     paper.brightness ? fixed(paper.brightness) : "none",
                     paper.whiteness ? fixed(paper.whiteness) : "none (" + paper.no_whiteness + ")",
-                    fixed(paper.lab)));
+                    fixed(*paper.lab)));
     if (const auto &metamerism = report.metamerism)
-        lines.add(fmt::format("Metamerism against {}: {} (ΔE*ab under {} plus {}), DIN 6172 {}",
-                              cut(metamerism->paper, kWidestInText), fixed(metamerism->sum),
-                              name_of(report.illuminant), name_of(metamerism->illuminant),
-                              fixed(metamerism->din6172)));
+        lines.add(fmt::format("Against {}{}: ΔE00 {}, metamerism {} (ΔE*ab under {} plus {}), DIN "
+                              "6172 {}",
+                              metamerism->file.empty() ? "" : metamerism->file + ": ",
+                              said(metamerism->paper), fixed(metamerism->de00),
+                              fixed(metamerism->sum), name_of(report.illuminant),
+                              name_of(metamerism->illuminant), fixed(metamerism->din6172)));
 }
 
 struct BlockColumn {
@@ -168,15 +178,19 @@ Json paper_json(const Report &report)
 {
     const PaperReport &paper = report.paper;
     Json out = {
-        {"name", paper.name},
-        {"lab", lab_json(paper.lab)},
+        {"name", name_json(paper.choice)},
+        {"chosen", paper.choice.reason},
+        {"lab", paper.lab ? lab_json(*paper.lab) : Json()},
         {"brightness", or_null(paper.brightness)},
         {"whiteness", or_null(paper.whiteness)},
     };
     if (!paper.whiteness)
         out["no_whiteness"] = paper.no_whiteness;
     if (const auto &metamerism = report.metamerism)
-        out["metamerism"] = {{"paper", metamerism->paper},
+        out["metamerism"] = {{"file", metamerism->file.empty() ? report.file : metamerism->file},
+                             {"paper", metamerism->paper.name},
+                             {"chosen", metamerism->paper.reason},
+                             {"de00", metamerism->de00},
                              {"illuminant", name_of(metamerism->illuminant)},
                              {"sum", metamerism->sum},
                              {"din6172", metamerism->din6172}};
@@ -202,6 +216,7 @@ void write_sheet(const Report &report, const Sink &sink)
 {
     const Json head = {
         {"file", report.file},
+        {"warnings", report.warnings},
         {"illuminant", name_of(report.illuminant)},
         {"illuminant_by", report.illuminant.by},
         {"status", status_name(report.status)},
@@ -248,9 +263,9 @@ Flat flat_of(const Report &report)
 {
     const std::vector<PatchReport> &patches = report.patches;
     Flat flat;
-    flat.description = fmt::format("Report of {}: {}, {} over {}, n = {:g}", report.file,
-                                   name_of(report.illuminant), status_name(report.status),
-                                   report.paper.name, report.n_factor);
+    flat.description =
+        fmt::format("Report of {}: {}, {} {}, n = {:g}", report.file, name_of(report.illuminant),
+                    status_name(report.status), over(report.paper.choice), report.n_factor);
     flat.rows = patches.size();
     flat.text("file", "", [&report](std::size_t) { return report.file; });
     flat.text("id", "SAMPLE_ID", [&patches](std::size_t i) { return patches[i].id; });
@@ -275,6 +290,7 @@ Flat flat_of(const Report &report)
                 [&patches](std::size_t i) { return patches[i].hue_error; });
     flat.number("grayness", "GRAYNESS", [&patches](std::size_t i) { return patches[i].grayness; });
     flat.number("trap", "TRAP", [&patches](std::size_t i) { return patches[i].trap; });
+    flat.text("paper", "PAPER", [&report](std::size_t) { return said(report.paper.choice); });
     if (patches.front().refl)
         flat.spectrum([&patches](std::size_t i) -> const Spectrum & { return *patches[i].refl; });
     return flat;

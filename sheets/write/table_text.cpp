@@ -1,6 +1,7 @@
 #include "write/table_text.h"
 
 #include "read/illuminant.h"
+#include "read/text.h"
 
 #include <fmt/format.h>
 
@@ -20,6 +21,17 @@ std::string fixed(const std::optional<double> &value, int decimals)
 std::string fixed(const CIELABCOORD &lab)
 {
     return fmt::format("{} {} {}", fixed(lab.L), fixed(lab.a), fixed(lab.b));
+}
+
+std::string said(const PaperChoice &paper)
+{
+    return fmt::format("{} ({})", paper.exists() ? cut(paper.name, kWidestInText) : "no paper",
+                       paper.reason);
+}
+
+std::string over(const PaperChoice &paper)
+{
+    return (paper.exists() ? "over " : "absolute, ") + said(paper);
 }
 
 std::string said(const IlluminantChoice &choice)

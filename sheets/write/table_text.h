@@ -2,6 +2,7 @@
 #pragma once
 
 #include "judge/colour.h"
+#include "judge/paper.h"
 #include "judge/stated.h"
 #include "write/sink.h"
 
@@ -17,6 +18,12 @@ constexpr std::size_t kWidestInText = 30; // a line has 120 columns
 // Without a minus before zero; nothing stays blank.
 std::string fixed(const std::optional<double> &value, int decimals = 2);
 std::string fixed(const CIELABCOORD &lab); // L*, a*, b* with spaces between
+
+// "Paper (without ink)", "no paper (transmission)"
+std::string said(const PaperChoice &paper);
+
+// Of densities: "over Paper (without ink)", "absolute, no paper (transmission)"
+std::string over(const PaperChoice &paper);
 
 std::string said(const IlluminantChoice &choice); // with "as the file says" where it does
 

@@ -5,7 +5,9 @@
 #include "progress.h"
 
 #include <cmath>
+#include <filesystem>
 #include <memory>
+#include <system_error>
 
 namespace vantrel::program {
 namespace {
@@ -18,17 +20,38 @@ struct ReportOptions : Options {
     std::string second_illuminant; // its default follows the first
 };
 
+// NAME, or FILE:NAME where there is such a file.
+struct SecondPaper {
+    std::optional<Measurement> sheet;
+    std::string name;
+};
+
+SecondPaper second_paper_of(const ReportOptions &options)
+{
+    const std::string &text = options.second_paper;
+    for (std::size_t colon = text.rfind(':'); colon != std::string::npos && colon > 0;
+         colon = text.rfind(':', colon - 1)) {
+        const std::string path = text.substr(0, colon);
+        std::error_code error;
+        if (std::filesystem::is_regular_file(path, error))
+            return {sheet_of(path, options, true), text.substr(colon + 1)};
+    }
+    return {std::nullopt, text};
+}
+
 Outcome run(const ReportOptions &options)
 {
     if (!(options.n_factor > 0) || !std::isfinite(options.n_factor))
         throw RequestError{"--n-factor takes a number above 0"};
+    const SecondPaper second = second_paper_of(options);
     const ReportRequest request{
         .illuminant = optional_illuminant(options.illuminant),
         .status = status_of(options.status),
         .paper = options.paper,
         .n_factor = options.n_factor,
         .order = options.order,
-        .second_paper = options.second_paper,
+        .second_paper = second.name,
+        .second_sheet = second.sheet ? &*second.sheet : nullptr,
         .second_illuminant = optional_illuminant(options.second_illuminant),
         .tell = progress_bar(),
     };
@@ -70,8 +93,10 @@ Command add_report(CLI::App &app)
     add_order_option(*command, options->order);
     command->add_option("--n-factor", options->n_factor, "Yule-Nielsen factor of the dot areas")
         ->capture_default_str();
-    command->add_option("--second-paper", options->second_paper,
-                        "Patch to tell the paper's metamerism against, by name or id");
+    command->add_option(
+        "--second-paper", options->second_paper,
+        "Paper to compare with, by name or id, or FILE:NAME for one of another file "
+        "(FILE: for its paper): colour difference and metamerism");
     command->add_option("--second-illuminant", options->second_illuminant,
                         "Illuminant of that metamerism beside --illuminant (default: A_2DEG or "
                         "A_10DEG, beside these D65_2DEG or D65_10DEG)");

@@ -33,8 +33,10 @@ void add_sheet_options(CLI::App &command, Options &options)
             illuminant_names());
     command.add_option("--status", options.status, "Density status: " + status_names())
         ->capture_default_str();
-    command.add_option("--paper", options.paper,
-                       "The paper's patch by name or id (default: the first patch)");
+    command.add_option(
+        "--paper", options.paper,
+        "The paper's patch by name or id, or none for absolute densities (default: the mean "
+        "of the patches without ink, or else the lightest)");
     command
         .add_option("--scale", options.scale,
                     "Scale of a file's reflectances: auto, percent, or fraction for 0 to 1")

@@ -1,7 +1,7 @@
 // vantrel compare: the verdict, and the pairs that it rests on.
 
 import { histogramPlot, mostPoints, picture, planePlot } from './charts.js';
-import { colourOf, count, figures, fixed, h, named, smallTable, spread, swatch,
+import { chosenPaper, colourOf, count, figures, fixed, h, named, smallTable, spread, swatch,
   warnings } from './dom.js';
 import { spectraPicture, swatches } from './report.js';
 import { searchTable } from './table.js';
@@ -21,6 +21,12 @@ function verdict(result) {
     result.corrected?.verdict
       ? h('p', {}, `Substrate-corrected: ${result.corrected.verdict}.`) : null);
 }
+
+const papersNote = ({ reference, sample, papers }) => h('p', { class: 'note' },
+  'Paper of the reference: ', chosenPaper(reference.paper, reference.paper_chosen),
+  '; of the sample: ', chosenPaper(sample.paper, sample.paper_chosen),
+  papers ? `; between them ΔE00 ${fixed(papers.de00)}` +
+    (papers.metamerism === null ? '' : `, metamerism ${fixed(papers.metamerism)}`) : '', '.');
 
 // The widest of the means of several measurements.
 function repeats(result) {
@@ -131,6 +137,7 @@ export function comparePage(result) {
   return [
     overview(result),
     verdict(result),
+    papersNote(result),
     warnings(result.warnings),
     formulas.length === 1 ? figures([
       [`${labelOf(formula)} mean`, fixed(mean)],

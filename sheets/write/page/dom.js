@@ -48,6 +48,10 @@ export function smallTable(caption, columns, rows) {
       h('tr', {}, columns.map((column) => cell('td', column, column.text(row))))))));
 }
 
+// Which patch stands for the paper, and why.
+export const chosenPaper = (name, reason) =>
+  [name === null ? 'no paper' : named(name), ` (${reason})`];
+
 // What the program warned of, line by line.
 export const warnings = (lines) => (lines.length
   ? h('ul', { class: 'note' }, lines.map((line) => h('li', {}, named(line)))) : null);

@@ -1,7 +1,8 @@
 // vantrel ink: one patch, under every status and illuminant, and beside another one.
 
 import { legend, picture, weightsPlot } from './charts.js';
-import { colourOf, figures, fixed, h, named, smallTable, swatch, triple } from './dom.js';
+import { chosenPaper, colourOf, figures, fixed, h, named, smallTable, swatch, triple,
+  warnings } from './dom.js';
 import { spectraPicture } from './report.js';
 
 const number = (label, value, decimals = 2) =>
@@ -13,7 +14,8 @@ function keyFigures({ patch, against, illuminant, ...result }) {
   return figures([
     ['L*a*b*', triple(patch.lab), illuminant],
     ['C* and h', `${fixed(patch.lch[1])}  ${fixed(patch.lch[2])}°`],
-    ['ΔE00 to the paper', fixed(patch.de00_to_paper), named(result.paper)],
+    ['ΔE00 to the paper', fixed(patch.de00_to_paper),
+      chosenPaper(result.paper, result.paper_chosen)],
     ['Density', fixed(patch.density, 3), `${patch.response ?? ''}, ${result.status}`],
     ...optional.filter(([, field]) => patch[field] !== null)
       .map(([label, field]) => [label, fixed(patch[field])]),
@@ -23,9 +25,9 @@ function keyFigures({ patch, against, illuminant, ...result }) {
   ]);
 }
 
-function densityTable({ statuses }) {
+function densityTable({ statuses, paper }) {
   const responses = [...new Set(statuses.flatMap((status) => Object.keys(status.densities)))];
-  return smallTable('Densities over the paper', [
+  return smallTable(paper === null ? 'Absolute densities' : 'Densities over the paper', [
     { label: 'Status', text: (row) => row.status },
     { label: 'Read by', text: (row) => row.response ?? '–' },
     number('Density', (row) => row.density, 3),
@@ -66,6 +68,7 @@ export function inkPage(result) {
       h('p', { class: 'about' }, named(result.file), ` · id `, named(patch.id), ' · ',
         Object.entries(patch.device).map(([ink, percent]) => `${ink} ${percent}`).join(' '))),
     keyFigures(result),
+    warnings(result.warnings),
     h('div', { class: 'pictures' },
       spectraPicture(series, () => `${fixed(patch.refl[0])} % at 400 nm, ${fixed(patch.refl[30])} ` +
         `% at 700 nm${against ? `; broken line ${against.name}` : ''}.`).element,

@@ -1,6 +1,6 @@
 // vantrel predict: what two models expect of each combination, beside the measurement.
 
-import { colourOf, count, fixed, h, named } from './dom.js';
+import { chosenPaper, colourOf, count, fixed, h, named, warnings } from './dom.js';
 import { searchTable } from './table.js';
 
 const nameOf = (prediction) => prediction.measured?.name ??
@@ -16,7 +16,9 @@ export function predictPage(result) {
   return [
     h('h1', {}, 'Predicted overprints'),
     h('p', { class: 'about' }, named(result.file), ` · ${result.illuminant} · on `,
-      named(result.paper), ` · ${count(result.predictions.length, 'combination')}`),
+      chosenPaper(result.paper, result.paper_chosen),
+      ` · ${count(result.predictions.length, 'combination')}`),
+    warnings(result.warnings),
     result.left_out ? h('p', { class: 'note' }, `Left out: ${count(result.left_out, 'overprint')} ` +
       'of more than three inks, of fractions of a percent, or without a solid.') : null,
     searchTable({

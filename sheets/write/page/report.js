@@ -2,7 +2,8 @@
 
 import { histogramPlot, legend, mostPoints, picture, planePlot, spectraPlot, tonePlot }
   from './charts.js';
-import { colourOf, count, figures, fixed, h, named, smallTable, spread, swatch, triple } from './dom.js';
+import { chosenPaper, colourOf, count, figures, fixed, h, named, smallTable, spread, swatch, triple,
+  warnings } from './dom.js';
 import { searchTable } from './table.js';
 
 const mostSwatches = 2000;
@@ -50,12 +51,17 @@ function keyFigures(sheet, solids) {
   const gain = largest(sheet.patches, 'dot_gain');
   const contrast = largest(sheet.patches, 'print_contrast');
   return figures([
-    ['Paper L*a*b*', triple(paper.lab), named(paper.name)],
-    ['Brightness', fixed(paper.brightness), 'percent'],
-    ['Whiteness', fixed(paper.whiteness), paper.whiteness === null ? paper.no_whiteness : 'ASTM E313'],
+    ...(paper.lab ? [
+      ['Paper L*a*b*', triple(paper.lab), chosenPaper(paper.name, paper.chosen)],
+      ['Brightness', fixed(paper.brightness), 'percent'],
+      ['Whiteness', fixed(paper.whiteness),
+        paper.whiteness === null ? paper.no_whiteness : 'ASTM E313'],
+    ] : [['Paper', 'none', `${paper.chosen}; densities are absolute, and what is relative to a ` +
+      'paper is left out']]),
     paper.metamerism && ['Metamerism', fixed(paper.metamerism.sum),
-      ['to ', named(paper.metamerism.paper), ` under ${paper.metamerism.illuminant}; DIN 6172 ` +
-        fixed(paper.metamerism.din6172)]],
+      ['to ', chosenPaper(paper.metamerism.paper, paper.metamerism.chosen),
+        ' of ', named(paper.metamerism.file), ` under ${paper.metamerism.illuminant}; DIN 6172 ` +
+        `${fixed(paper.metamerism.din6172)}, ΔE00 ${fixed(paper.metamerism.de00)}`]],
     ...[...solids].slice(0, 8).map(([ink, solid]) =>
       [['Density ', swatch(colourOf(solid))], fixed(solid.density, 3),
         [named(solidName(ink, solid.name)), solid.response ? `, ${solid.response}` : '']]),
@@ -181,8 +187,7 @@ function columnsOf(sheet) {
 function sheetSection(sheet, id, heading) {
   const solids = solidsOf(sheet);
   const curves = toneCurves(sheet, solids);
-  const paperPatch = sheet.patches.find((patch) =>
-    patch.name === sheet.paper.name && patch.de00_to_paper === 0);
+  const paperPatch = sheet.patches.find((patch) => patch.name === sheet.paper.name);
   const always = new Set([paperPatch, ...solids.values()].filter(Boolean));
   const thinned = [...always, ...spread(sheet.patches.filter((patch) => !always.has(patch)),
     mostPoints)];
@@ -195,15 +200,17 @@ function sheetSection(sheet, id, heading) {
     ...[...solids].slice(0, 12).map(([ink, solid]) =>
       ({ ...solid, colour: colourOf(solid), name: solidName(ink, solid.name) })),
   ];
-  const spectra = spectraPicture(series, () => 'The paper (broken line)' +
-    `${solids.size ? ` and ${count(solids.size, 'solid')}` : ''}; choose patches in the table ` +
-    'to see theirs.');
+  const spectra = spectraPicture(series, () => [
+    paperPatch ? 'The paper (broken line)' : '', solids.size ? count(solids.size, 'solid') : '',
+  ].filter(Boolean).join(' and ') + `${paperPatch || solids.size ? '; c' : 'C'}hoose patches in ` +
+    'the table to see theirs.');
   const plane = picture('a*b* plane', (width) => planePlot(points(), sheet.paper.lab)(width),
     () => (thinned.length < sheet.patches.length
       ? `${count(thinned.length, 'patch')} of ${sheet.patches.length.toLocaleString('en')}, ` +
         'evenly spread. ' : '') +
-      `The diamond is the paper, a* ${fixed(sheet.paper.lab[1])}, b* ${fixed(sheet.paper.lab[2])}.`);
-  const distances = picture('ΔE00 to the paper',
+      (sheet.paper.lab ? `The diamond is the paper, a* ${fixed(sheet.paper.lab[1])}, ` +
+        `b* ${fixed(sheet.paper.lab[2])}.` : ''));
+  const distances = sheet.paper.lab && picture('ΔE00 to the paper',
     histogramPlot(sheet.patches.map((patch) => patch.de00_to_paper), 'ΔE00'),
     () => `Largest ${fixed(farthest.de00_to_paper)}, ${farthest.name}.`);
   const { source } = sheet;
@@ -223,11 +230,12 @@ function sheetSection(sheet, id, heading) {
         source.scaled_to_percent ? 'brought to percent' : null,
       ].filter(Boolean).join(' · '))),
     keyFigures(sheet, solids),
+    warnings(sheet.warnings),
     swatches(sheet.patches.map((patch) => ({ name: patch.name, colour: colourOf(patch) })),
       'In the order of the file, as a screen can show them.'),
     h('div', { class: 'pictures' }, source.bands ? spectra.element : null,
       ...(curves.length ? tonePictures(curves) : []),
-      plane.element, distances.element, attributeTables(sheet)),
+      plane.element, distances?.element, attributeTables(sheet)),
     searchTable({
       caption: 'All patches', noun: 'patch', columns: columnsOf(sheet), rows: sheet.patches,
       colour: colourOf, text: (patch) => `${patch.name} ${patch.id}`,
@@ -246,7 +254,7 @@ export function reportPage({ sheets }) {
     smallTable('Sheets', [
       { label: 'Sheet', text: ([sheet, i]) => h('a', { href: `#sheet-${i}` }, named(sheet.file)) },
       { label: 'Patches', number: true, text: ([sheet]) => sheet.patches.length.toLocaleString('en') },
-      { label: 'Paper L*a*b*', number: true, text: ([sheet]) => triple(sheet.paper.lab) },
+      { label: 'Paper L*a*b*', number: true, text: ([sheet]) => (sheet.paper.lab ? triple(sheet.paper.lab) : '–') },
       { label: 'Largest gain', number: true,
         text: ([sheet]) => fixed(largest(sheet.patches, 'dot_gain')?.dot_gain) },
     ], sheets.map((sheet, i) => [sheet, i])));
