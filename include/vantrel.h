@@ -407,7 +407,8 @@ VANTREL_API int VerbalColorDifference(const double *standard, const double *samp
 /**
  * The filters: the weight of each band for every status and response. A row of a filter sums to
  * 100 000 within rounding; a row that a status does not have is zero. Densities read it at the
- * moment of the call; SetHiFiConstants() and SetHexachromeConstants() rewrite rows of it.
+ * moment of the call; SetHiFiConstants() and SetHexachromeConstants() rewrite rows of it. A program
+ * that defines a den_weight of its own puts it in place of this one.
  */
 extern VANTREL_API int64_t den_weight[NUM_STATUSES][NUM_RESPONSES][VANTREL_BANDS];
 

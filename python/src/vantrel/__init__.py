@@ -143,8 +143,8 @@ from ._constants import (
     set_spectralx_constants,
     settings,
 )
+from ._resample import resample
 from ._sheet import Origin, Sheet, Source, read, reads
-from ._wavelengths import resample
 
 __version__ = ufuncs.version
 __all__ = [name for name in dir() if not name.startswith("_")]  # what help() lists

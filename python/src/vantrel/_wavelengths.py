@@ -133,39 +133,3 @@ def numbers_of_pandas(value):
         return value.to_numpy(dtype=np.float64, na_value=np.nan)  # of the types with missing values
     except (TypeError, ValueError):
         return array
-
-
-def resample(values, wavelengths):
-    """Spectra at 400, 410, ... 700 nm out of values at wavelengths of their own.
-
-    The wavelengths, in nm and in any order, are evenly spaced, 10 nm apart or finer, from 400 to
-    700 nm at least. A band is the mean of the values less than 10 nm away, weighted by a triangle,
-    the passband of spectral data at 10 nm (ISO 13655); of steps of 10 nm it is the value itself.
-
-    Parameters
-    ----------
-    values : array_like (..., n)
-        Spectra, in percent.
-    wavelengths : array_like (n,)
-        Where they lie, in nm.
-
-    Returns
-    -------
-    spectra : array (..., 31)
-
-    Raises
-    ------
-    ValueError
-        Where the wavelengths do not give every band.
-
-    Examples
-    --------
-    >>> vantrel.resample(np.arange(36.0), np.arange(380, 731, 10))[:3]
-    array([2., 3., 4.])
-    """
-    from ._arguments import as_array, warn_of_fractions
-
-    array = as_array(values, "values")
-    array = to_bands(array if hasattr(array, "shape") else np.asarray(array), wavelengths, "values")
-    warn_of_fractions([array], 3)
-    return array
