@@ -1,8 +1,10 @@
 #include "read/text.h"
 
 #include <algorithm>
+#include <cerrno>
 #include <charconv>
 #include <cmath>
+#include <cstdlib>
 
 namespace vantrel::sheets {
 namespace {
@@ -60,6 +62,27 @@ void append_utf8(std::string &out, char32_t c)
     }
 }
 
+// The decimal number that the whole text is; otherwise not finite.
+double decimal(std::string_view text)
+{
+#ifdef __cpp_lib_to_chars
+    double value = 0;
+    const char *end = text.data() + text.size();
+    const auto [last, error] = std::from_chars(text.data(), end, value);
+    return last == end && error == std::errc() ? value : NAN;
+#else // libc++ has from_chars() of integers alone
+    if (text.empty() || text[0] == '+' ||
+        text.find_first_not_of("0123456789.eE+-") != std::string_view::npos)
+        return NAN;
+    const std::string number(text);
+    char *last = nullptr;
+    errno = 0;
+    const double value = std::strtod(number.c_str(), &last);
+    const bool underflow = value == 0 && errno == ERANGE;
+    return *last == '\0' && !underflow ? value : NAN;
+#endif
+}
+
 } // namespace
 
 std::string upper(std::string_view text)
@@ -96,10 +119,8 @@ std::optional<double> number_in(std::string_view text)
     text = trimmed(text);
     if (text.size() > 1 && text[0] == '+' && text[1] != '-')
         text.remove_prefix(1);
-    double value = 0;
-    const char *end = text.data() + text.size();
-    const auto [last, error] = std::from_chars(text.data(), end, value);
-    if (last == end && error == std::errc() && std::isfinite(value))
+    const double value = decimal(text);
+    if (std::isfinite(value))
         return value;
     const auto comma = text.find(',');
     if (comma == std::string_view::npos || text.find('.') != std::string_view::npos)

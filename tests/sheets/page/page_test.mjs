@@ -86,6 +86,13 @@ test('rows are sorted, searched, paged, and all printed', async () => {
   await page.close();
 });
 
+test('swatches are spread over all of many patches', async () => {
+  const page = await open('(echo name,$(seq -s, 400 10 700); seq 3000 | sed "s/$/,$(seq -s, 31)/") ' +
+    '> many.csv; vantrel report many.csv');
+  assert.equal(await page.locator('.mosaic .swatch').last().getAttribute('title'), '2999');
+  await page.close();
+});
+
 test('a chosen patch joins the spectra', async () => {
   const page = await open('vantrel report two_ink_halftone.txt');
   const legend = () => page.locator('.legend').first().locator('bdi').allInnerTexts();
