@@ -1,5 +1,6 @@
 #pragma once
 
+#include "base/lanes.h"
 #include "base/spectrum.h"
 #include "colorimetry/tristimulus_weights.h"
 
@@ -27,7 +28,7 @@ template <class V> XyzOf<V> xyz_from_bands(const BandsOf<V> &refl, TristimulusWe
 }
 
 // GCC for Windows does not align the stack for such vectors.
-#if defined(__x86_64__) && defined(__GNUC__) && !defined(_WIN32)
+#if VANTREL_LANES >= 4 && defined(__x86_64__) && !defined(_WIN32)
 #define VANTREL_AVX2
 #endif
 
