@@ -8,36 +8,21 @@
 
 namespace {
 
-constexpr npy_intp kTogether = 256; ///< rows that are looked at before they are computed
+/// Rows that are looked at, and stay near, before they are computed.
+constexpr npy_intp kTogether = 128;
 
 struct Rows {
     std::bitset<kTogether> unknown, infinite; ///< those with a not-a-number, with an infinity
     bool any = false;
 };
 
-/// x - x is 0, or not a number where x is not finite.
-bool all_finite(const double *values, npy_intp count)
-{
-    double sums[8] = {};
-    npy_intp i = 0;
-    for (; i + 8 <= count; i += 8)
-        for (npy_intp k = 0; k < 8; ++k)
-            sums[k] += values[i + k] - values[i + k];
-    for (; i < count; ++i)
-        sums[0] += values[i] - values[i];
-    for (const double sum : sums)
-        if (sum != 0)
-            return false;
-    return true;
-}
-
-void look_at(Operand operand, npy_intp rows, Rows &found)
+void look_at(const Guard &guard, Operand operand, npy_intp rows, Rows &found)
 {
     const npy_intp size = operand.size(), bytes = size * npy_intp(sizeof(double));
-    if (operand.side_by_side(sizeof(double))) {
+    if (guard.all_finite && operand.side_by_side(sizeof(double))) {
         const npy_intp apart = operand.step == 0 ? 1 : rows;
         if ((apart == 1 || operand.step == bytes) &&
-            all_finite(reinterpret_cast<const double *>(operand.row), apart * size))
+            guard.all_finite(reinterpret_cast<const double *>(operand.row), apart * size))
             return;
     }
     for (npy_intp n = 0; n < rows; ++n, operand.row += operand.step)
@@ -85,6 +70,24 @@ void make_missing(const Operand &operand, int type)
     }
 }
 
+/// Whether several rows at a time have been computed; they all succeed then.
+bool side_by_side(const Guard &guard, char **rows, const npy_intp *dimensions,
+                  const npy_intp *steps)
+{
+    if (!guard.lanes)
+        return false;
+    Operand operands[Layout::kOperands];
+    const int count = static_cast<int>(guard.types.size());
+    for (int i = 0; i < count; ++i)
+        place(operands[i], guard.layout, i, rows, dimensions, steps);
+    if (!guard.lanes(operands, dimensions[0]))
+        return false;
+    if (guard.layout.flags)
+        for (npy_intp n = 0; n < dimensions[0]; ++n)
+            *reinterpret_cast<npy_bool *>(rows[count - 1] + n * steps[count - 1]) = true;
+    return true;
+}
+
 } // namespace
 
 void guarded(char **rows, const npy_intp *dimensions, const npy_intp *steps, void *data)
@@ -109,8 +112,9 @@ void guarded(char **rows, const npy_intp *dimensions, const npy_intp *steps, voi
         Rows found;
         for (int i = 0; i < guard.inputs; ++i)
             if (guard.types[i] == NPY_DOUBLE)
-                look_at(operand(i, 0), sizes[0], found);
-        guard.loop(at, sizes, steps, &guard.layout);
+                look_at(guard, operand(i, 0), sizes[0], found);
+        if (!side_by_side(guard, at, sizes, steps))
+            guard.loop(at, sizes, steps, &guard.layout);
         for (npy_intp n = 0; found.any && n < sizes[0]; ++n) {
             bool missing = found.unknown[n];
             for (int i = guard.inputs; i < operands; ++i)

@@ -2,12 +2,15 @@
 // what is no reading.
 #pragma once
 
+#include "lanes/lanes.h"
 #include "loop.h"
 
 #include <string>
 
 struct Guard {
     decltype(Row::loop) loop = nullptr;
+    decltype(LaneLoop::run) lanes = nullptr; ///< several rows side by side, where it can
+    decltype(LaneLoops::all_finite) all_finite = nullptr;
     Layout layout = {};
     int inputs = 0;
     int core_dimensions = 0; ///< of different names

@@ -114,11 +114,15 @@ struct Ufunc {
 };
 
 /// Adds the ufunc of a row, or its second one, whose last output tells which rows succeeded.
-bool add_ufunc(PyObject *module, const Row &row, bool flags)
+bool add_ufunc(PyObject *module, const Row &row, bool flags, const LaneLoops &lanes)
 {
     auto *kept = new Ufunc{row.name, row.signature};
     Guard &guard = kept->guard;
     guard.loop = row.loop;
+    guard.all_finite = lanes.all_finite;
+    for (const LaneLoop &loop : lanes.loops)
+        if (std::strcmp(loop.name, row.name) == 0)
+            guard.lanes = loop.run;
     guard.inputs = row.inputs;
     guard.types = {row.types, size_t(row.inputs + row.outputs)};
     if (flags) {
@@ -145,12 +149,14 @@ bool add_ufunc(PyObject *module, const Row &row, bool flags)
     return PyModule_AddObject(module, kept->name.c_str(), object) == 0;
 }
 
-bool add_rows(PyObject *module, PyObject *c_names, std::span<const Row> rows)
+bool add_rows(PyObject *module, PyObject *c_names, std::span<const Row> rows,
+              const LaneLoops &lanes)
 {
     for (const Row &row : rows) {
         PyObject *c_name = PyUnicode_FromString(row.c_name);
         if (!c_name || PyDict_SetItemString(c_names, row.name, c_name) < 0 ||
-            !add_ufunc(module, row, false) || (row.refuses && !add_ufunc(module, row, true)))
+            !add_ufunc(module, row, false, lanes) ||
+            (row.refuses && !add_ufunc(module, row, true, lanes)))
             return false;
         Py_DECREF(c_name);
     }
@@ -179,13 +185,19 @@ PyMODINIT_FUNC PyInit__ufuncs() // NOLINT(bugprone-reserved-identifier,cert-*)
 {
     import_array();
     import_umath();
+    const char *fault = nullptr;
+    const LaneLoops lanes = lane_loops(fault);
+    if (fault) {
+        PyErr_SetString(PyExc_ImportError, fault);
+        return nullptr;
+    }
     static PyModuleDef definition = {
         PyModuleDef_HEAD_INIT, "_ufuncs", nullptr, -1, methods, nullptr, nullptr, nullptr, nullptr};
     PyObject *module = PyModule_Create(&definition);
     PyObject *c_names = PyDict_New();
-    if (module && c_names && add_rows(module, c_names, colour_rows()) &&
-        add_rows(module, c_names, density_rows()) && add_words(module) && add_den_weight(module) &&
-        PyModule_AddObject(module, "c_names", c_names) == 0 &&
+    if (module && c_names && add_rows(module, c_names, colour_rows(), lanes) &&
+        add_rows(module, c_names, density_rows(), lanes) && add_words(module) &&
+        add_den_weight(module) && PyModule_AddObject(module, "c_names", c_names) == 0 &&
         PyModule_AddStringConstant(module, "version", VANTREL_VERSION) == 0) {
 #ifdef Py_GIL_DISABLED
         PyUnstable_Module_SetGIL(module, Py_MOD_GIL_NOT_USED);

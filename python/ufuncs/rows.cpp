@@ -1,7 +1,7 @@
 // Colours, colour differences, paper and inks.
 #include "rows.h"
-#include "many_xyz.h"
 
+#include "colorimetry/verbal.h"
 #include "difference/cie76.h"
 #include "difference/cmc.h"
 
@@ -10,9 +10,7 @@
 namespace {
 
 // Text has no place in a ufunc: a number stands for it.
-constexpr const wchar_t *kWords[] = {L"",           L"On Target", L"Too Dark", L"Too Light",
-                                     L"Too Green",  L"Too Red",   L"Too Blue", L"Too Yellow",
-                                     L"Too Bright", L"Too Dull"};
+using vantrel::kWords;
 
 int word_number(const wchar_t *word)
 {
@@ -96,14 +94,8 @@ int estimate_refls_ex(int n, const double *first, Optional second, Optional thir
     return estimate(n, first, second.values, third.values, percent, paper, refl);
 }
 
-constexpr Row with_loop(Row row, decltype(Row::loop) loop)
-{
-    row.loop = loop;
-    return row;
-}
-
 constexpr Row kRows[] = {
-    with_loop(ROW(ReflToXYZ, "refl_to_xyz", "(31),()->(3)"), many_xyz),
+    ROW(ReflToXYZ, "refl_to_xyz", "(31),()->(3)"),
     ROW(ReflToXYZs, "refl_to_xyzs", "(31),()->(31),(31),(31)"),
     ROW(ReflToCIELAB, "refl_to_cielab", "(31),()->(3)"),
     ROW(XYZToCIELab, "xyz_to_cielab", "(3),()->(3)"),

@@ -5,13 +5,9 @@
 namespace vantrel {
 namespace {
 
-struct Line {
-    double slope, intercept;
-};
-
 // State. The slope of the default line is cut to 14 decimals.
 constinit AchromaticPoints points = {84, 14, 3, 11};
-constinit Line line = {-0.11428571428571, 12.6};
+constinit AchromaticLine line = {-0.11428571428571, 12.6};
 
 } // namespace
 
@@ -29,6 +25,6 @@ bool set_achromatic_points(const AchromaticPoints &through)
     return true;
 }
 
-bool is_chromatic(double L, double C) { return C > line.slope * L + line.intercept; }
+const AchromaticLine &achromatic_line() { return line; }
 
 } // namespace vantrel

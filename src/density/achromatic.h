@@ -14,7 +14,14 @@ const AchromaticPoints &achromatic_points();
 /// False, with the line as it was, for two points that no finite line goes through.
 bool set_achromatic_points(const AchromaticPoints &through);
 
-/// Whether C* lies above the line.
-bool is_chromatic(double L, double C);
+/// The line.
+struct AchromaticLine {
+    double slope, intercept;
+
+    /// Whether C* lies above it.
+    template <class V> auto is_chromatic(V L, V C) const { return C > slope * L + intercept; }
+};
+const AchromaticLine &achromatic_line();
+inline bool is_chromatic(double L, double C) { return achromatic_line().is_chromatic(L, C); }
 
 } // namespace vantrel

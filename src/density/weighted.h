@@ -9,7 +9,7 @@
 namespace vantrel {
 
 /// Σ R w in order of the bands.
-template <class Refl> auto weighted_sum(const Refl &refl, Weights weights)
+template <class Refl, class Weights> auto weighted_sum(const Refl &refl, const Weights &weights)
 {
     std::remove_cvref_t<decltype(refl[0])> sum = 0;
     for (int i = 0; i < kBands; ++i)

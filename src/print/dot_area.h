@@ -8,12 +8,19 @@ namespace vantrel {
 /// The light that a density absorbs.
 template <class V> V absorptance(V density, double n) { return 1 - exp10(-density / n); }
 
+/// Dot area in percent of a tint beside its solid, by what they absorb; 100 where the solid absorbs
+/// nothing.
+template <class V> V absorbed_area(V solid, V tint)
+{
+    return select(solid == 0, 100, 100 * (tint / solid));
+}
+
 /// Yule-Nielsen dot area in percent of a tint of density Dt beside its solid of density Ds; with
-/// n = 1 it is Murray-Davies. A solid of density 0 has 100.
-template <class V> V dot_area(V Ds, V Dt, double n)
+/// n = 1 it is Murray-Davies.
+inline double dot_area(double Ds, double Dt, double n)
 {
     const auto [solid, tint] = side_by_side([n](auto D) { return absorptance(D, n); }, Ds, Dt);
-    return select(solid == 0, 100, 100 * (tint / solid));
+    return absorbed_area(solid, tint);
 }
 
 /// Its inverse: the tint density of a dot area in percent.

@@ -1,0 +1,26 @@
+// The loops that compute several rows side by side.
+#pragma once
+
+#include "../operand.h"
+
+#include <span>
+
+struct LaneLoop {
+    const char *name; ///< of the ufunc
+    /// False, with nothing written, where the rows or arguments ask for one row after the other.
+    bool (*run)(const Operand *operands, npy_intp rows);
+};
+
+struct LaneLoops {
+    std::span<const LaneLoop> loops;
+    bool (*all_finite)(const double *values, npy_intp count) = nullptr;
+};
+
+/// Of 2, 4 and 8 rows: for any processor, and for x86-64 with AVX2 and with AVX-512.
+LaneLoops lane_loops_2();
+LaneLoops lane_loops_4();
+LaneLoops lane_loops_8();
+
+/// Of as many rows as this processor has lanes, or as the variable VANTREL_LANES in the environment
+/// says: off, 2, 4 or 8. Where the processor does not have them, `fault` says so.
+LaneLoops lane_loops(const char *&fault);
