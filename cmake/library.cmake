@@ -30,12 +30,12 @@ if(NOT VANTREL_ROUNDS_TO_DOUBLE)
                       "With -msse2 -mfpmath=sse it does not.")
 endif()
 
-# The same bits from every compiler: no fused multiply-adds. Nothing reads errno after a call of the
-# mathematics library, so that a square root is one instruction.
+# The same bits from every compiler: no fused multiply-adds. Nothing reads errno after a square root,
+# so that it is one instruction; nothing throws.
 if(MSVC)
   target_compile_options(Vantrel PRIVATE /fp:precise /utf-8 /W3)
 else()
-  target_compile_options(Vantrel PRIVATE -ffp-contract=off -fno-math-errno
+  target_compile_options(Vantrel PRIVATE -ffp-contract=off -fno-math-errno -fno-exceptions
     -Wall -Wextra -Wpedantic -Wshadow -Wconversion -Wno-sign-conversion
     "-fmacro-prefix-map=${PROJECT_SOURCE_DIR}/=")
 endif()
