@@ -6,7 +6,8 @@ build_packages=(cmake ninja-build g++ pkg-config
     libcli11-dev libeigen3-dev libfmt-dev nlohmann-json3-dev libpugixml-dev libtomlplusplus-dev)
 fuzz_packages=(clang libclang-rt-14-dev)
 page_packages=(npm)
-test_packages=(chromium libgtest-dev libmpfr-dev clang clang-tidy clang-format doxygen binutils python3)
+test_packages=(chromium libgtest-dev libmpfr-dev clang clang-tidy clang-format doxygen binutils python3
+    valgrind)
 python_packages=("${build_packages[@]}" python3-dev python3-venv)
 
 # npm may have come with a node that is not Debian's, which Debian's npm would drive out. Debian's is

@@ -3,6 +3,7 @@
 
 #include "judge/colour.h"
 #include "judge/formulas.h"
+#include "judge/left_out.h"
 #include "judge/limits.h"
 #include "judge/pairs.h"
 #include "judge/paper.h"
@@ -106,6 +107,7 @@ struct Comparison {
     std::vector<Metric> metrics;
     std::optional<double> tolerance;
     std::vector<PairReport> pairs;
+    LeftOut left_out;                   // by choose_for_page()
     std::vector<Statistics> statistics; // of the pairs, for each metric
     std::vector<std::size_t> worst;     // ten at most, by the first metric
     Coverage coverage;

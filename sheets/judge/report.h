@@ -3,6 +3,7 @@
 
 #include "judge/colour.h"
 #include "judge/inks.h"
+#include "judge/left_out.h"
 #include "judge/paper.h"
 #include "judge/stated.h"
 #include "read/measurement.h"
@@ -88,6 +89,7 @@ struct Report {
     PaperReport paper;
     std::optional<MetamerismReport> metamerism;
     std::vector<PatchReport> patches;
+    LeftOut left_out;                   // by choose_for_page()
     std::vector<ToneCurve> tone_curves; // of the inks that have measured tints
     std::vector<std::string> warnings;
 };

@@ -307,7 +307,7 @@ void write_json(const Comparison &comparison, const Sink &sink)
         if (metric.formula != Formula::de76)
             weights[name] = {metric.lightness, metric.chroma};
     }
-    const Json head = {
+    Json head = {
         {"command", "compare"},
         {"verdict", comparison.verdict ? Json(name_of(*comparison.verdict)) : Json()},
         {"says", sentence_of(comparison)},
@@ -345,6 +345,7 @@ void write_json(const Comparison &comparison, const Sink &sink)
          {{"reference", names_json(comparison.only_reference)},
           {"sample", names_json(comparison.only_sample)}}},
     };
+    add_left_out(head, comparison.left_out);
     write_with_array(
         head, "pairs", comparison.pairs.size(),
         [&](std::size_t i) { return pair_json(comparison.pairs[i], comparison); }, sink);

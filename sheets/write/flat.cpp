@@ -6,7 +6,10 @@
 
 #include <algorithm>
 #include <iterator>
+#include <limits>
 #include <map>
+#include <memory>
+#include <unordered_map>
 
 namespace vantrel::sheets {
 namespace {
@@ -209,12 +212,19 @@ void Flat::spectrum(const std::function<const Spectrum &(std::size_t)> &get)
 void Flat::device(const std::vector<std::string> &names,
                   const std::function<const Device &(std::size_t)> &get)
 {
+    struct Row {
+        std::size_t place = std::numeric_limits<std::size_t>::max();
+        std::unordered_map<std::string_view, double> values;
+    };
+    const auto row = std::make_shared<Row>(); // whose cells are asked for one after the other
     for (const std::string &name : names)
-        exact(name, name, [get, name](std::size_t i) {
-            const Device &device = get(i);
-            const auto own = std::find_if(device.begin(), device.end(),
-                                          [&](const auto &value) { return value.first == name; });
-            return own == device.end() ? std::nullopt : std::optional(own->second);
+        exact(name, name, [get, name, row](std::size_t i) {
+            if (row->place != i) {
+                const Device &device = get(i);
+                *row = {i, {device.begin(), device.end()}};
+            }
+            const auto own = row->values.find(name);
+            return own == row->values.end() ? std::nullopt : std::optional(own->second);
         });
 }
 

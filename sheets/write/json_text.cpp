@@ -41,6 +41,14 @@ Json patch_json(const PatchReport &patch, int status)
             {"refl", or_null(patch.refl)}};
 }
 
+void add_left_out(Json &object, const LeftOut &left_out)
+{
+    if (left_out.count == 0)
+        return;
+    object["left_out"] = left_out.count;
+    object["kept"] = left_out.kept;
+}
+
 void write_with_array(const Json &object, std::string_view name, std::size_t count,
                       const std::function<Json(std::size_t)> &element, const Sink &sink)
 {

@@ -3,6 +3,7 @@
 
 #include "judge/colour.h"
 #include "judge/densitometer.h"
+#include "judge/left_out.h"
 #include "judge/paper.h"
 #include "write/sink.h"
 
@@ -33,6 +34,9 @@ Json name_json(const PaperChoice &paper); // null where there is none
 void add_reading(Json &object, const DensityReading &reading, int status);
 
 Json patch_json(const PatchReport &patch, int status);
+
+// Adds `left_out` and `kept` where the page does not hold all.
+void add_left_out(Json &object, const LeftOut &left_out);
 
 // Writes the object with one more member, an array whose elements never stand in memory together:
 // each is a line.

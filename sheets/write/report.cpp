@@ -214,7 +214,7 @@ Json tone_values_json(const Report &report)
 
 void write_sheet(const Report &report, const Sink &sink)
 {
-    const Json head = {
+    Json head = {
         {"file", report.file},
         {"warnings", report.warnings},
         {"illuminant", name_of(report.illuminant)},
@@ -236,6 +236,7 @@ void write_sheet(const Report &report, const Sink &sink)
         {"paper", paper_json(report)},
         {"tone_values", tone_values_json(report)},
     };
+    add_left_out(head, report.left_out);
     write_with_array(
         head, "patches", report.patches.size(),
         [&](std::size_t i) { return patch_json(report.patches[i], report.status); }, sink);

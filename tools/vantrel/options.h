@@ -3,6 +3,7 @@
 
 #include "read/measurement.h"
 #include "write/html.h"
+#include "write/page_choice.h"
 #include "write/result.h"
 
 #include <CLI/CLI.hpp>
@@ -79,6 +80,8 @@ Outcome outcome_of(Result result, std::vector<std::string> warnings, const Optio
                    TableStyle style = {})
 {
     style.colour = shows_colour(options);
+    if (options.format == "html")
+        choose_for_page(result);
     const auto write = [result = std::move(result), format = options.format,
                         style](const Sink &sink) {
         if (format == "json")

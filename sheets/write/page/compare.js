@@ -1,7 +1,7 @@
 // vantrel compare: the verdict, and the pairs that it rests on.
 
 import { histogramPlot, mostPoints, picture, planePlot } from './charts.js';
-import { chosenPaper, colourOf, count, figures, fixed, h, named, smallTable, spread, swatch,
+import { chosenPaper, colourOf, count, figures, fixed, h, leftOut, named, smallTable, spread, swatch,
   warnings } from './dom.js';
 import { spectraPicture, swatches } from './report.js';
 import { searchTable } from './table.js';
@@ -100,8 +100,9 @@ const pairings = { name: 'name', id: 'id', device: 'device values', order: 'plac
 
 const overview = (result) => h('header', {},
   h('h1', {}, named(result.sample.file), ' against ', named(result.reference.file)),
-  h('p', { class: 'about' }, [count(result.pairs.length, 'patch'),
-    `paired by ${pairings[result.paired_by]}`, result.illuminant, result.status].join(' · ')));
+  h('p', { class: 'about' }, [count(result.pairs.length + (result.left_out ?? 0), 'patch'),
+    `paired by ${pairings[result.paired_by]}`, result.illuminant, result.status].join(' · ')),
+  leftOut(result.pairs.length, result));
 
 const statisticsTable = (result) => smallTable('Differences', [
   { label: 'Formula', text: labeller(result) },

@@ -30,6 +30,12 @@ export const count = (number, noun) =>
 // screen.
 export const colourOf = ({ lab }) => `lab(${lab.map((value) => fixed(value)).join(' ')})`;
 
+// What is missing from a page of very many patches, or nothing.
+export const leftOut = (shown, { left_out: missing, kept }) => (missing
+  ? h('p', { class: 'note' }, `The page holds ${shown.toLocaleString('en')} of ` +
+    `${count(shown + missing, 'patch')}: ${kept}, and an even choice of the others. Tables, ` +
+    'pictures and searches are of these; --format csv gives all.') : null);
+
 // [[term, text or element, what it means], …] as a row of figures.
 export function figures(entries) {
   return h('dl', { class: 'figures' }, entries.map(([term, value, remark]) =>

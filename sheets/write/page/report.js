@@ -2,7 +2,7 @@
 
 import { histogramPlot, legend, mostPoints, picture, planePlot, spectraPlot, tonePlot }
   from './charts.js';
-import { chosenPaper, colourOf, count, figures, fixed, h, named, smallTable, spread, swatch, triple,
+import { chosenPaper, colourOf, count, figures, fixed, h, leftOut, named, smallTable, spread, swatch, triple,
   warnings } from './dom.js';
 import { searchTable } from './table.js';
 
@@ -218,7 +218,7 @@ function sheetSection(sheet, id, heading) {
     h('header', {},
       h(heading, {}, named(sheet.file)),
       h('p', { class: 'about' }, [
-        count(sheet.patches.length, 'patch'),
+        count(sheet.patches.length + (sheet.left_out ?? 0), 'patch'),
         sheet.inks.length ? count(sheet.inks.length, 'ink') : null,
         sheet.illuminant, sheet.status, sheet.n_factor !== 1 ? `n = ${sheet.n_factor}` : null,
         source.condition,
@@ -228,7 +228,8 @@ function sheetSection(sheet, id, heading) {
         source.interpolated ? 'interpolated to 10 nm' : null,
         source.held ? 'the last value held to 400 or 700 nm' : null,
         source.scaled_to_percent ? 'brought to percent' : null,
-      ].filter(Boolean).join(' · '))),
+      ].filter(Boolean).join(' · ')),
+      leftOut(sheet.patches.length, sheet)),
     keyFigures(sheet, solids),
     warnings(sheet.warnings),
     swatches(sheet.patches.map((patch) => ({ name: patch.name, colour: colourOf(patch) })),
@@ -253,7 +254,8 @@ export function reportPage({ sheets }) {
     h('h1', {}, `${sheets.length} press sheets`),
     smallTable('Sheets', [
       { label: 'Sheet', text: ([sheet, i]) => h('a', { href: `#sheet-${i}` }, named(sheet.file)) },
-      { label: 'Patches', number: true, text: ([sheet]) => sheet.patches.length.toLocaleString('en') },
+      { label: 'Patches', number: true,
+        text: ([sheet]) => (sheet.patches.length + (sheet.left_out ?? 0)).toLocaleString('en') },
       { label: 'Paper L*a*b*', number: true, text: ([sheet]) => (sheet.paper.lab ? triple(sheet.paper.lab) : '–') },
       { label: 'Largest gain', number: true,
         text: ([sheet]) => fixed(largest(sheet.patches, 'dot_gain')?.dot_gain) },

@@ -105,3 +105,26 @@ test('a chosen patch joins the spectra', async () => {
   }
   await page.close();
 });
+
+test('a page of very many patches holds a choice and says so', async () => {
+  // Half as many again as a page holds, alike but for one dark patch.
+  const sheet = (name, dark) => `seq 75000 | awk 'BEGIN { printf "name"; for (n = 400; n <= 700; n += 10)
+    printf ",%d", n; print "" } { printf "Patch %d", $1; for (n = 0; n < 31; ++n)
+    printf ",%.3f", $1 == 40001 ? ${dark} + n / 9 : 70 + $1 / 7e3 + n / 9; print "" }' > ${name}`;
+  const report = await open(`${sheet('many.csv', 4)}; vantrel report many.csv`);
+  const about = (page) => page.locator('header').first().innerText();
+  assert.match(await about(report), /^many.csv\s+75,000 patches .*The page holds 50,000 of 75,000 patches: all \d+ that are the paper, .* and an even choice of the others\..*--format csv gives all/s);
+  const compare = await open(`${sheet('other.csv', 9)}; vantrel compare many.csv other.csv --tolerance 1`);
+  assert.match(await about(compare), /75,000 patches .*The page holds 50,000 of 75,000 patches: all \d+ that are the paper, the largest of a formula or above ΔE00 1, and/s);
+  assert.match(await compare.innerText('.verdict'), /at Patch 40001/);
+  for (const page of [report, compare]) {
+    await page.getByRole('searchbox').fill('40001');
+    assert.equal(await page.innerText('.count'), '1 patch found among 50,000');
+    // two thirds of 200, 2000 to 2009 and 20000 to 20099
+    await page.getByRole('searchbox').fill('Patch 200');
+    const [, found] = /of (\d+) patches found/.exec(await page.innerText('.count'));
+    assert.ok(found >= 70 && found <= 78, found);
+    assert.deepEqual(page.complaints, []);
+    await page.close();
+  }
+});
