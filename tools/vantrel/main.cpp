@@ -1,7 +1,7 @@
 // vantrel: what a measured sheet says, from the command line.
 //
-// Exit status: 0 done; 1 a sheet failed its tolerance; 2 the request or a file is at fault; 3 the
-// output could not be written.
+// Exit status: 0 done; 1 a sheet failed its tolerances or could not be judged whole; 2 the request
+// or a file is at fault; 3 the output could not be written.
 
 #include "options.h"
 #include "output_file.h"
@@ -33,10 +33,11 @@ Outcome run(CLI::App &app, int count, char **words)
     std::vector<std::string> names;
     for (const Command &command : commands)
         names.push_back(command.app->get_name());
-    app.footer("Exit status: 0 done; 1 a sheet failed its --tolerance; 2 the request or a file is "
-               "at fault;\n3 the output could not be written.\n\n"
-               "Example:\n  vantrel report two_ink_halftone.txt\n\n"
-               "vantrel COMMAND --help tells the options of a command.");
+    app.footer(
+        "Exit status: 0 done; 1 a sheet failed its tolerances or could not be judged whole; 2 "
+        "the request\nor a file is at fault; 3 the output could not be written.\n\n"
+        "Example:\n  vantrel report two_ink_halftone.txt\n\n"
+        "vantrel COMMAND --help tells the options of a command.");
     try {
         app.parse(count, words);
     } catch (const CLI::Success &wish) { // --help, --version
