@@ -179,6 +179,7 @@ Report report_of(const Measurement &sheet, const ReportRequest &request)
                   .warnings = std::move(warnings)};
     const Conditions conditions{sheet, inks, paper, illuminant, request.status, request.n_factor};
     const Work work{request.tell, "Measuring", sheet.patches.size()};
+    report.patches.reserve(sheet.patches.size());
     for (const Patch &patch : sheet.patches) {
         report.patches.push_back(patch_report(patch, conditions));
         work.done(report.patches.size());
