@@ -39,6 +39,10 @@ else()
     -Wall -Wextra -Wpedantic -Wshadow -Wconversion -Wno-sign-conversion
     "-fmacro-prefix-map=${PROJECT_SOURCE_DIR}/=")
 endif()
+# Where clang 14 joins operations into vectors of WebAssembly by itself, Metamerism comes out wrong.
+if(CMAKE_CXX_FLAGS MATCHES "-msimd128")
+  target_compile_options(Vantrel PRIVATE -fno-slp-vectorize)
+endif()
 if(VANTREL_CHECKED)
   target_compile_definitions(Vantrel PRIVATE VANTREL_CHECKED)
 endif()
