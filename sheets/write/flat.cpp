@@ -25,7 +25,7 @@ bool is_formula(std::string_view text)
 }
 
 // Text with an apostrophe wherever a spreadsheet would begin a formula, be it one that takes
-// semicolons or tabs for the ends of cells. Numbers stay as they are.
+// semicolons for the ends of cells; text that can be printed holds no tabs. Numbers stay as they are.
 std::string without_formulas(std::string_view text)
 {
     std::string out;
@@ -34,8 +34,7 @@ std::string without_formulas(std::string_view text)
         if (begins && is_formula(text.substr(i)) && !number_in(text))
             out += '\'';
         out += text[i];
-        begins = text[i] == ';' || text[i] == '\t' || text[i] == '\n' || text[i] == '\r' ||
-                 (begins && (text[i] == ' ' || text[i] == '"'));
+        begins = text[i] == ';' || (begins && (text[i] == ' ' || text[i] == '"'));
     }
     return out;
 }
