@@ -25,7 +25,8 @@ bool is_formula(std::string_view text)
 }
 
 // Text with an apostrophe wherever a spreadsheet would begin a formula, be it one that takes
-// semicolons for the ends of cells; text that can be printed holds no tabs. Numbers stay as they are.
+// semicolons for the ends of cells; text that can be printed holds no tabs. Numbers stay as they
+// are.
 std::string without_formulas(std::string_view text)
 {
     std::string out;
