@@ -17,6 +17,7 @@ namespace vantrel::sheets {
 namespace {
 
 constexpr std::size_t kMostWorst = 10;
+constexpr double kFarOff = 3; // a colour difference that is no scatter
 
 // One of the two sheets.
 struct Sheet {
@@ -251,6 +252,25 @@ void warn_of_uneven(const Pairs &pairs, const Measurement &reference, const Meas
                                        sample.file, most, aims, fewer, aims > 3 ? ", …" : ""));
 }
 
+// Two of the worst pairs that would agree if their samples changed places.
+void warn_of_exchanged(Comparison &out)
+{
+    const Metric &metric = out.metrics[0];
+    for (std::size_t i = 0; i < out.worst.size(); ++i)
+        for (std::size_t j = i + 1; j < out.worst.size(); ++j) {
+            const PairReport &one = out.pairs[out.worst[i]], &other = out.pairs[out.worst[j]];
+            const double own = std::min(one.delta_e[0], other.delta_e[0]);
+            const double exchanged =
+                std::max(metric(one.reference.colour.lab, other.sample.colour.lab),
+                         metric(other.reference.colour.lab, one.sample.colour.lab));
+            if (own > kFarOff && exchanged < own / 3)
+                out.warnings.push_back(fmt::format(
+                    "{}: {} and {} would agree with each other's aim: are their rows "
+                    "exchanged?",
+                    out.sample, in_quotes(one.sample.name), in_quotes(other.sample.name)));
+        }
+}
+
 Coverage coverage_of(const Pairs &pairs, const Measurement &reference, const Measurement &sample,
                      bool allow_missing)
 {
@@ -307,6 +327,7 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
                                                alone->size(), sheet->patches.size()));
     warn_of_uneven(pairs, reference, sample, out.warnings);
     const Work work{request.tell, "Comparing", pairs.matched.size()};
+    out.pairs.reserve(pairs.matched.size());
     for (const Pair &pair : pairs.matched) {
         out.pairs.push_back(pair_report(references, samples, pair, terms));
         work.done(out.pairs.size());
@@ -322,6 +343,7 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
             substrate_corrected(out.pairs, controls, references, samples, terms, out.coverage);
     out.worst = largest_first(values_of(out.pairs, &PairReport::delta_e, 0));
     out.worst.resize(std::min(out.worst.size(), kMostWorst));
+    warn_of_exchanged(out);
     return out;
 }
 

@@ -85,7 +85,7 @@ IlluminantChoice illuminant_for(const std::optional<ILLUM_OBS> &wish,
                                 const std::vector<const Measurement *> &sheets,
                                 std::vector<std::string> &warnings)
 {
-    const IlluminantChoice out = choice(wish, sheets);
+    IlluminantChoice out = choice(wish, sheets);
     for (const Measurement *sheet : sheets) {
         const Colours &colours = sheet->colours;
         const std::string_view taken = name_of(out.illuminant);

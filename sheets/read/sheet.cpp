@@ -1,5 +1,6 @@
 #include "read/sheet.h"
 
+#include "read/doubts.h"
 #include "read/text.h"
 
 #include <fmt/format.h>
@@ -148,14 +149,15 @@ void Sheet::bring_to_percent()
     if (reading.scale != Scale::automatic) {
         full_scale = reading.scale == Scale::fraction ? 1 : 100;
         scale_by = "--scale";
-    } else if (full_scale) {
+    } else if (full_scale || usual_scale) {
+        if (!full_scale) {
+            full_scale = usual_scale;
+            scale_by = usually_by;
+        }
         const double percent = largest / *full_scale * 100;
         if (percent > 300 || percent <= 2)
             warn(0, fmt::format("by {} the largest reflectance is {:.3g} %; --scale sets the scale",
                                 scale_by, percent));
-    } else if (usual_scale) {
-        full_scale = usual_scale;
-        scale_by = usually_by;
     } else {
         full_scale = largest <= largest_fraction() ? 1 : 100;
         scale_by = "values";
@@ -253,6 +255,9 @@ Measurement Sheet::measurement()
     if (xyz)
         bring_to_lab(colours);
     check_inks();
+    if (kind != Kind::colours)
+        for (const Doubt &doubt : doubts_about(patches))
+            warn(doubt.line, doubt.text);
     if (kind == Kind::transmission)
         warn(0, "transmission, not reflectance: there is no paper");
     return {.file = {},

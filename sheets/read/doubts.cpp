@@ -1,0 +1,180 @@
+#include "read/doubts.h"
+
+#include "read/text.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <array>
+#include <cstdint>
+#include <cstring>
+#include <optional>
+#include <string_view>
+#include <utility>
+
+namespace vantrel::sheets {
+namespace {
+
+constexpr double kLeastRange = 5;    // of the reflectances in a band of a sheet that is printed on
+constexpr double kDeadRange = 0.01;  // of those in a band that measures nothing
+constexpr double kNoise = 0.5;       // of an instrument near black
+constexpr double kFullTint = 50;     // from which on an ink shows its colour
+constexpr double kMostOfBlack = 0.6; // between the densities of a black
+constexpr double kLeastOfInk = 0.1;  // between those of two filters, beyond what paper and noise do
+
+std::string nm_of(std::size_t band) { return fmt::format("{} nm", 400 + 10 * band); }
+
+// ", and 3 more" where there are others.
+std::string and_more(std::size_t count)
+{
+    return count > 1 ? fmt::format(", and {} more", count - 1) : "";
+}
+
+void doubt_bands(const std::vector<Patch> &patches, std::vector<Doubt> &out)
+{
+    Spectrum least = patches.front().refl, most = least;
+    for (const Patch &patch : patches)
+        for (std::size_t band = 0; band < least.size(); ++band) {
+            least[band] = std::min(least[band], patch.refl[band]);
+            most[band] = std::max(most[band], patch.refl[band]);
+        }
+    double range = 0;
+    for (std::size_t band = 0; band < least.size(); ++band)
+        range = std::max(range, most[band] - least[band]);
+    if (patches.size() < 3 || range < kLeastRange)
+        return;
+    for (std::size_t band = 0; band < least.size(); ++band)
+        if (most[band] - least[band] <= kDeadRange)
+            out.push_back({0, fmt::format("the band at {} reads {:g} % in every patch", nm_of(band),
+                                          least[band])});
+}
+
+void doubt_signs(const std::vector<Patch> &patches, std::vector<Doubt> &out)
+{
+    const Patch *first = nullptr;
+    std::size_t count = 0;
+    for (const Patch &patch : patches)
+        if (*std::min_element(patch.refl.begin(), patch.refl.end()) < -kNoise) {
+            first = first ? first : &patch;
+            ++count;
+        }
+    if (!first)
+        return;
+    const auto *const least = std::min_element(first->refl.begin(), first->refl.end());
+    out.push_back(
+        {first->line,
+         fmt::format("{} reflects {:g} % at {}, less than nothing{}", in_quotes(first->name),
+                     *least, nm_of(static_cast<std::size_t>(least - first->refl.begin())),
+                     and_more(count))});
+}
+
+// FNV-1a over the bytes.
+std::uint64_t hash_of(const Spectrum &refl)
+{
+    std::uint64_t hash = 14695981039346656037u;
+    for (const double value : refl) {
+        std::uint64_t bits = 0;
+        std::memcpy(&bits, &value, sizeof bits);
+        hash = (hash ^ bits) * 1099511628211u;
+    }
+    return hash;
+}
+
+// No instrument reads two patches alike to the last digit of every band.
+void doubt_copies(const std::vector<Patch> &patches, std::vector<Doubt> &out)
+{
+    std::vector<std::pair<std::uint64_t, std::size_t>> hashes;
+    for (std::size_t i = 0; i < patches.size(); ++i)
+        if (!patches[i].device.empty())
+            hashes.emplace_back(hash_of(patches[i].refl), i);
+    std::sort(hashes.begin(), hashes.end());
+    std::optional<std::pair<std::size_t, std::size_t>> first;
+    std::size_t count = 0;
+    for (std::size_t i = 1; i < hashes.size(); ++i) {
+        const std::pair both{hashes[i - 1].second, hashes[i].second};
+        const Patch &one = patches[both.first], &other = patches[both.second];
+        if (one.refl != other.refl || one.device == other.device)
+            continue;
+        first = std::min(first.value_or(both), both);
+        ++count;
+    }
+    if (first)
+        out.push_back({patches[first->second].line,
+                       fmt::format("{} and {} have different device values, but the same spectrum "
+                                   "to the last digit{}",
+                                   in_quotes(patches[first->first].name),
+                                   in_quotes(patches[first->second].name), and_more(count))});
+}
+
+struct Ink {
+    std::string_view field, name;
+};
+constexpr std::array<Ink, 4> kInks = {{{"CMYK_K", "black"},
+                                       {"CMYK_C", "cyan"},
+                                       {"CMYK_M", "magenta"},
+                                       {"CMYK_Y", "yellow"}}}; // in the order of the responses
+
+// The only ink of a patch, if it is one of the four and covers enough; its place among them.
+std::optional<std::size_t> only_ink(const Patch &patch)
+{
+    std::optional<std::size_t> out;
+    for (const auto &device : patch.device) {
+        if (device.second == 0)
+            continue;
+        const auto *const ink = std::find_if(
+            kInks.begin(), kInks.end(), [&](const Ink &one) { return one.field == device.first; });
+        if (out || ink == kInks.end() || device.second < kFullTint)
+            return std::nullopt;
+        out = static_cast<std::size_t>(ink - kInks.begin());
+    }
+    return out;
+}
+
+// The ink that a patch of one ink looks like instead: an ink is densest through the filter of the
+// other colour, black through all alike.
+std::optional<std::size_t> other_ink(const Patch &patch, std::size_t ink)
+{
+    std::array<double, 4> density{};
+    for (const int response : {RED_RESPONSE, GREEN_RESPONSE, BLUE_RESPONSE})
+        ReflToDensity(patch.refl.data(), nullptr, E_STATUS, response,
+                      &density[static_cast<std::size_t>(response)]);
+    const auto [least, most] = std::minmax_element(density.begin() + 1, density.end());
+    const bool other =
+        ink == VISUAL_RESPONSE ? *most - *least > kMostOfBlack : *most - density[ink] > kLeastOfInk;
+    return other ? std::optional(static_cast<std::size_t>(most - density.begin())) : std::nullopt;
+}
+
+void doubt_inks(const std::vector<Patch> &patches, std::vector<Doubt> &out)
+{
+    const Patch *first = nullptr;
+    std::size_t count = 0;
+    for (const Patch &patch : patches) {
+        const auto ink = only_ink(patch);
+        if (!ink || !other_ink(patch, *ink))
+            continue;
+        first = first ? first : &patch;
+        ++count;
+    }
+    if (!first)
+        return;
+    const std::size_t ink = *only_ink(*first);
+    out.push_back(
+        {first->line, fmt::format("{} looks {}, but is {} by its device values{}: are "
+                                  "rows or columns exchanged?",
+                                  in_quotes(first->name), kInks[*other_ink(*first, ink)].name,
+                                  kInks[ink].name, and_more(count))});
+}
+
+} // namespace
+
+std::vector<Doubt> doubts_about(const std::vector<Patch> &patches)
+{
+    std::vector<Doubt> out;
+    doubt_bands(patches, out);
+    doubt_signs(patches, out);
+    doubt_copies(patches, out);
+    doubt_inks(patches, out);
+    return out;
+}
+
+} // namespace vantrel::sheets

@@ -1,0 +1,22 @@
+// What the numbers of a sheet say against themselves: slips of an export or of a hand.
+#pragma once
+
+#include "read/measurement.h"
+
+#include <cstddef>
+#include <string>
+#include <vector>
+
+namespace vantrel::sheets {
+
+struct Doubt {
+    std::size_t line; // 0 where it is about no single patch
+    std::string text;
+};
+
+// Of reflectances in percent: bands that read the same everywhere, reflectances below zero, spectra
+// that stand twice under different device values, and solids that read as another ink than these
+// say.
+std::vector<Doubt> doubts_about(const std::vector<Patch> &patches);
+
+} // namespace vantrel::sheets
