@@ -12,8 +12,10 @@ Inks::Inks(const Measurement &sheet, const std::vector<std::string> &order) : sh
 {
     for (const Patch &patch : sheet.patches)
         for (const auto &[field, percent] : patch.device)
-            if (is_ink(field) && numbers.emplace(field, fields.size()).second)
+            if (is_ink(field) && !numbers.contains(field)) {
+                numbers.emplace(field, fields.size());
                 fields.push_back(field);
+            }
 
     std::vector<std::size_t> sequence;
     for (const std::string &name : order) {
@@ -34,9 +36,10 @@ Inks::Inks(const Measurement &sheet, const std::vector<std::string> &order) : sh
         fields[i] = in_file[sequence[i]];
         numbers[fields[i]] = i;
     }
+    solids.resize(fields.size());
     for (const Patch &patch : sheet.patches)
-        if (const auto tints = tints_of(patch))
-            patches.emplace(*tints, &patch);
+        if (const auto ink = ink_of_solid(patch); ink && !solids[*ink])
+            solids[*ink] = &patch;
 }
 
 std::optional<Tints> Inks::tints_of(const Patch &patch) const
@@ -62,15 +65,21 @@ std::optional<Tints> Inks::tints_of(const Patch &patch) const
 
 const Patch *Inks::measured(const Tints &tints) const
 {
-    const auto found = patches.find(tints);
-    return found == patches.end() ? nullptr : found->second;
+    const auto found = std::find_if(sheet.patches.begin(), sheet.patches.end(),
+                                    [&](const Patch &patch) { return tints_of(patch) == tints; });
+    return found == sheet.patches.end() ? nullptr : &*found;
 }
 
 std::optional<std::size_t> Inks::ink_of_solid(const Patch &patch) const
 {
     const auto tints = tints_of(patch);
-    if (tints && tints->size() == 1 && tints->front().percent == 100)
-        return tints->front().ink;
+    return tints ? ink_of_solid(*tints) : std::nullopt;
+}
+
+std::optional<std::size_t> Inks::ink_of_solid(const Tints &tints)
+{
+    if (tints.size() == 1 && tints.front().percent == 100)
+        return tints.front().ink;
     return std::nullopt;
 }
 

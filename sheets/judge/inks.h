@@ -21,6 +21,7 @@ struct Tint {
     {
         return std::tie(first.ink, first.percent) < std::tie(second.ink, second.percent);
     }
+    friend bool operator==(const Tint &, const Tint &) = default;
 };
 using Tints = std::vector<Tint>; // in the order of printing; empty for bare paper
 
@@ -38,10 +39,11 @@ public:
 
     // The first patch of this combination, null where there is none.
     const Patch *measured(const Tints &tints) const;
-    const Patch *solid(std::size_t ink) const { return measured({{ink, 100}}); }
+    const Patch *solid(std::size_t ink) const { return solids[ink]; }
 
     // The ink of which a patch is a solid; nothing where it is none.
     std::optional<std::size_t> ink_of_solid(const Patch &patch) const;
+    static std::optional<std::size_t> ink_of_solid(const Tints &tints);
 
     // The ink by its device field or by its solid's name or id; nothing where there is none.
     std::optional<std::size_t> named(std::string_view name) const;
@@ -50,7 +52,7 @@ private:
     const Measurement &sheet;
     std::vector<std::string> fields;
     std::map<std::string, std::size_t> numbers; // of the fields, in the order of printing
-    std::map<Tints, const Patch *> patches;
+    std::vector<const Patch *> solids;          // the first of each ink, null where there is none
 };
 
 } // namespace vantrel::sheets

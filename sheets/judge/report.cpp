@@ -32,16 +32,17 @@ void measure_inks(PatchReport &row, const Patch &patch, const Inks &inks,
                   const Densitometer &densitometer, double n_factor)
 {
     const auto tints = inks.tints_of(patch);
-    if (inks.ink_of_solid(patch)) {
+    if (!tints)
+        return;
+    if (Inks::ink_of_solid(*tints)) {
         if (const auto measured = densitometer.hue_gray(patch.refl)) {
             row.hue_error = measured->hue_error;
             row.grayness = measured->grayness;
         }
-    } else if (tints && tints->size() == 1) {
+    } else if (tints->size() == 1) {
         if (const Patch *solid = inks.solid((*tints)[0].ink))
             measure_tint(row, patch, *solid, (*tints)[0].percent, densitometer, n_factor);
-    } else if (tints && tints->size() == 2 && (*tints)[0].percent == 100 &&
-               (*tints)[1].percent == 100) {
+    } else if (tints->size() == 2 && (*tints)[0].percent == 100 && (*tints)[1].percent == 100) {
         const Patch *first = inks.solid((*tints)[0].ink);
         const Patch *second = inks.solid((*tints)[1].ink);
         if (first && second)

@@ -2,6 +2,7 @@
 
 #include "read/text.h"
 
+#include <fmt/compile.h>
 #include <fmt/format.h>
 
 #include <algorithm>
@@ -112,8 +113,10 @@ void write_rows(const Flat &table, const std::vector<const Column *> &columns, c
     for (std::size_t i = 0; i < table.rows; ++i) {
         out.clear();
         for (const Column *column : own) {
-            if (column)
-                out += column->text ? csv_text(column->cell(i)) : column->cell(i);
+            if (column && column->text)
+                out += csv_text(column->cell(i));
+            else if (column)
+                column->append(i, out);
             out += ',';
         }
         out.back() = '\n';
@@ -156,38 +159,49 @@ void write_cgats_table(const Flat &table, const Sink &sink)
     sink.write("END_DATA\n");
 }
 
-std::string four_decimals(const std::optional<double> &value)
+void append_four_decimals(const std::optional<double> &value, std::string &out)
 {
     if (!value)
-        return "";
-    const std::string out = fmt::format("{:.4f}", *value);
-    return out == "-0.0000" ? "0.0000" : out;
+        return;
+    fmt::memory_buffer text;
+    fmt::format_to(fmt::appender(text), FMT_COMPILE("{:.4f}"), *value);
+    const std::string_view number(text.data(), text.size());
+    out += number == "-0.0000" ? "0.0000" : number;
 }
 
-std::string all_digits(const std::optional<double> &value)
+void append_all_digits(const std::optional<double> &value, std::string &out)
 {
-    return value ? fmt::to_string(*value) : "";
+    if (!value)
+        return;
+    fmt::memory_buffer text;
+    fmt::format_to(fmt::appender(text), FMT_COMPILE("{}"), *value);
+    out.append(text.data(), text.size());
 }
 
 } // namespace
 
 void Flat::text(std::string name, std::string cgats, std::function<std::string(std::size_t)> get)
 {
-    columns.push_back({std::move(name), std::move(cgats), true, std::move(get)});
+    columns.push_back({std::move(name), std::move(cgats), true,
+                       [get = std::move(get)](std::size_t i, std::string &out) { out += get(i); }});
 }
 
 void Flat::number(std::string name, std::string cgats,
                   std::function<std::optional<double>(std::size_t)> get)
 {
     columns.push_back({std::move(name), std::move(cgats), false,
-                       [get = std::move(get)](std::size_t i) { return four_decimals(get(i)); }});
+                       [get = std::move(get)](std::size_t i, std::string &out) {
+                           append_four_decimals(get(i), out);
+                       }});
 }
 
 void Flat::exact(std::string name, std::string cgats,
                  std::function<std::optional<double>(std::size_t)> get)
 {
     columns.push_back({std::move(name), std::move(cgats), false,
-                       [get = std::move(get)](std::size_t i) { return all_digits(get(i)); }});
+                       [get = std::move(get)](std::size_t i, std::string &out) {
+                           append_all_digits(get(i), out);
+                       }});
 }
 
 void Flat::colour(const std::string &prefix, const std::function<const Colour *(std::size_t)> &get)

@@ -17,7 +17,14 @@ struct Column {
     std::string name;  // in CSV
     std::string cgats; // in CGATS text; empty where the column is left out there
     bool text;         // otherwise a number, or nothing
-    std::function<std::string(std::size_t)> cell; // of a row
+    std::function<void(std::size_t, std::string &)> append; // what a row holds here
+
+    std::string cell(std::size_t row) const
+    {
+        std::string out;
+        append(row, out);
+        return out;
+    }
 };
 
 struct Flat {

@@ -5,6 +5,8 @@
 
 #include <fmt/format.h>
 
+#include <utility>
+
 namespace vantrel::sheets {
 
 Json lab_json(const CIELABCOORD &lab) { return {lab.L, lab.a, lab.b}; }
@@ -17,28 +19,35 @@ void add_reading(Json &object, const DensityReading &reading, int status)
     object["density"] = or_null(reading.density);
 }
 
+// Member by member: braces would make an array of every pair first.
 Json patch_json(const PatchReport &patch, int status)
 {
-    Json device = Json::object();
+    Json::object_t out;
+    out.reserve(18);
+    const auto add = [&out](const char *name, Json value) {
+        out.emplace_back(name, std::move(value));
+    };
+    Json::object_t device;
     for (const auto &[field, value] : patch.device)
         device[field] = value;
-    return {{"id", patch.id},
-            {"name", patch.name},
-            {"device", device},
-            {"rgb", hex(patch.colour.rgb)},
-            {"lab", lab_json(patch.colour.lab)},
-            {"lch", {patch.lch.L, patch.lch.C, patch.lch.h}},
-            {"de00_to_paper", or_null(patch.to_paper)},
-            {"response", patch.response ? Json(response_name(status, *patch.response)) : Json()},
-            {"response_id", or_null(patch.response)},
-            {"density", or_null(patch.density)},
-            {"dot_area", or_null(patch.dot_area)},
-            {"dot_gain", or_null(patch.dot_gain)},
-            {"print_contrast", or_null(patch.print_contrast)},
-            {"hue_error", or_null(patch.hue_error)},
-            {"grayness", or_null(patch.grayness)},
-            {"trap", or_null(patch.trap)},
-            {"refl", or_null(patch.refl)}};
+    add("id", patch.id);
+    add("name", patch.name);
+    add("device", std::move(device));
+    add("rgb", hex(patch.colour.rgb));
+    add("lab", lab_json(patch.colour.lab));
+    add("lch", {patch.lch.L, patch.lch.C, patch.lch.h});
+    add("de00_to_paper", or_null(patch.to_paper));
+    add("response", patch.response ? Json(response_name(status, *patch.response)) : Json());
+    add("response_id", or_null(patch.response));
+    add("density", or_null(patch.density));
+    add("dot_area", or_null(patch.dot_area));
+    add("dot_gain", or_null(patch.dot_gain));
+    add("print_contrast", or_null(patch.print_contrast));
+    add("hue_error", or_null(patch.hue_error));
+    add("grayness", or_null(patch.grayness));
+    add("trap", or_null(patch.trap));
+    add("refl", or_null(patch.refl));
+    return out;
 }
 
 void add_left_out(Json &object, const LeftOut &left_out)
