@@ -2,6 +2,7 @@
 
 import doctest
 import inspect
+import re
 import subprocess
 import sys
 from pathlib import Path
@@ -41,6 +42,19 @@ def test_every_example_prints_what_it_says(spectra, monkeypatch, capsys):
         titles = ["Examples"] if name.startswith("set") else ["Returns", "Examples"]
         titles += ["Parameters", "Raises"] if inspect.signature(function).parameters else []
         assert all(f"{t}\n{'-' * len(t)}" in inspect.getdoc(function) for t in titles), name
+
+
+def test_results_have_the_names_and_the_order_of_the_c_function():
+    header = (LIBRARY / "include/vantrel.h").read_text()
+    for function in FUNCTIONS.values():
+        text = inspect.getdoc(function)
+        results = re.findall(r"^(\w+) : ", text.partition("Returns\n---")[2].partition("\n\n")[0], re.M)
+        if len(results) > 1:
+            c_name = re.search(r"C function: (\w+)", text)[1]
+            parameters = re.search(rf"\b{c_name}\(([^;]*)\);", header)[1]
+            names = re.sub(r"([A-Z])", r"_\1", parameters).lower()
+            outputs = [n for n in re.findall(r"\w+(?=,|$)", names) if n in results]
+            assert outputs and outputs == [n for n in results if n in outputs], c_name
 
 
 RIGHT = """
