@@ -78,6 +78,7 @@ export function textOfPage(within) {
     else if (/^H\d$/.test(element.tagName)) line('#'.repeat(element.tagName[1]), text(element));
     else if (element.hidden) return;
     else if (element.matches('dl > div, .bar, .pager')) line(...[...element.children].map(text));
+    else if (element.matches('.word')) line(element.parentElement.className.trim(), text(element));
     else if (element.matches('p, figcaption, summary')) line(text(element));
     else if (element.matches('ul, .mosaic'))
       line([...element.children].map((child) => text(child).trim()).join(' | '));
