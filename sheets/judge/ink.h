@@ -1,4 +1,4 @@
-// What `vantrel ink` says: everything about one patch.
+// Everything about one patch.
 #pragma once
 
 #include "judge/densitometer.h"

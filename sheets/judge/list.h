@@ -1,4 +1,4 @@
-// What `vantrel list` prints: the names that the program knows, and the library's tables.
+// The names under which the library's tables are known, and the tables.
 #pragma once
 
 #include <vantrel.h>

@@ -68,18 +68,6 @@ const Patch &solid_named(const Measurement &sheet, const Inks &inks, std::string
     return ink ? *inks.solid(*ink) : patch_named(sheet, name);
 }
 
-Layer layer_of(const Measurement &sheet, const Inks &inks, std::string_view wish)
-{
-    const auto colon = wish.rfind(':');
-    if (colon == std::string_view::npos)
-        throw RequestError{fmt::format("--ink takes NAME:PERCENT, not {}", in_quotes(wish))};
-    const auto percent = number_in(wish.substr(colon + 1));
-    if (!percent || *percent < 0 || *percent > 100 || *percent != std::floor(*percent))
-        throw RequestError{fmt::format("--ink takes a whole percentage from 0 to 100, not {}",
-                                       in_quotes(wish.substr(colon + 1)))};
-    return {&solid_named(sheet, inks, wish.substr(0, colon)), static_cast<int>(*percent)};
-}
-
 // The patch that was printed with these layers, null where there is none.
 const Patch *measured_of(const std::vector<Layer> &layers, const Inks &inks)
 {
@@ -108,14 +96,14 @@ std::vector<Layer> layers_of(const Tints &tints, const Inks &inks)
     return layers;
 }
 
-std::vector<Layer> layers_named(const std::vector<std::string> &wishes, const Measurement &sheet,
+std::vector<Layer> layers_named(const std::vector<InkTint> &wishes, const Measurement &sheet,
                                 const Inks &inks)
 {
     if (wishes.size() > kMostInks)
         throw RequestError{fmt::format("{} inks; {} are the most", wishes.size(), kMostInks)};
     std::vector<Layer> layers;
-    for (const std::string &wish : wishes) {
-        const Layer layer = layer_of(sheet, inks, wish);
+    for (const InkTint &wish : wishes) {
+        const Layer layer{&solid_named(sheet, inks, wish.name), wish.percent};
         for (const Layer &other : layers)
             if (other.solid == layer.solid)
                 throw RequestError{

@@ -58,9 +58,9 @@ struct PredictRequest {
     int status = E_STATUS;
     std::string paper;              // as paper_of() takes it
     std::vector<std::string> order; // of printing, as Inks takes it
-    // The combination to predict, each NAME:PERCENT, in the order of printing; every measured
-    // overprint of two or three inks where it is empty.
-    std::vector<std::string> inks;
+    // The combination to predict, in the order of printing, each by its solid's patch, name or id,
+    // or by its device field; every measured overprint of two or three inks where it is empty.
+    std::vector<InkTint> inks;
 };
 
 // Throws RequestError.

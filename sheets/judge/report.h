@@ -1,4 +1,4 @@
-// What `vantrel report` says about a sheet.
+// What a sheet says: its patches, inks and paper.
 #pragma once
 
 #include "judge/colour.h"

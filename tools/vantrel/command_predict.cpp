@@ -2,7 +2,11 @@
 
 #include "judge/predict.h"
 #include "options.h"
+#include "read/text.h"
 
+#include <fmt/format.h>
+
+#include <cmath>
 #include <memory>
 
 namespace vantrel::program {
@@ -14,15 +18,30 @@ struct PredictOptions : Options {
     std::vector<std::string> ink_tints; // NAME:PERCENT
 };
 
+// NAME:PERCENT
+InkTint ink_tint(std::string_view wish)
+{
+    const auto colon = wish.rfind(':');
+    if (colon == std::string_view::npos)
+        throw RequestError{fmt::format("--ink takes NAME:PERCENT, not {}", in_quotes(wish))};
+    const auto percent = number_in(wish.substr(colon + 1));
+    if (!percent || *percent < 0 || *percent > 100 || *percent != std::floor(*percent))
+        throw RequestError{fmt::format("--ink takes a whole percentage from 0 to 100, not {}",
+                                       in_quotes(wish.substr(colon + 1)))};
+    return {std::string(wish.substr(0, colon)), static_cast<int>(*percent)};
+}
+
 Outcome run(const PredictOptions &options)
 {
-    const PredictRequest request{
+    PredictRequest request{
         .illuminant = optional_illuminant(options.illuminant),
         .status = status_of(options.status),
         .paper = options.paper,
         .order = options.order,
-        .inks = options.ink_tints,
+        .inks = {},
     };
+    for (const std::string &wish : options.ink_tints)
+        request.inks.push_back(ink_tint(wish));
     Predictions predictions = predict(sheet_of(options.file, options), request);
     std::vector<std::string> warnings = predictions.warnings;
     return outcome_of(std::move(predictions), std::move(warnings), options);
