@@ -12,6 +12,7 @@
 #include <cstdio>
 #include <ctime>
 #include <fstream>
+#include <iostream>
 #include <string>
 #include <string_view>
 #include <sys/resource.h>
@@ -65,13 +66,11 @@ Measurement read(const char *path)
 
 template <typename Result> void write(const Result &result, std::string_view format)
 {
-    std::size_t written = 0;
-    const Sink sink{[&](std::string_view text) { written += text.size(); }};
+    const Sink sink{[](std::string_view) {}};
     if (format == "json")
         write_json(result, sink);
     else
         write_csv(flat_of(result), sink);
-    std::fprintf(stderr, "%zu bytes written\n", written);
 }
 
 } // namespace
@@ -102,10 +101,10 @@ int main(int count, char **arguments)
         phases.end("writing");
         phases.print(command + " as " + format, patches);
     } catch (const InputError &error) {
-        std::fprintf(stderr, "%s\n", error.reason.c_str());
+        std::cerr << error.reason << '\n';
         return 2;
     } catch (const RequestError &error) {
-        std::fprintf(stderr, "%s\n", error.message.c_str());
+        std::cerr << error.message << '\n';
         return 2;
     }
 }
