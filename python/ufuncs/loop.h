@@ -1,7 +1,7 @@
 // The loop of a generalized ufunc over a library function: one template for all of them.
 #pragma once
 
-#include "operand.h"
+#include "lanes/operand.h"
 
 #include <array>
 #include <cfenv>

@@ -4,7 +4,7 @@
 // is shared between object files, and nothing is computed but in lanes.
 #pragma once
 
-#include "../operand.h"
+#include "operand.h"
 
 #include "base/elementary.h"
 #include "base/spectrum.h"

@@ -1,7 +1,7 @@
 // The loops that compute several rows side by side.
 #pragma once
 
-#include "../operand.h"
+#include "operand.h"
 
 #include <span>
 
