@@ -10,6 +10,7 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <memory>
 #include <numeric>
 
 namespace vantrel::sheets {
@@ -155,6 +156,16 @@ std::string sentence_of(const Comparison &comparison)
     return sentence_of(comparison.verdict, comparison, &PairReport::delta_e, comparison.limits);
 }
 
+// "Substrate-corrected: Failed: …", nothing where there is no such verdict.
+std::string corrected_sentence_of(const Comparison &comparison)
+{
+    const auto &corrected = comparison.corrected;
+    if (!corrected || !corrected->verdict)
+        return {};
+    return "Substrate-corrected: " + sentence_of(corrected->verdict, comparison,
+                                                 &PairReport::corrected_delta_e, corrected->limits);
+}
+
 std::string limits_title(const Comparison &comparison)
 {
     return comparison.tolerances.empty() ? "Limits" : "Limits: " + comparison.tolerances;
@@ -173,10 +184,8 @@ void add_verdicts(Lines &lines, const Comparison &comparison)
                           cut(corrected.darkest, kWidestInText)));
     add_statistics(lines, comparison, corrected.statistics);
     add_limits(lines, limits_title(comparison) + ", substrate-corrected", corrected.limits);
-    if (corrected.verdict)
-        lines.add(fmt::format("\nSubstrate-corrected: {}",
-                              sentence_of(corrected.verdict, comparison,
-                                          &PairReport::corrected_delta_e, corrected.limits)));
+    if (const std::string sentence = corrected_sentence_of(comparison); !sentence.empty())
+        lines.add('\n' + sentence);
 }
 
 Json side_json(const Side &side)
@@ -381,6 +390,32 @@ Flat flat_of_unpaired(const Comparison &comparison)
     return flat;
 }
 
+std::string word_of(const std::optional<Verdict> &verdict)
+{
+    return verdict ? std::string(name_of(*verdict)) : std::string();
+}
+
+// What the verdicts rest on, and the warnings.
+Flat flat_of_statements(const Comparison &comparison)
+{
+    struct Statement {
+        std::string name, verdict, note;
+    };
+    const auto rows = std::make_shared<std::vector<Statement>>();
+    rows->push_back({"Verdict", word_of(comparison.verdict), sentence_of(comparison)});
+    if (const std::string sentence = corrected_sentence_of(comparison); !sentence.empty())
+        rows->push_back({"Verdict", word_of(comparison.corrected->verdict), sentence});
+    for (const std::string &warning : comparison.warnings)
+        rows->push_back({"Warning", "", warning});
+    Flat flat;
+    flat.description = comparison.warnings.empty() ? "Verdict" : "Verdict and warnings";
+    flat.rows = rows->size();
+    flat.text("name", "STATEMENT", [rows](std::size_t i) { return (*rows)[i].name; });
+    flat.text("verdict", "VERDICT", [rows](std::size_t i) { return (*rows)[i].verdict; });
+    flat.text("note", "NOTE", [rows](std::size_t i) { return (*rows)[i].note; });
+    return flat;
+}
+
 } // namespace
 
 std::vector<Flat> flat_of(const Comparison &comparison)
@@ -391,6 +426,8 @@ std::vector<Flat> flat_of(const Comparison &comparison)
         fmt::format("{} against {}, {}: {}, {}. {}", comparison.sample, comparison.reference,
                     pairing_of(comparison), name_of(comparison.illuminant),
                     status_name(comparison.status), sentence_of(comparison));
+    if (const std::string sentence = corrected_sentence_of(comparison); !sentence.empty())
+        flat.description += ". " + sentence;
     flat.rows = pairs.size();
     flat.text("id", "SAMPLE_ID", [&pairs](std::size_t i) { return pairs[i].sample.id; });
     flat.text("name", "SAMPLE_NAME", [&pairs](std::size_t i) { return pairs[i].sample.name; });
@@ -434,9 +471,8 @@ std::vector<Flat> flat_of(const Comparison &comparison)
               [&comparison](std::size_t) { return said(comparison.sample_paper); });
     flat.text("reference_paper", "REFERENCE_PAPER",
               [&comparison](std::size_t) { return said(comparison.reference_paper); });
-    flat.text("verdict", "VERDICT", [&comparison](std::size_t) {
-        return comparison.verdict ? std::string(name_of(*comparison.verdict)) : std::string();
-    });
+    flat.text("verdict", "VERDICT",
+              [&comparison](std::size_t) { return word_of(comparison.verdict); });
     if (pairs.front().sample.refl)
         flat.spectrum(
             [&pairs](std::size_t i) -> const Spectrum & { return *pairs[i].sample.refl; });
@@ -448,6 +484,7 @@ std::vector<Flat> flat_of(const Comparison &comparison)
     if (comparison.corrected && !comparison.corrected->limits.empty())
         tables.push_back(flat_of(comparison.corrected->limits, "substrate-corrected",
                                  limits_title(comparison) + ", substrate-corrected"));
+    tables.push_back(flat_of_statements(comparison));
     return tables;
 }
 
