@@ -100,6 +100,8 @@ PairReport pair_report(const Sheet &references, const Sheet &samples, const Pair
                                             : response_of(samples, sample.patch, status);
     out.reference = side_of(references, reference, terms, out.response);
     out.sample = side_of(samples, sample, terms, out.response);
+    if (out.reference.density && out.sample.density)
+        out.density_difference = *out.sample.density - *out.reference.density;
     out.device = reference.patch.device.empty() ? sample.patch.device : reference.patch.device;
     for (const Metric &metric : terms.request.metrics)
         out.delta_e.push_back(metric(out.reference.colour.lab, out.sample.colour.lab));
@@ -128,17 +130,41 @@ std::vector<Statistics> all_statistics(const std::vector<PairReport> &pairs,
     return out;
 }
 
-// By the largest difference in the first metric, by the limits, and by what found no partner.
+// How many pairs exceed the tolerance in the first metric; what is not a number does.
+std::size_t count_above(const std::vector<PairReport> &pairs, Differences differences,
+                        const std::optional<double> &tolerance)
+{
+    return static_cast<std::size_t>(
+        std::count_if(pairs.begin(), pairs.end(), [&](const PairReport &pair) {
+            return tolerance && !((pair.*differences)[0] <= *tolerance);
+        }));
+}
+
+// By the pairs above the tolerance, by the limits, and by what found no partner.
 std::optional<Verdict> verdict_of(const CompareRequest &request, const Coverage &coverage,
-                                  double largest, const std::vector<LimitResult> &limits)
+                                  std::size_t above, const std::vector<LimitResult> &limits)
 {
     if (!request.tolerance && request.tolerances.limits.empty())
         return std::nullopt;
-    const bool above = request.tolerance && !(largest <= *request.tolerance);
-    return worse(above                 ? Verdict::failed
+    return worse(above > 0             ? Verdict::failed
                  : coverage.complete() ? Verdict::passed
                                        : Verdict::incomplete,
                  verdict_of(limits));
+}
+
+std::optional<Means> means_of(const std::vector<PairReport> &pairs, Side PairReport::*side)
+{
+    std::optional<Means> out;
+    for (const PairReport &pair : pairs) {
+        const Side &one = pair.*side;
+        if (!one.spread)
+            continue;
+        const std::size_t patches = out ? out->patches + 1 : 1;
+        if (!out || *one.spread > out->spread)
+            out = {patches, one.name, one.repeats, *one.spread};
+        out->patches = patches;
+    }
+    return out;
 }
 
 // The aim of the least L* among all of the reference.
@@ -176,8 +202,9 @@ SubstrateCorrected substrate_corrected(std::vector<PairReport> &pairs,
         controls[i].aim = *pairs[i].corrected_aim;
     }
     out.statistics = all_statistics(pairs, &PairReport::corrected_delta_e);
+    out.above = count_above(pairs, &PairReport::corrected_delta_e, terms.request.tolerance);
     out.limits = judge_limits(terms.request.tolerances, controls);
-    out.verdict = verdict_of(terms.request, coverage, out.statistics[0].max, out.limits);
+    out.verdict = verdict_of(terms.request, coverage, out.above, out.limits);
     return out;
 }
 
@@ -311,6 +338,8 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
                    .tolerance = request.tolerance,
                    .pairs = {},
                    .statistics = {},
+                   .reference_means = {},
+                   .sample_means = {},
                    .worst = {},
                    .coverage = coverage_of(pairs, reference, sample, request.allow_missing),
                    .only_reference = unpaired_of(reference, pairs.only_reference),
@@ -336,8 +365,11 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
     const std::vector<ControlPatch> controls = control_patches(
         out.pairs, references.paper, samples.paper, request.status, reference.collection);
     out.statistics = all_statistics(out.pairs, &PairReport::delta_e);
+    out.above = count_above(out.pairs, &PairReport::delta_e, request.tolerance);
+    out.reference_means = means_of(out.pairs, &PairReport::reference);
+    out.sample_means = means_of(out.pairs, &PairReport::sample);
     out.limits = judge_limits(request.tolerances, controls);
-    out.verdict = verdict_of(request, out.coverage, out.statistics[0].max, out.limits);
+    out.verdict = verdict_of(request, out.coverage, out.above, out.limits);
     if (request.substrate_corrected)
         out.corrected =
             substrate_corrected(out.pairs, controls, references, samples, terms, out.coverage);

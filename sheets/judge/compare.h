@@ -54,6 +54,7 @@ struct PairReport {
     std::optional<double> metamerism; // sum of two ΔE*ab
     std::optional<double> din6172;
     std::optional<int> response; // the one that reads the reference, or else the sample
+    std::optional<double> density_difference; // from the reference to the sample
     // Against the aim as it is on the sample's paper.
     std::optional<CIELABCOORD> corrected_aim;
     std::vector<double> corrected_delta_e; // for each metric
@@ -67,8 +68,17 @@ struct SubstrateCorrected {
     CIELABCOORD aim_paper{}, paper{};
     std::string darkest; // aim, which stays
     std::vector<Statistics> statistics;
+    std::size_t above = 0;
     std::vector<LimitResult> limits;
     std::optional<Verdict> verdict;
+};
+
+// Patches of one side that are means of several measurements.
+struct Means {
+    std::size_t patches = 0;
+    std::string widest; // the patch of the largest spread
+    std::size_t repeats = 0;
+    double spread = 0;
 };
 
 // From the paper of the reference to that of the sample.
@@ -109,7 +119,9 @@ struct Comparison {
     std::vector<PairReport> pairs;
     LeftOut left_out;                   // by choose_for_page()
     std::vector<Statistics> statistics; // of the pairs, for each metric
-    std::vector<std::size_t> worst;     // ten at most, by the first metric
+    std::size_t above = 0;              // so many pairs exceed the tolerance in the first metric
+    std::optional<Means> reference_means, sample_means;
+    std::vector<std::size_t> worst; // ten at most, by the first metric
     Coverage coverage;
     std::vector<Unpaired> only_reference, only_sample;
     std::string tolerances; // their name

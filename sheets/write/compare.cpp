@@ -16,13 +16,6 @@
 namespace vantrel::sheets {
 namespace {
 
-std::optional<double> density_difference(const PairReport &pair)
-{
-    if (!pair.reference.density || !pair.sample.density)
-        return std::nullopt;
-    return *pair.sample.density - *pair.reference.density;
-}
-
 void add_pairs(Lines &lines, const Comparison &comparison, const std::vector<std::size_t> &chosen,
                bool colour)
 {
@@ -49,7 +42,7 @@ void add_pairs(Lines &lines, const Comparison &comparison, const std::vector<std
         lines.add(line +
                   fmt::format("{:>4}{:>7}{:>7}  {}",
                               pair.response ? response_code(comparison.status, *pair.response) : "",
-                              fixed(density_difference(pair), 3), fixed(pair.metamerism),
+                              fixed(pair.density_difference, 3), fixed(pair.metamerism),
                               pair.verbal.value_or("")));
     }
 }
@@ -81,25 +74,13 @@ std::string pairing_of(const Comparison &comparison)
     return phrase_of(comparison.paired_by) + (others.empty() ? "" : " (" + others + ")");
 }
 
-void add_repeats(Lines &lines, const Comparison &comparison)
+void add_means(Lines &lines, const std::string &file, const std::optional<Means> &means)
 {
-    for (const auto &[side, file] : {std::pair{&PairReport::reference, &comparison.reference},
-                                     std::pair{&PairReport::sample, &comparison.sample}}) {
-        const Side *widest = nullptr;
-        std::size_t patches = 0;
-        for (const PairReport &pair : comparison.pairs) {
-            const Side &one = pair.*side;
-            patches += one.spread ? 1 : 0;
-            if (one.spread && (!widest || *one.spread > *widest->spread))
-                widest = &one;
-        }
-        if (widest)
-            lines.add(
-                fmt::format("\nMeans of repeats in {}: {} patches; the widest, {}, has {} up to "
-                            "ΔE00 {} from their mean",
-                            *file, patches, cut(widest->name, kWidestInText), widest->repeats,
-                            fixed(widest->spread)));
-    }
+    if (means)
+        lines.add(fmt::format("\nMeans of repeats in {}: {} patches; the widest, {}, has {} up to "
+                              "ΔE00 {} from their mean",
+                              file, means->patches, cut(means->widest, kWidestInText),
+                              means->repeats, fixed(means->spread)));
 }
 
 void add_unpaired(Lines &lines, const std::string &file, const std::vector<Unpaired> &unpaired)
@@ -128,8 +109,7 @@ std::string told(const Coverage &coverage)
 // "Failed: 3 of 5 pairs are above ΔE00 2; all 7 limits are held; judged 5 of 5 patches by 5 of 5
 // aims"
 std::string sentence_of(const std::optional<Verdict> &verdict, const Comparison &comparison,
-                        std::vector<double> PairReport::*differences,
-                        const std::vector<LimitResult> &limits)
+                        std::size_t above, const std::vector<LimitResult> &limits)
 {
     if (!verdict)
         return "No tolerance given; " + told(comparison.coverage);
@@ -137,13 +117,10 @@ std::string sentence_of(const std::optional<Verdict> &verdict, const Comparison 
     word[0] = static_cast<char>(word[0] - 'a' + 'A');
     std::string reasons;
     if (comparison.tolerance) {
-        const auto above = std::count_if(
-            comparison.pairs.begin(), comparison.pairs.end(), [&](const PairReport &pair) {
-                return !((pair.*differences)[0] <= *comparison.tolerance);
-            });
         const std::string title = title_of(comparison.metrics[0]);
-        reasons = above ? fmt::format("{} of {} pairs are above {} {:g}", above,
-                                      comparison.pairs.size(), title, *comparison.tolerance)
+        const std::size_t pairs = comparison.pairs.size() + comparison.left_out.count;
+        reasons = above ? fmt::format("{} of {} pairs are above {} {:g}", above, pairs, title,
+                                      *comparison.tolerance)
                         : fmt::format("no {} is above {:g}", title, *comparison.tolerance);
     }
     if (!limits.empty())
@@ -153,7 +130,7 @@ std::string sentence_of(const std::optional<Verdict> &verdict, const Comparison 
 
 std::string sentence_of(const Comparison &comparison)
 {
-    return sentence_of(comparison.verdict, comparison, &PairReport::delta_e, comparison.limits);
+    return sentence_of(comparison.verdict, comparison, comparison.above, comparison.limits);
 }
 
 // "Substrate-corrected: Failed: …", nothing where there is no such verdict.
@@ -162,8 +139,8 @@ std::string corrected_sentence_of(const Comparison &comparison)
     const auto &corrected = comparison.corrected;
     if (!corrected || !corrected->verdict)
         return {};
-    return "Substrate-corrected: " + sentence_of(corrected->verdict, comparison,
-                                                 &PairReport::corrected_delta_e, corrected->limits);
+    return "Substrate-corrected: " +
+           sentence_of(corrected->verdict, comparison, corrected->above, corrected->limits);
 }
 
 std::string limits_title(const Comparison &comparison)
@@ -198,6 +175,16 @@ Json side_json(const Side &side)
             {"refl", or_null(side.refl)},
             {"repeats", side.repeats},
             {"spread", or_null(side.spread)}};
+}
+
+Json means_json(const std::optional<Means> &means)
+{
+    if (!means)
+        return {};
+    return {{"patches", means->patches},
+            {"widest", means->widest},
+            {"repeats", means->repeats},
+            {"spread", means->spread}};
 }
 
 Json sheet_json(const std::string &file, const PaperChoice &paper)
@@ -236,7 +223,7 @@ Json pair_json(const PairReport &pair, const Comparison &comparison)
     out["din6172"] = or_null(pair.din6172);
     out["response"] =
         pair.response ? Json(response_name(comparison.status, *pair.response)) : Json();
-    out["density_difference"] = or_null(density_difference(pair));
+    out["density_difference"] = or_null(pair.density_difference);
     if (!pair.corrected_aim)
         return out;
     Json &corrected = out["corrected"];
@@ -300,7 +287,8 @@ void write_table(const Comparison &comparison, const Sink &sink, const TableStyl
         lines.add(
             fmt::format("\nBetween the papers: ΔE00 {}{}", fixed(papers->de00),
                         papers->metamerism ? ", metamerism " + fixed(papers->metamerism) : ""));
-    add_repeats(lines, comparison);
+    add_means(lines, comparison.reference, comparison.reference_means);
+    add_means(lines, comparison.sample, comparison.sample_means);
     add_unpaired(lines, comparison.reference, comparison.only_reference);
     add_unpaired(lines, comparison.sample, comparison.only_sample);
     add_verdicts(lines, comparison);
@@ -349,6 +337,9 @@ void write_json(const Comparison &comparison, const Sink &sink)
         {"limits", limits_json(comparison.limits)},
         {"corrected", corrected_json(comparison)},
         {"statistics", statistics_json(comparison, comparison.statistics)},
+        {"means",
+         {{"reference", means_json(comparison.reference_means)},
+          {"sample", means_json(comparison.sample_means)}}},
         {"worst", comparison.worst},
         {"unpaired",
          {{"reference", names_json(comparison.only_reference)},

@@ -28,19 +28,10 @@ const papersNote = ({ reference, sample, papers }) => h('p', { class: 'note' },
   papers ? `; between them ΔE00 ${fixed(papers.de00)}` +
     (papers.metamerism === null ? '' : `, metamerism ${fixed(papers.metamerism)}`) : '', '.');
 
-// The widest of the means of several measurements.
-function repeats(result) {
-  const side = (key) => {
-    const means = result.pairs.map((pair) => pair[key]).filter(({ spread }) => spread !== null);
-    if (!means.length)
-      return null;
-    const widest = means.reduce((one, other) => (other.spread > one.spread ? other : one));
-    return h('p', { class: 'note' }, `${count(means.length, 'patch')} of the ${key} as the mean of ` +
-      'repeats; the widest, ', named(widest.name),
-    `, has ${widest.repeats} up to ΔE00 ${fixed(widest.spread)} from their mean.`);
-  };
-  return [side('reference'), side('sample')];
-}
+const repeats = ({ means }) => ['reference', 'sample'].map((side) => means[side] &&
+  h('p', { class: 'note' }, `${count(means[side].patches, 'patch')} of the ${side} as the mean of ` +
+    'repeats; the widest, ', named(means[side].widest),
+  `, has ${means[side].repeats} up to ΔE00 ${fixed(means[side].spread)} from their mean.`));
 
 const digits = (limit) => (limit.formula === 'density' ? 3 : 2);
 const statisticNames = { maximum: 'largest', mean: 'mean', p95: '95th percentile' };
