@@ -1,8 +1,8 @@
 // The pairs of a comparison as limits judge them.
 #pragma once
 
-#include "judge/compare.h"
 #include "judge/limits.h"
+#include "judge/pair_report.h"
 #include "judge/paper.h"
 
 #include <vector>
