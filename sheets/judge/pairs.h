@@ -3,6 +3,7 @@
 
 #include "read/measurement.h"
 
+#include <array>
 #include <cstddef>
 #include <string>
 #include <string_view>
@@ -11,6 +12,8 @@
 namespace vantrel::sheets {
 
 enum class Pairing { automatic, name, id, device, order };
+inline constexpr std::array kPairings = {Pairing::automatic, Pairing::name, Pairing::id,
+                                         Pairing::device, Pairing::order};
 std::string_view name_of(Pairing pairing); // auto, name, id, device, order
 std::string phrase_of(Pairing pairing);    // "by device values": not of automatic
 

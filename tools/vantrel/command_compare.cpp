@@ -86,12 +86,19 @@ std::vector<Metric> metrics_of(const CompareOptions &options)
     return metrics;
 }
 
+std::vector<std::string> pairing_names()
+{
+    std::vector<std::string> out;
+    for (const Pairing pairing : kPairings)
+        out.emplace_back(name_of(pairing));
+    return out;
+}
+
+// Of one of these names.
 Pairing pairing_of(const std::string &name)
 {
-    for (const Pairing pairing : {Pairing::name, Pairing::id, Pairing::device, Pairing::order})
-        if (name == name_of(pairing))
-            return pairing;
-    return Pairing::automatic;
+    return *std::find_if(kPairings.begin(), kPairings.end(),
+                         [&](Pairing pairing) { return name == name_of(pairing); });
 }
 
 Tolerances tolerances_of(const std::string &path)
@@ -183,7 +190,7 @@ Command add_compare(CLI::App &app)
     command
         ->add_option("--pair", options->pairing,
                      "Pair patches by: auto, name, id, device (values) or order")
-        ->check(CLI::IsMember({"auto", "name", "id", "device", "order"}))
+        ->check(CLI::IsMember(pairing_names()))
         ->capture_default_str();
     command->add_flag("--force-pairs", options->force_pairs,
                       "Take pairs too whose device values disagree");
