@@ -170,8 +170,8 @@ constexpr const char *kFooter =
     "sum of the two\nDelta E*ab under the two illuminants; DIN 6172 tells how far the difference "
     "moves between them.\nDensities are over each sheet's own paper, in the response that reads "
     "the reference.\n\n"
-    "CSV and CGATS have a row for each pair, with the spectrum of the sample. The fields of the "
-    "JSON\nstand in docs/json.md.\n\n"
+    "CSV and CGATS have a row for each pair, with the spectrum of the sample, and end with the "
+    "verdict\nand the warnings. The fields of the JSON stand in docs/json.md.\n\n"
     "Example:\n"
     "  vantrel compare reference.txt sheet.txt --formula de2000,cmc --weights cmc=1,1 --tolerance "
     "2.0";
