@@ -46,7 +46,7 @@ FirmResponse<V> firm_response(const BandsOf<V> &refl, const LabOf<V> &lab, int s
     const AchromaticLine &line = achromatic_line();
     const V C = chroma(lab);
     const auto chromatic = line.is_chromatic(lab.L, C);
-    FirmResponse<V> result = {VISUAL_RESPONSE, C == C};
+    FirmResponse<V> result = {VISUAL_RESPONSE, C >= 0}; // no if C is not a number
     for (const double dL : {-kLightnessMargin, kLightnessMargin})
         for (const double dC : {-kChromaMargin, kChromaMargin})
             result.firm = result.firm & !(line.is_chromatic(lab.L + dL, C + dC) ^ chromatic);
