@@ -6,10 +6,12 @@
 
 #include <algorithm>
 #include <array>
+#include <charconv>
 #include <cstdint>
 #include <cstring>
 #include <optional>
 #include <string_view>
+#include <system_error>
 #include <utility>
 
 namespace vantrel::sheets {
@@ -18,6 +20,7 @@ namespace {
 constexpr double kLeastRange = 5;    // of the reflectances in a band of a sheet that is printed on
 constexpr double kDeadRange = 0.01;  // of those in a band that measures nothing
 constexpr double kNoise = 0.5;       // of an instrument near black
+constexpr double kSpike = 10;        // of a band beyond both its neighbours; brightener reaches 6
 constexpr double kFullTint = 50;     // from which on an ink shows its colour
 constexpr double kMostOfBlack = 0.6; // between the densities of a black
 constexpr double kLeastOfInk = 0.1;  // between those of two filters, beyond what paper and noise do
@@ -80,30 +83,102 @@ std::uint64_t hash_of(const Spectrum &refl)
     return hash;
 }
 
+// A band that stands out of the two beside it: reflectances change slowly along the spectrum.
+void doubt_spikes(const std::vector<Patch> &patches, std::vector<Doubt> &out)
+{
+    const Patch *first = nullptr;
+    std::size_t count = 0, place = 0;
+    for (const Patch &patch : patches)
+        for (std::size_t band = 1; band + 1 < patch.refl.size(); ++band) {
+            const auto [low, high] = std::minmax(patch.refl[band - 1], patch.refl[band + 1]);
+            const double apart = std::max(kSpike, high / 10);
+            if (patch.refl[band] >= low - apart && patch.refl[band] <= high + apart)
+                continue;
+            if (!first) {
+                first = &patch;
+                place = band;
+            }
+            ++count;
+            break;
+        }
+    if (first)
+        out.push_back(
+            {first->line,
+             fmt::format("{} reads {:.4g} % at {}, but {:.4g} and {:.4g} % beside it{}",
+                         in_quotes(first->name), first->refl[place], nm_of(place),
+                         first->refl[place - 1], first->refl[place + 1], and_more(count))});
+}
+
+// A whole id of up to nine digits.
+std::optional<long> number_of(const std::string &id)
+{
+    long out = 0;
+    const auto [end, error] = std::from_chars(id.data(), id.data() + id.size(), out);
+    const bool whole = error == std::errc() && end == id.data() + id.size() && id.size() <= 9;
+    return whole ? std::optional(out) : std::nullopt;
+}
+
+// Ids that count the patches, and leave out some of them. A choice of a chart leaves out most.
+void doubt_ids(const std::vector<Patch> &patches, std::vector<Doubt> &out)
+{
+    const Patch *before = nullptr, *after = nullptr; // at the first gap
+    std::optional<long> begin, last;
+    for (const Patch &patch : patches) {
+        const std::optional<long> id = number_of(patch.id);
+        if (!id || (last && *id <= *last))
+            return;
+        if (last && *id > *last + 1 && !after) {
+            before = &patch - 1;
+            after = &patch;
+        }
+        begin = begin ? begin : id;
+        last = id;
+    }
+    if (!after)
+        return;
+    const std::size_t counted = static_cast<std::size_t>(*last - *begin) + 1;
+    if (counted - patches.size() <= patches.size() / 2)
+        out.push_back(
+            {after->line,
+             fmt::format("by their ids there are {} patches, {} are here: after {} "
+                         "comes {}",
+                         counted, patches.size(), in_quotes(before->id), in_quotes(after->id))});
+}
+
 // No instrument reads two patches alike to the last digit of every band.
 void doubt_copies(const std::vector<Patch> &patches, std::vector<Doubt> &out)
 {
+    struct Copies {
+        std::optional<std::pair<std::size_t, std::size_t>> first;
+        std::size_t count = 0;
+    } strangers, repeats; // of other device values; of the same, or none
     std::vector<std::pair<std::uint64_t, std::size_t>> hashes;
     for (std::size_t i = 0; i < patches.size(); ++i)
-        if (!patches[i].device.empty())
-            hashes.emplace_back(hash_of(patches[i].refl), i);
+        hashes.emplace_back(hash_of(patches[i].refl), i);
     std::sort(hashes.begin(), hashes.end());
-    std::optional<std::pair<std::size_t, std::size_t>> first;
-    std::size_t count = 0;
     for (std::size_t i = 1; i < hashes.size(); ++i) {
         const std::pair both{hashes[i - 1].second, hashes[i].second};
         const Patch &one = patches[both.first], &other = patches[both.second];
-        if (one.refl != other.refl || one.device == other.device)
+        if (one.refl != other.refl)
             continue;
-        first = std::min(first.value_or(both), both);
-        ++count;
+        Copies &copies = one.device == other.device ? repeats : strangers;
+        copies.first = std::min(copies.first.value_or(both), both);
+        ++copies.count;
     }
-    if (first)
-        out.push_back({patches[first->second].line,
+    if (strangers.first)
+        out.push_back({patches[strangers.first->second].line,
                        fmt::format("{} and {} have different device values, but the same spectrum "
                                    "to the last digit{}",
-                                   in_quotes(patches[first->first].name),
-                                   in_quotes(patches[first->second].name), and_more(count))});
+                                   in_quotes(patches[strangers.first->first].name),
+                                   in_quotes(patches[strangers.first->second].name),
+                                   and_more(strangers.count))});
+    if (repeats.first)
+        out.push_back(
+            {patches[repeats.first->second].line,
+             fmt::format("{} has the spectrum of {} to the last digit{}: is a "
+                         "measurement here twice?",
+                         in_quotes(patches[repeats.first->second].name),
+                         in_quotes(patches[repeats.first->first].name), and_more(repeats.count))});
 }
 
 struct Ink {
@@ -172,6 +247,8 @@ std::vector<Doubt> doubts_about(const std::vector<Patch> &patches)
     std::vector<Doubt> out;
     doubt_bands(patches, out);
     doubt_signs(patches, out);
+    doubt_spikes(patches, out);
+    doubt_ids(patches, out);
     doubt_copies(patches, out);
     doubt_inks(patches, out);
     return out;

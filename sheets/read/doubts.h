@@ -14,9 +14,9 @@ struct Doubt {
     std::string text;
 };
 
-// Of reflectances in percent: bands that read the same everywhere, reflectances below zero, spectra
-// that stand twice under different device values, and solids that read as another ink than these
-// say.
+// Of reflectances in percent: bands that read the same everywhere or stand out of those beside
+// them, reflectances below zero, gaps in the count of ids, spectra that stand twice, and solids
+// that read as another ink than the device values say.
 std::vector<Doubt> doubts_about(const std::vector<Patch> &patches);
 
 } // namespace vantrel::sheets
