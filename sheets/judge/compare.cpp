@@ -17,7 +17,8 @@ namespace vantrel::sheets {
 namespace {
 
 constexpr std::size_t kMostWorst = 10;
-constexpr double kFarOff = 3; // a colour difference that is no scatter
+constexpr double kFarOff = 3;   // a colour difference that is no scatter
+constexpr double kWideMean = 1; // as for the patches of a paper, in ΔE00
 
 // One of the two sheets.
 struct Sheet {
@@ -264,19 +265,42 @@ void warn_of_uneven(const Pairs &pairs, const Measurement &reference, const Meas
         served[pair.reference.front()] += pair.sample.size();
     for (const auto &[aim, patches] : served)
         ++often[patches];
+    // Of counts that are as frequent, the largest.
     const std::size_t most =
-        std::max_element(often.begin(), often.end(), [](const auto &first, const auto &second) {
+        std::max_element(often.rbegin(), often.rend(), [](const auto &first, const auto &second) {
             return first.second < second.second;
         })->first;
-    std::string fewer;
+    std::string others;
     std::size_t aims = 0;
     for (const auto &[aim, patches] : served)
-        if (patches < most && ++aims <= 3)
-            fewer += fmt::format("{}{} ({})", fewer.empty() ? "" : ", ",
-                                 in_quotes(reference.patches[aim].name), patches);
+        if (patches % most != 0 && ++aims <= 3)
+            others += fmt::format("{}{} ({})", others.empty() ? "" : ", ",
+                                  in_quotes(reference.patches[aim].name), patches);
     if (aims > 0)
-        warnings.push_back(fmt::format("{}: most aims have {} patches, {} have fewer: {}{}",
-                                       sample.file, most, aims, fewer, aims > 3 ? ", …" : ""));
+        warnings.push_back(fmt::format("{}: most aims have {} patches, {} another number: {}{}",
+                                       sample.file, most, aims, others, aims > 3 ? ", …" : ""));
+}
+
+void warn_of_wide_means(const std::optional<Means> &means, const std::string &file,
+                        std::vector<std::string> &warnings)
+{
+    if (means && means->spread > kWideMean)
+        warnings.push_back(fmt::format("{}: the {} patches of {} are up to ΔE00 {:.2f} from their "
+                                       "mean, which is judged",
+                                       file, means->repeats, in_quotes(means->widest),
+                                       means->spread));
+}
+
+// Two measurements of one patch never agree to the last digit.
+void warn_of_same(Comparison &out)
+{
+    const auto same = [](const PairReport &pair) {
+        return pair.reference.refl && pair.reference.refl == pair.sample.refl;
+    };
+    if (!out.pairs.empty() && std::all_of(out.pairs.begin(), out.pairs.end(), same))
+        out.warnings.push_back(fmt::format(
+            "{} and {} hold the same spectra to the last digit, as one measurement does",
+            out.reference, out.sample));
 }
 
 // Two of the worst pairs that would agree if their samples changed places.
@@ -375,6 +399,9 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
             substrate_corrected(out.pairs, controls, references, samples, terms, out.coverage);
     out.worst = largest_first(values_of(out.pairs, &PairReport::delta_e, 0));
     out.worst.resize(std::min(out.worst.size(), kMostWorst));
+    warn_of_wide_means(out.reference_means, reference.file, out.warnings);
+    warn_of_wide_means(out.sample_means, sample.file, out.warnings);
+    warn_of_same(out);
     warn_of_exchanged(out);
     return out;
 }
