@@ -256,7 +256,8 @@ std::vector<Unpaired> unpaired_of(const Measurement &sheet, const std::vector<st
     return out;
 }
 
-// Where most aims serve several patches, one in each zone, say, and some serve fewer.
+// Where most aims serve several patches, one in each zone, say, and some another number that is no
+// multiple of it.
 void warn_of_uneven(const Pairs &pairs, const Measurement &reference, const Measurement &sample,
                     std::vector<std::string> &warnings)
 {
