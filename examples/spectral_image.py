@@ -39,14 +39,9 @@ def make(folder, rows):
 
     random = np.random.default_rng(1)
     chunks = (TOGETHER, COLUMNS, BANDS)
-    stored = zarr.create_array(
-        folder / "image.zarr",
-        shape=(rows, COLUMNS, BANDS),
-        chunks=chunks,
-        dtype="f8",
-        compressors=None,
-        overwrite=True,
-    )
+    shape = (rows, COLUMNS, BANDS)
+    store = str(folder / "image.zarr")
+    stored = zarr.open_array(store, mode="w", shape=shape, chunks=chunks, dtype="f8")
     with open(folder / "image.raw", "wb") as file:
         for first in range(0, rows, TOGETHER):
             shape = (min(TOGETHER, rows - first), COLUMNS, BANDS)

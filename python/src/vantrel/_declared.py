@@ -97,6 +97,8 @@ class Declared:
                 key.append(_HANDED_ON)
             elif kind is float and shape == ():
                 key.append(_HANDED_ON)
+            elif kind is str:
+                key.append(value)
             elif kind in _REMEMBERED:
                 key.append((kind, value))
             else:
@@ -107,11 +109,15 @@ class Declared:
             return None
         if seen is None:
             values = self.prepare(self.bind(args, {}))
-            handed_on = [k is _HANDED_ON for k in key] + [False] * (len(values) - len(key))
-            seen = [None if h else np.asarray(v) for h, v in zip(handed_on, values)]
+            seen = [np.asarray(v) for v in values], [i for i, k in enumerate(key) if k is _HANDED_ON]
+            for i in seen[1]:
+                seen[0][i] = None
             if len(self.seen) < _MOST_REMEMBERED:
                 self.seen[key] = seen
-        return [s if a is None else a for a, s in zip(seen, args)] + seen[len(args) :]
+        prepared = seen[0].copy()
+        for i in seen[1]:
+            prepared[i] = args[i]
+        return prepared
 
     def result_types(self, ok):
         """(names of the core dimensions, type) of each output."""
