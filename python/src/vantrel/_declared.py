@@ -22,7 +22,7 @@ WORDS = {"verbal_color_difference": np.array(_ufuncs.difference_words)}
 
 _DOUBLE = np.dtype(np.float64)
 _HANDED_ON = object()  # a value that is not remembered
-_REMEMBERED = {str, int, type(None), IllumObs, Status, Response}
+_ENUMERATIONS = {IllumObs, Status, Response}
 _MOST_REMEMBERED = 1000  # calls of a function
 
 
@@ -42,7 +42,9 @@ class Declared:
         self.names = [p.name for p in self.parameters]
         self.kinds = [p.annotation for p in self.parameters]
         self.spectral = [is_spectral(*pair) for pair in zip(self.kinds, self.cores)]
-        self.shapes = [_shape(*pair) for pair in zip(self.kinds, self.cores)]
+        self.without_spectra = not any(self.spectral)
+        self.last = [_last(*pair) for pair in zip(self.kinds, self.cores)]
+        self.dtypes = [np.dtype(t) for t in self.ufunc.types[0].partition("->")[0]]
         self.seen = {}
         self.defaults = {p.name: p.default for p in self.parameters if p.default is not p.empty}
 
@@ -86,32 +88,32 @@ class Declared:
 
         None where there is anything else among the arguments, and where spectra may be fractions.
         """
-        key, percent = [], not any(self.spectral)
-        for value, shape, spectral in zip(args, self.shapes, self.spectral):
+        if len(args) > len(self.names):
+            return None
+        key, percent = [], self.without_spectra
+        for value, last, spectral in zip(args, self.last, self.spectral):
             kind = type(value)
             if kind is np.ndarray:
-                if shape is None or value.dtype is not _DOUBLE or value.shape[-1:] != shape[-1:]:
+                if value.dtype is not _DOUBLE or value.shape[-1:] != last:
                     return None
                 if spectral and not percent and value.size:
                     percent = value.item(0) > FRACTION or value.item(-1) > FRACTION
                 key.append(_HANDED_ON)
-            elif kind is float and shape == ():
-                key.append(_HANDED_ON)
-            elif kind is str:
+            elif kind is str or kind is int or value is None:
                 key.append(value)
-            elif kind in _REMEMBERED:
+            elif kind is float and last == ():
+                key.append(_HANDED_ON)
+            elif kind in _ENUMERATIONS:
                 key.append((kind, value))
             else:
                 return None
+        if not percent:
+            return None
         key = tuple(key)
         seen = self.seen.get(key)
-        if not percent or len(args) > len(key):
-            return None
         if seen is None:
-            values = self.prepare(self.bind(args, {}))
-            seen = [np.asarray(v) for v in values], [i for i, k in enumerate(key) if k is _HANDED_ON]
-            for i in seen[1]:
-                seen[0][i] = None
+            values = zip(self.prepare(self.bind(args, {})), self.dtypes)
+            seen = [np.asarray(*v) for v in values], [i for i, k in enumerate(key) if k is _HANDED_ON]
             if len(self.seen) < _MOST_REMEMBERED:
                 self.seen[key] = seen
         prepared = seen[0].copy()
@@ -140,8 +142,8 @@ def _cores(signature):
     return [[d for d in core.split(",") if d] for core in signature[1:-1].split("),(")]
 
 
-def _shape(kind, core):
-    """That of a core of doubles; None for other kinds, and for more than one dimension."""
+def _last(kind, core):
+    """The end of the shape of doubles; None for other kinds, and for more than one dimension."""
     if kind not in ("Spectra", "OptionalSpectra", "Colours", "Numbers") or len(core) > 1:
         return None
     return tuple(int(d) if d.isdigit() else BANDS for d in core)
