@@ -87,7 +87,7 @@ int main(int count, char **arguments)
         phases.end("reading");
         if (command == "report") {
             std::vector<Report> reports;
-            reports.push_back(report_of(sheet, {}));
+            reports.push_back(report_of(std::move(sheet), {}));
             phases.end("judging");
             write(reports, format);
         } else {

@@ -41,8 +41,10 @@ IlluminantReading under_illuminant(const Spectrum &refl, const Spectrum *other, 
 
 } // namespace
 
-PatchStudy study_of(const Measurement &sheet, const InkRequest &request)
+PatchStudy study_of(Measurement measurement, const InkRequest &request)
 {
+    const auto kept = std::make_shared<const Measurement>(std::move(measurement));
+    const Measurement &sheet = *kept;
     std::vector<std::string> warnings = reading_warnings(sheet);
     const IlluminantChoice illuminant = illuminant_for(request.illuminant, {&sheet}, warnings);
     const Paper paper = paper_of(sheet, request.paper, illuminant, warnings);
@@ -50,7 +52,7 @@ PatchStudy study_of(const Measurement &sheet, const InkRequest &request)
     const Patch *other = request.against.empty() ? nullptr : &patch_named(sheet, request.against);
     const Inks inks(sheet, request.order);
     const Conditions conditions{sheet, inks, paper, illuminant, request.status};
-    PatchStudy out{.file = sheet.file,
+    PatchStudy out{.sheet = kept,
                    .illuminant = illuminant,
                    .status = request.status,
                    .paper = paper.choice,

@@ -5,6 +5,7 @@
 #include "judge/report.h"
 
 #include <array>
+#include <memory>
 #include <optional>
 #include <string>
 #include <vector>
@@ -33,7 +34,7 @@ struct Against {
 };
 
 struct PatchStudy {
-    std::string file;
+    std::shared_ptr<const Measurement> sheet;
     IlluminantChoice illuminant;
     int status;
     PaperChoice paper;
@@ -55,6 +56,6 @@ struct InkRequest {
 };
 
 // Throws RequestError.
-PatchStudy study_of(const Measurement &sheet, const InkRequest &request);
+PatchStudy study_of(Measurement measurement, const InkRequest &request);
 
 } // namespace vantrel::sheets

@@ -75,18 +75,17 @@ MetamerismReport metamerism_of(const Measurement &sheet, const Paper &paper, ILL
     return out;
 }
 
-std::vector<ToneCurve> tone_curves(const Measurement &sheet, const Inks &inks,
-                                   const std::vector<PatchReport> &rows)
+std::vector<ToneCurve> tone_curves(const Inks &inks, const std::vector<PatchReport> &rows)
 {
     std::vector<std::map<double, ToneValue>> sums(inks.names().size());
-    for (std::size_t i = 0; i < rows.size(); ++i) {
-        if (!rows[i].dot_area)
+    for (const PatchReport &row : rows) {
+        if (!row.dot_area)
             continue;
-        const Tint tint = inks.tints_of(sheet.patches[i])->front(); // the only one
+        const Tint tint = inks.tints_of(*row.patch)->front(); // the only one
         ToneValue &sum = sums[tint.ink].try_emplace(tint.percent).first->second;
         sum.nominal = tint.percent;
-        sum.dot_area += *rows[i].dot_area;
-        sum.dot_gain += *rows[i].dot_gain;
+        sum.dot_area += *row.dot_area;
+        sum.dot_gain += *row.dot_gain;
         ++sum.patches;
     }
     std::vector<ToneCurve> curves;
@@ -110,9 +109,7 @@ std::vector<ToneCurve> tone_curves(const Measurement &sheet, const Inks &inks,
 PatchReport patch_report(const Patch &patch, const Conditions &conditions)
 {
     PatchReport row;
-    row.id = patch.id;
-    row.name = patch.name;
-    row.device = patch.device;
+    row.patch = &patch;
     row.colour = colour_of(conditions.sheet, patch, conditions.illuminant);
     const Paper &paper = conditions.paper;
     if (paper.choice.exists())
@@ -120,7 +117,7 @@ PatchReport patch_report(const Patch &patch, const Conditions &conditions)
     row.lch = lch_of(row.colour.lab);
     if (conditions.sheet.kind == Kind::colours)
         return row;
-    row.refl = patch.refl;
+    row.refl = &patch.refl;
 
     const Densitometer densitometer(paper.refl, conditions.status);
     const DensityReading reading = densitometer.read(patch.refl);
@@ -158,8 +155,10 @@ PaperReport paper_report(const Paper &paper, ILLUM_OBS illuminant)
     return out;
 }
 
-Report report_of(const Measurement &sheet, const ReportRequest &request)
+Report report_of(Measurement measurement, const ReportRequest &request)
 {
+    const auto kept = std::make_shared<const Measurement>(std::move(measurement));
+    const Measurement &sheet = *kept;
     std::vector<std::string> warnings = reading_warnings(sheet);
     const IlluminantChoice illuminant = illuminant_for(request.illuminant, {&sheet}, warnings);
     const Paper paper = paper_of(sheet, request.paper, illuminant, warnings);
@@ -167,12 +166,11 @@ Report report_of(const Measurement &sheet, const ReportRequest &request)
     if (request.second_sheet || !request.second_paper.empty())
         metamerism = metamerism_of(sheet, paper, illuminant, request, warnings);
     const Inks inks(sheet, request.order);
-    Report report{.file = sheet.file,
+    Report report{.sheet = kept,
                   .illuminant = illuminant,
                   .status = request.status,
                   .n_factor = request.n_factor,
                   .inks = inks.names(),
-                  .source = sheet.source,
                   .paper = paper_report(paper, illuminant),
                   .metamerism = std::move(metamerism),
                   .patches = {},
@@ -189,7 +187,7 @@ Report report_of(const Measurement &sheet, const ReportRequest &request)
     for (const PatchReport &patch : report.patches)
         densities.push_back(patch.density);
     warn_of_paper(sheet.file, paper.choice, densities, report.warnings);
-    report.tone_curves = tone_curves(sheet, inks, report.patches);
+    report.tone_curves = tone_curves(inks, report.patches);
     return report;
 }
 

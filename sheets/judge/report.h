@@ -8,9 +8,9 @@
 #include "judge/stated.h"
 #include "read/measurement.h"
 
+#include <memory>
 #include <optional>
 #include <string>
-#include <utility>
 #include <vector>
 
 namespace vantrel::sheets {
@@ -31,10 +31,8 @@ struct ReportRequest {
 
 // Percentages and densities are missing where they make no sense.
 struct PatchReport {
-    std::string id;
-    std::string name;
-    std::vector<std::pair<std::string, double>> device; // as in Patch
-    std::optional<Spectrum> refl; // missing where the file holds colours alone
+    const Patch *patch = nullptr;   // of the sheet
+    const Spectrum *refl = nullptr; // null where the sheet holds colours alone
     Colour colour;
     CIELCHCOORD lch{};
     std::optional<double> to_paper;            // ΔE00
@@ -80,12 +78,11 @@ struct ToneCurve {
 };
 
 struct Report {
-    std::string file;
+    std::shared_ptr<const Measurement> sheet;
     IlluminantChoice illuminant;
     int status;
     double n_factor;
     std::vector<std::string> inks; // device fields in the order of printing
-    Source source;                 // without bands where the file holds colours alone
     PaperReport paper;
     std::optional<MetamerismReport> metamerism;
     std::vector<PatchReport> patches;
@@ -94,7 +91,7 @@ struct Report {
     std::vector<std::string> warnings;
 };
 
-// What the report of a patch rests on.
+// What the report of a patch rests on; the sheet has to live as long as the report.
 struct Conditions {
     const Measurement &sheet;
     const Inks &inks;
@@ -108,6 +105,6 @@ PatchReport patch_report(const Patch &patch, const Conditions &conditions);
 PaperReport paper_report(const Paper &paper, ILLUM_OBS illuminant);
 
 // Throws RequestError.
-Report report_of(const Measurement &sheet, const ReportRequest &request);
+Report report_of(Measurement measurement, const ReportRequest &request);
 
 } // namespace vantrel::sheets

@@ -156,6 +156,18 @@ Spectrum Bands::of(const std::vector<double> &values) const
     return out;
 }
 
+std::optional<std::pair<double, double>> Bands::out_of_order() const
+{
+    std::size_t rises = 0;
+    for (std::size_t i = 1; i < nm.size(); ++i)
+        rises += nm[i] > nm[i - 1];
+    const bool ascending = 2 * rises >= nm.size();
+    for (std::size_t i = 1; i < nm.size(); ++i)
+        if ((nm[i] > nm[i - 1]) != ascending)
+            return std::pair{nm[i - 1], nm[i]};
+    return std::nullopt;
+}
+
 Source Bands::source() const
 {
     Source out;

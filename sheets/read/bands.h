@@ -5,6 +5,8 @@
 
 #include <array>
 #include <cstddef>
+#include <optional>
+#include <utility>
 #include <vector>
 
 namespace vantrel::sheets {
@@ -31,6 +33,10 @@ public:
     // for it: that is what the correction brings the mean back to. Bands outside the range are
     // equal to the last one inside.
     Spectrum of(const std::vector<double> &values) const;
+
+    // The first two neighbours in the file that do not stand as its others do, which ascend or
+    // descend; none where all do.
+    std::optional<std::pair<double, double>> out_of_order() const;
 
     // All but the scale and the condition.
     Source source() const;

@@ -48,13 +48,18 @@ const Bands &Sheet::bands_at(const std::vector<double> &wavelengths, std::size_t
 {
     if (!bands || bands->wavelengths() != wavelengths) {
         bands.emplace(wavelengths, line);
-        warn_of(bands->source(), line);
+        warn_of(*bands, line);
     }
     return *bands;
 }
 
-void Sheet::warn_of(const Source &source, std::size_t line)
+void Sheet::warn_of(const Bands &used, std::size_t line)
 {
+    const Source source = used.source();
+    if (const auto neighbours = used.out_of_order(); neighbours && !std::exchange(told_order, true))
+        warn(line, fmt::format("the wavelengths are out of order, {:g} nm stands before {:g}: each "
+                               "value is taken for the wavelength that it stands under",
+                               neighbours->first, neighbours->second));
     if (source.interpolated && !std::exchange(told_interpolated, true))
         warn(line, "steps of 20 nm: the values between are interpolated by third-order Lagrange "
                    "polynomials (ASTM E2022)");

@@ -56,7 +56,7 @@ public:
     Measurement measurement();
 
 private:
-    void warn_of(const Source &source, std::size_t line);
+    void warn_of(const Bands &used, std::size_t line);
     void choose_condition();
     bool name_patches();
     void bring_to_percent();
@@ -72,7 +72,7 @@ private:
     std::optional<Bands> bands;
     std::optional<double> full_scale, usual_scale;
     std::string scale_by, usually_by;
-    bool told_interpolated = false, told_held = false;
+    bool told_order = false, told_interpolated = false, told_held = false;
 };
 
 } // namespace vantrel::sheets

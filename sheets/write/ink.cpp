@@ -17,7 +17,7 @@ namespace {
 std::string device_values(const PatchReport &patch)
 {
     std::string out;
-    for (const auto &[ink, percent] : patch.device)
+    for (const auto &[ink, percent] : patch.patch->device)
         out += fmt::format(", {} {:g}", ink, percent);
     return out;
 }
@@ -25,8 +25,8 @@ std::string device_values(const PatchReport &patch)
 void add_summary(Lines &lines, const PatchStudy &study, bool colour)
 {
     const PatchReport &patch = study.patch;
-    lines.add(fmt::format("{} ({}) of {}{}", cut(patch.name, kWidestName), patch.id, study.file,
-                          device_values(patch)));
+    lines.add(fmt::format("{} ({}) of {}{}", cut(patch.patch->name, kWidestName), patch.patch->id,
+                          study.sheet->file, device_values(patch)));
     lines.add(fmt::format("{}, {} {}", said(study.illuminant), status_name(study.status),
                           over(study.paper)));
     lines.add(fmt::format("\n{}L*a*b* {}, C* {}, h {}{}",
@@ -51,7 +51,8 @@ void add_summary(Lines &lines, const PatchStudy &study, bool colour)
                           paper.whiteness ? fixed(paper.whiteness)
                                           : "none (" + paper.no_whiteness + ")"));
     if (study.against)
-        lines.add(fmt::format("Against {}: ΔE00 {}", cut(study.against->patch.name, kWidestName),
+        lines.add(fmt::format("Against {}: ΔE00 {}",
+                              cut(study.against->patch.patch->name, kWidestName),
                               fixed(study.against->de00)));
 }
 
@@ -146,7 +147,7 @@ std::vector<std::string> device_names(const PatchStudy &study)
     std::vector<std::string> names;
     const PatchReport &other = study.against ? study.against->patch : study.patch;
     for (const PatchReport *patch : {&study.patch, &other})
-        for (const auto &[name, value] : patch->device)
+        for (const auto &[name, value] : patch->patch->device)
             if (std::find(names.begin(), names.end(), name) == names.end())
                 names.push_back(name);
     return names;
@@ -161,14 +162,14 @@ Flat spectra(const PatchStudy &study)
         return [value](std::size_t i) { return i == 0 ? value : std::nullopt; };
     };
     Flat flat;
-    flat.description =
-        fmt::format("{} of {}: {}", study.patch.name, study.file, name_of(study.illuminant));
+    flat.description = fmt::format("{} of {}: {}", study.patch.patch->name, study.sheet->file,
+                                   name_of(study.illuminant));
     flat.rows = study.against ? 2 : 1;
     flat.text("table", "", [](std::size_t) { return "spectra"; });
-    flat.text("id", "SAMPLE_ID", [patch](std::size_t i) { return patch(i).id; });
-    flat.text("name", "SAMPLE_NAME", [patch](std::size_t i) { return patch(i).name; });
+    flat.text("id", "SAMPLE_ID", [patch](std::size_t i) { return patch(i).patch->id; });
+    flat.text("name", "SAMPLE_NAME", [patch](std::size_t i) { return patch(i).patch->name; });
     flat.device(device_names(study),
-                [patch](std::size_t i) -> const Flat::Device & { return patch(i).device; });
+                [patch](std::size_t i) -> const Flat::Device & { return patch(i).patch->device; });
     flat.colour("", [patch](std::size_t i) { return &patch(i).colour; });
     flat.number("brightness", "BRIGHTNESS", of_first(study.as_paper.brightness));
     flat.number("whiteness", "WHITENESS", of_first(study.as_paper.whiteness));
@@ -179,8 +180,8 @@ Flat spectra(const PatchStudy &study)
 Flat bands(const PatchStudy &study)
 {
     Flat flat;
-    flat.description =
-        fmt::format("Error weights of {} against {}", study.patch.name, study.against->patch.name);
+    flat.description = fmt::format("Error weights of {} against {}", study.patch.patch->name,
+                                   study.against->patch.patch->name);
     flat.rows = VANTREL_BANDS;
     flat.text("table", "", [](std::size_t) { return "bands"; });
     flat.exact("nm", "WAVELENGTH", [](std::size_t i) { return static_cast<double>(400 + 10 * i); });
@@ -192,7 +193,8 @@ Flat bands(const PatchStudy &study)
 Flat densities(const PatchStudy &study)
 {
     Flat flat;
-    flat.description = fmt::format("Densities of {} {}", study.patch.name, over(study.paper));
+    flat.description =
+        fmt::format("Densities of {} {}", study.patch.patch->name, over(study.paper));
     flat.rows = NUM_STATUSES;
     flat.text("table", "", [](std::size_t) { return "densities"; });
     flat.text("status", "STATUS",
@@ -217,7 +219,7 @@ Flat colours(const PatchStudy &study)
 {
     const std::array<IlluminantReading, NUM_ILLUM_OBS> &rows = study.illuminants;
     Flat flat;
-    flat.description = fmt::format("Colours of {}", study.patch.name);
+    flat.description = fmt::format("Colours of {}", study.patch.patch->name);
     flat.rows = rows.size();
     flat.text("table", "", [](std::size_t) { return "colours"; });
     flat.text("illuminant", "ILLUMINANT",
@@ -262,7 +264,7 @@ void write_json(const PatchStudy &study, const Sink &sink)
         against["b_weights"] = study.against->b;
     }
     Json out = {{"command", "ink"},
-                {"file", study.file},
+                {"file", study.sheet->file},
                 {"illuminant", name_of(study.illuminant)},
                 {"illuminant_by", study.illuminant.by},
                 {"status", status_name(study.status)},

@@ -28,10 +28,10 @@ Json patch_json(const PatchReport &patch, int status)
         out.emplace_back(name, std::move(value));
     };
     Json::object_t device;
-    for (const auto &[field, value] : patch.device)
+    for (const auto &[field, value] : patch.patch->device)
         device[field] = value;
-    add("id", patch.id);
-    add("name", patch.name);
+    add("id", patch.patch->id);
+    add("name", patch.patch->name);
     add("device", std::move(device));
     add("rgb", hex(patch.colour.rgb));
     add("lab", lab_json(patch.colour.lab));
@@ -46,7 +46,7 @@ Json patch_json(const PatchReport &patch, int status)
     add("hue_error", or_null(patch.hue_error));
     add("grayness", or_null(patch.grayness));
     add("trap", or_null(patch.trap));
-    add("refl", or_null(patch.refl));
+    add("refl", patch.refl ? Json(*patch.refl) : Json());
     return out;
 }
 

@@ -91,7 +91,7 @@ std::vector<double> ranks(const Report &report)
     }
     for (std::size_t i = 0; i < patches.size(); ++i)
         if (patches[i].hue_error || patches[i].trap ||
-            (report.paper.choice.exists() && patches[i].name == report.paper.choice.name))
+            (report.paper.choice.exists() && patches[i].patch->name == report.paper.choice.name))
             rank[i] = 3;
     return rank;
 }

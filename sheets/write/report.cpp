@@ -41,7 +41,7 @@ std::string spectra_of(const Source &source)
 
 void add_head(Lines &lines, const Report &report)
 {
-    lines.add(fmt::format("{}: {} {}", report.file, report.patches.size(),
+    lines.add(fmt::format("{}: {} {}", report.sheet->file, report.patches.size(),
                           report.patches.size() == 1 ? "patch" : "patches"));
     const PaperChoice &paper = report.paper.choice;
     lines.add(
@@ -52,7 +52,8 @@ void add_head(Lines &lines, const Report &report)
             : fmt::format("{}, {}, densities {}: ΔE00 to it, dot area and gain, contrast,\nhue "
                           "error, grayness and trap are left out",
                           said(report.illuminant), status_name(report.status), over(paper)));
-    lines.add(report.source.bands ? spectra_of(report.source) : "Colours alone, no spectra");
+    lines.add(report.sheet->source.bands ? spectra_of(report.sheet->source)
+                                         : "Colours alone, no spectra");
 }
 
 void add_patches(Lines &lines, const Report &report, std::size_t width, bool colour)
@@ -63,7 +64,7 @@ void add_patches(Lines &lines, const Report &report, std::size_t width, bool col
                           "Area", "Gain"));
     for (const PatchReport &patch : report.patches) {
         const CIELABCOORD &lab = patch.colour.lab;
-        std::string line = fmt::format("{:<{}} {}", cut(patch.name, kWidestName), width,
+        std::string line = fmt::format("{:<{}} {}", cut(patch.patch->name, kWidestName), width,
                                        colour ? swatch(patch.colour.rgb) : "");
         for (const double value : {lab.L, lab.a, lab.b, patch.lch.C, patch.lch.h})
             line += fmt::format("{:>8}", fixed(value));
@@ -116,7 +117,7 @@ void add_block(Lines &lines, const Report &report, const char *title, std::size_
                 head += fmt::format("{:>12}", column.title);
             lines.add(head);
         }
-        std::string line = fmt::format("{:<{}}", cut(patch.name, kWidestName), width);
+        std::string line = fmt::format("{:<{}}", cut(patch.patch->name, kWidestName), width);
         for (const BlockColumn &column : columns)
             line += fmt::format("{:>12}", fixed(patch.*column.value, column.decimals));
         lines.add(line);
@@ -159,7 +160,7 @@ void write_table(const Report &report, Lines &lines, bool colour)
 {
     std::size_t width = 10;
     for (const PatchReport &patch : report.patches)
-        width = std::max(width, characters(cut(patch.name, kWidestName)));
+        width = std::max(width, characters(cut(patch.patch->name, kWidestName)));
     add_head(lines, report);
     add_patches(lines, report, width, colour);
     add_paper(lines, report);
@@ -187,13 +188,14 @@ Json paper_json(const Report &report)
     if (!paper.whiteness)
         out["no_whiteness"] = paper.no_whiteness;
     if (const auto &metamerism = report.metamerism)
-        out["metamerism"] = {{"file", metamerism->file.empty() ? report.file : metamerism->file},
-                             {"paper", metamerism->paper.name},
-                             {"chosen", metamerism->paper.reason},
-                             {"de00", metamerism->de00},
-                             {"illuminant", name_of(metamerism->illuminant)},
-                             {"sum", metamerism->sum},
-                             {"din6172", metamerism->din6172}};
+        out["metamerism"] = {
+            {"file", metamerism->file.empty() ? report.sheet->file : metamerism->file},
+            {"paper", metamerism->paper.name},
+            {"chosen", metamerism->paper.reason},
+            {"de00", metamerism->de00},
+            {"illuminant", name_of(metamerism->illuminant)},
+            {"sum", metamerism->sum},
+            {"din6172", metamerism->din6172}};
     return out;
 }
 
@@ -215,7 +217,7 @@ Json tone_values_json(const Report &report)
 void write_sheet(const Report &report, const Sink &sink)
 {
     Json head = {
-        {"file", report.file},
+        {"file", report.sheet->file},
         {"warnings", report.warnings},
         {"illuminant", name_of(report.illuminant)},
         {"illuminant_by", report.illuminant.by},
@@ -223,16 +225,18 @@ void write_sheet(const Report &report, const Sink &sink)
         {"n_factor", report.n_factor},
         {"inks", report.inks},
         {"source",
-         {{"first_nm", report.source.first_nm},
-          {"last_nm", report.source.last_nm},
-          {"step_nm", report.source.step_nm},
-          {"bands", report.source.bands},
-          {"averaged", report.source.averaged},
-          {"interpolated", report.source.interpolated},
-          {"held", report.source.held},
-          {"scaled_to_percent", report.source.scaled},
-          {"scale_by", report.source.scale_by},
-          {"condition", report.source.condition.empty() ? Json() : Json(report.source.condition)}}},
+         {{"first_nm", report.sheet->source.first_nm},
+          {"last_nm", report.sheet->source.last_nm},
+          {"step_nm", report.sheet->source.step_nm},
+          {"bands", report.sheet->source.bands},
+          {"averaged", report.sheet->source.averaged},
+          {"interpolated", report.sheet->source.interpolated},
+          {"held", report.sheet->source.held},
+          {"scaled_to_percent", report.sheet->source.scaled},
+          {"scale_by", report.sheet->source.scale_by},
+          {"condition", report.sheet->source.condition.empty()
+                            ? Json()
+                            : Json(report.sheet->source.condition)}}},
         {"paper", paper_json(report)},
         {"tone_values", tone_values_json(report)},
     };
@@ -250,13 +254,13 @@ std::vector<std::string> device_names(const Report &report)
     std::set<std::string_view> seen;
     std::vector<std::string> names;
     for (const PatchReport &patch : report.patches)
-        for (const auto &[name, value] : patch.device)
+        for (const auto &[name, value] : patch.patch->device)
             if (seen.insert(name).second)
                 names.push_back(name);
     if (names.size() * report.patches.size() > kMostCells)
         throw RequestError{fmt::format("{}: {} inks are too many for a column each; --format json "
                                        "has them",
-                                       report.file, names.size())};
+                                       report.sheet->file, names.size())};
     return names;
 }
 
@@ -264,15 +268,16 @@ Flat flat_of(const Report &report)
 {
     const std::vector<PatchReport> &patches = report.patches;
     Flat flat;
-    flat.description =
-        fmt::format("Report of {}: {}, {} {}, n = {:g}", report.file, name_of(report.illuminant),
-                    status_name(report.status), over(report.paper.choice), report.n_factor);
+    flat.description = fmt::format("Report of {}: {}, {} {}, n = {:g}", report.sheet->file,
+                                   name_of(report.illuminant), status_name(report.status),
+                                   over(report.paper.choice), report.n_factor);
     flat.rows = patches.size();
-    flat.text("file", "", [&report](std::size_t) { return report.file; });
-    flat.text("id", "SAMPLE_ID", [&patches](std::size_t i) { return patches[i].id; });
-    flat.text("name", "SAMPLE_NAME", [&patches](std::size_t i) { return patches[i].name; });
-    flat.device(device_names(report),
-                [&patches](std::size_t i) -> const Flat::Device & { return patches[i].device; });
+    flat.text("file", "", [&report](std::size_t) { return report.sheet->file; });
+    flat.text("id", "SAMPLE_ID", [&patches](std::size_t i) { return patches[i].patch->id; });
+    flat.text("name", "SAMPLE_NAME", [&patches](std::size_t i) { return patches[i].patch->name; });
+    flat.device(device_names(report), [&patches](std::size_t i) -> const Flat::Device & {
+        return patches[i].patch->device;
+    });
     flat.colour("", [&patches](std::size_t i) { return &patches[i].colour; });
     flat.number("C", "LAB_C", [&patches](std::size_t i) { return patches[i].lch.C; });
     flat.number("h", "LAB_H", [&patches](std::size_t i) { return patches[i].lch.h; });

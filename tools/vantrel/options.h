@@ -9,6 +9,7 @@
 #include <CLI/CLI.hpp>
 
 #include <functional>
+#include <memory>
 #include <optional>
 #include <string>
 #include <utility>
@@ -82,8 +83,9 @@ Outcome outcome_of(Result result, std::vector<std::string> warnings, const Optio
     style.colour = shows_colour(options);
     if (options.format == "html")
         choose_for_page(result);
-    const auto write = [result = std::move(result), format = options.format,
-                        style](const Sink &sink) {
+    const auto kept = std::make_shared<const Result>(std::move(result)); // std::function copies
+    const auto write = [kept, format = options.format, style](const Sink &sink) {
+        const Result &result = *kept;
         if (format == "json")
             write_json(result, sink);
         else if (format == "html")
