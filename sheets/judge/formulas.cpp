@@ -1,8 +1,12 @@
 #include "judge/formulas.h"
 
+#include "read/measurement.h"
 #include "read/text.h"
 
 #include <fmt/format.h>
+
+#include <algorithm>
+#include <cmath>
 
 namespace vantrel::sheets {
 namespace {
@@ -14,6 +18,21 @@ constexpr FormulaNames names[] = {
     {"de94", "ΔE94", "LAB_DE_94"},
     {"de76", "ΔE*ab", "LAB_DE"},
 };
+
+Formula required(std::string_view key)
+{
+    const auto formula = formula_named(key);
+    if (!formula)
+        throw RequestError{
+            fmt::format("no formula {}; there are {}", in_quotes(key), formula_keys())};
+    return *formula;
+}
+
+std::vector<Metric>::iterator find(std::vector<Metric> &metrics, Formula formula)
+{
+    return std::find_if(metrics.begin(), metrics.end(),
+                        [&](const Metric &metric) { return metric.formula == formula; });
+}
 
 } // namespace
 
@@ -56,6 +75,33 @@ double Metric::operator()(const CIELABCOORD &reference, const CIELABCOORD &sampl
 }
 
 Metric usual_metric(Formula formula) { return {formula, formula == Formula::cmc ? 2.0 : 1.0, 1}; }
+
+std::vector<Metric> metrics_of(const std::vector<std::string> &keys)
+{
+    std::vector<Metric> out;
+    for (const std::string &key : keys) {
+        const Formula formula = required(key);
+        if (find(out, formula) != out.end())
+            throw RequestError{fmt::format("the formula {} is named twice", names_of(formula).key)};
+        out.push_back(usual_metric(formula));
+    }
+    return out;
+}
+
+void weigh(std::vector<Metric> &metrics, std::string_view key, double lightness, double chroma)
+{
+    const Formula formula = required(key);
+    if (formula == Formula::de76)
+        throw RequestError{"the formula de76 has no weights"};
+    const auto metric = find(metrics, formula);
+    if (metric == metrics.end())
+        throw RequestError{
+            fmt::format("weights of {}, a formula that is not asked for", names_of(formula).key)};
+    if (!(lightness > 0 && chroma > 0 && std::isfinite(lightness) && std::isfinite(chroma)))
+        throw RequestError{
+            fmt::format("weights are numbers above 0, not {:g} and {:g}", lightness, chroma)};
+    *metric = {formula, lightness, chroma};
+}
 
 std::string title_of(const Metric &metric)
 {

@@ -6,6 +6,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
 namespace vantrel::sheets {
 
@@ -30,6 +31,14 @@ struct Metric {
 
 // The factors that are usual: CMC(2:1), 1 otherwise.
 Metric usual_metric(Formula formula);
+
+// The metrics of formulas by their keys, with the usual factors; throws RequestError where one is
+// unknown or named twice.
+std::vector<Metric> metrics_of(const std::vector<std::string> &keys);
+
+// Gives the metric of a formula other factors; throws RequestError where it is not among them, has
+// none, or the factors are not above 0.
+void weigh(std::vector<Metric> &metrics, std::string_view key, double lightness, double chroma);
 
 // ΔE00, ΔE CMC(2:1), ΔE94 (kL 2, kC 1)
 std::string title_of(const Metric &metric);

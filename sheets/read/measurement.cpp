@@ -16,6 +16,12 @@ std::vector<std::string> reading_warnings(const Measurement &sheet)
     return out;
 }
 
+std::string complaint_of(const std::string &file, const InputError &error)
+{
+    return fmt::format("{}{}: {}", file, error.line ? fmt::format(":{}", error.line) : "",
+                       error.reason);
+}
+
 const Patch *find_patch(const Measurement &sheet, std::string_view name)
 {
     for (const Patch &patch : sheet.patches)

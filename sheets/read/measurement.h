@@ -91,6 +91,9 @@ struct InputError {
     std::string reason;
 };
 
+// "sheet.txt:12: …"
+std::string complaint_of(const std::string &file, const InputError &error);
+
 // A request that cannot be met: the message.
 struct RequestError {
     std::string message;

@@ -32,57 +32,28 @@ struct CompareOptions : Options {
     bool all = false;
 };
 
-Formula formula_of(std::string_view name)
-{
-    const auto formula = formula_named(name);
-    if (!formula)
-        throw RequestError{
-            fmt::format("no formula {}; there are {}", in_quotes(name), formula_keys())};
-    return *formula;
-}
-
 // FORMULA=A,B
-Metric weighted_metric(std::string_view wish)
+void set_weights(std::vector<Metric> &metrics, std::string_view wish)
 {
     const auto equals = wish.find('=');
     const auto comma = wish.find(',', equals == std::string_view::npos ? 0 : equals);
-    if (equals == std::string_view::npos || comma == std::string_view::npos)
+    const auto number = [&](std::size_t from, std::size_t to) {
+        return number_in(wish.substr(from, to - from));
+    };
+    const bool whole = equals != std::string_view::npos && comma != std::string_view::npos;
+    const auto lightness = whole ? number(equals + 1, comma) : std::nullopt;
+    const auto chroma = whole ? number(comma + 1, wish.size()) : std::nullopt;
+    if (!lightness || !chroma)
         throw RequestError{
             fmt::format("--weights takes FORMULA=LIGHTNESS,CHROMA, not {}", in_quotes(wish))};
-    Metric metric = usual_metric(formula_of(wish.substr(0, equals)));
-    if (metric.formula == Formula::de76)
-        throw RequestError{"the formula de76 has no weights"};
-    const auto lightness = number_in(wish.substr(equals + 1, comma - equals - 1));
-    const auto chroma = number_in(wish.substr(comma + 1));
-    if (!lightness || !chroma || *lightness <= 0 || *chroma <= 0)
-        throw RequestError{
-            fmt::format("--weights takes two numbers above 0, not {}", in_quotes(wish))};
-    metric.lightness = *lightness;
-    metric.chroma = *chroma;
-    return metric;
+    weigh(metrics, wish.substr(0, equals), *lightness, *chroma);
 }
 
-std::vector<Metric> metrics_of(const CompareOptions &options)
+std::vector<Metric> chosen_metrics(const CompareOptions &options)
 {
-    std::vector<Metric> metrics;
-    const auto find = [&](Formula formula) {
-        return std::find_if(metrics.begin(), metrics.end(),
-                            [&](const Metric &metric) { return metric.formula == formula; });
-    };
-    for (const std::string &name : options.formulas) {
-        const Formula formula = formula_of(name);
-        if (find(formula) != metrics.end())
-            throw RequestError{fmt::format("the formula {} is named twice", names_of(formula).key)};
-        metrics.push_back(usual_metric(formula));
-    }
-    for (const std::string &wish : options.weights) {
-        const Metric weighted = weighted_metric(wish);
-        const auto metric = find(weighted.formula);
-        if (metric == metrics.end())
-            throw RequestError{fmt::format("--weights of {}, which --formula does not name",
-                                           names_of(weighted.formula).key)};
-        *metric = weighted;
-    }
+    std::vector<Metric> metrics = metrics_of(options.formulas);
+    for (const std::string &wish : options.weights)
+        set_weights(metrics, wish);
     return metrics;
 }
 
@@ -127,7 +98,7 @@ Outcome run(const CompareOptions &options)
                     .force = options.force_pairs,
                     .each = options.repeats == "each"},
         .allow_missing = options.allow_missing,
-        .metrics = metrics_of(options),
+        .metrics = chosen_metrics(options),
         .illuminant = optional_illuminant(options.illuminant),
         .second_illuminant = optional_illuminant(options.second_illuminant),
         .status = status_of(options.status),

@@ -17,7 +17,7 @@ namespace vantrel::program {
 void add_common_options(CLI::App &command, Options &options)
 {
     command.add_option("--format", options.format, "table, csv, json, cgats or html")
-        ->check(CLI::IsMember({"table", "csv", "json", "cgats", "html"}))
+        ->check(CLI::IsMember(std::vector<std::string>(kFormats.begin(), kFormats.end())))
         ->capture_default_str();
     command.add_option("-o,--output", options.output,
                        "Write to this file instead of standard output; it is replaced whole or not "
@@ -86,12 +86,6 @@ int status_of(const std::string &name)
 std::optional<ILLUM_OBS> optional_illuminant(const std::string &name)
 {
     return name.empty() ? std::nullopt : std::optional(illuminant_of(name));
-}
-
-std::string complaint_of(const std::string &file, const InputError &error)
-{
-    return fmt::format("{}{}: {}", file, error.line ? fmt::format(":{}", error.line) : "",
-                       error.reason);
 }
 
 Measurement sheet_of(const std::string &path, const Options &options, bool colours)

@@ -2,9 +2,7 @@
 #pragma once
 
 #include "read/measurement.h"
-#include "write/html.h"
-#include "write/page_choice.h"
-#include "write/result.h"
+#include "write/format.h"
 
 #include <CLI/CLI.hpp>
 
@@ -67,9 +65,6 @@ std::optional<ILLUM_OBS> optional_illuminant(const std::string &name);
 // Reads a file; one of colours alone will do where `colours` says so. Throws RequestError.
 Measurement sheet_of(const std::string &path, const Options &options, bool colours = false);
 
-// "sheet.txt:12: …"
-std::string complaint_of(const std::string &file, const InputError &error);
-
 bool shows_colour(const Options &options);
 
 // One line on standard error; there is nobody to tell when that cannot be written.
@@ -85,17 +80,7 @@ Outcome outcome_of(Result result, std::vector<std::string> warnings, const Optio
         choose_for_page(result);
     const auto kept = std::make_shared<const Result>(std::move(result)); // std::function copies
     const auto write = [kept, format = options.format, style](const Sink &sink) {
-        const Result &result = *kept;
-        if (format == "json")
-            write_json(result, sink);
-        else if (format == "html")
-            write_html([&](const Sink &page) { write_json(result, page); }, sink);
-        else if (format == "table")
-            write_table(result, sink, style);
-        else if (format == "csv")
-            write_csv(flat_of(result), sink);
-        else
-            write_cgats(flat_of(result), sink);
+        write_as(format, *kept, sink, style);
     };
     return {write, options.output, std::move(warnings)};
 }

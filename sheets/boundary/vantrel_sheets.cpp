@@ -1,0 +1,160 @@
+#include "vantrel_sheets.h"
+
+#include "boundary/calls.h"
+
+#include <algorithm>
+#include <exception>
+#include <new>
+#include <string>
+#include <string_view>
+#include <utility>
+#include <vector>
+
+using namespace vantrel::sheets;
+
+struct VantrelSheet {
+    Measurement measurement;
+};
+
+struct VantrelAnswer {
+    bool ok = false;
+    std::string text;
+};
+
+namespace {
+
+VantrelAnswer out_of_memory{false, "not enough memory"}; // which takes none to say
+
+// What `work` says, or the reason why it cannot.
+template <typename Work> VantrelAnswer *answer(const Work &work) noexcept
+{
+    try {
+        try {
+            return new VantrelAnswer{true, work()};
+        } catch (const RequestError &error) {
+            return new VantrelAnswer{false, error.message};
+        } catch (const std::bad_alloc &) {
+            return &out_of_memory;
+        } catch (const std::exception &error) {
+            return new VantrelAnswer{false, error.what()};
+        }
+    } catch (...) {
+        return &out_of_memory;
+    }
+}
+
+// Hands the measurement over, and says what there is to say about it.
+template <typename Open> VantrelAnswer *opened(VantrelSheet **sheet, const Open &open)
+{
+    *sheet = nullptr;
+    return answer([&] {
+        Measurement measurement = open();
+        std::string out = about(measurement);
+        *sheet = new VantrelSheet{std::move(measurement)};
+        return out;
+    });
+}
+
+std::string_view given(const char *options) { return options ? options : "{}"; }
+
+Tell teller(VantrelTell tell, void *user)
+{
+    if (!tell)
+        return {};
+    return [=](const char *what, double share) { tell(user, what, share); };
+}
+
+const Patch *patch_at(const VantrelSheet *sheet, std::size_t patch)
+{
+    const std::vector<Patch> &patches = sheet->measurement.patches;
+    return patch < patches.size() ? &patches[patch] : nullptr;
+}
+
+} // namespace
+
+VantrelAnswer *vantrel_open(const char *name, const char *bytes, size_t size, const char *options,
+                            VantrelSheet **sheet, VantrelTell tell, void *user)
+{
+    return opened(sheet, [&] {
+        return open_file(name, {bytes, size}, given(options), teller(tell, user));
+    });
+}
+
+VantrelAnswer *vantrel_open_spectra(const char *name, const double *spectra, size_t patches,
+                                    size_t bands, const char *const *names, const char *options,
+                                    VantrelSheet **sheet)
+{
+    return opened(sheet, [&] {
+        Rows rows{spectra, patches, bands, {}};
+        if (names)
+            rows.names.assign(names, names + patches);
+        return open_spectra(name, rows, given(options));
+    });
+}
+
+void vantrel_close(VantrelSheet *sheet) { delete sheet; }
+
+size_t vantrel_patches(const VantrelSheet *sheet) { return sheet->measurement.patches.size(); }
+
+int vantrel_spectra(const VantrelSheet *sheet, double *spectra)
+{
+    if (sheet->measurement.kind == Kind::colours)
+        return 0;
+    for (const Patch &patch : sheet->measurement.patches)
+        spectra = std::copy(patch.refl.begin(), patch.refl.end(), spectra);
+    return 1;
+}
+
+const char *vantrel_patch_name(const VantrelSheet *sheet, size_t patch)
+{
+    const Patch *found = patch_at(sheet, patch);
+    return found ? found->name.c_str() : nullptr;
+}
+
+const char *vantrel_patch_id(const VantrelSheet *sheet, size_t patch)
+{
+    const Patch *found = patch_at(sheet, patch);
+    return found ? found->id.c_str() : nullptr;
+}
+
+VantrelAnswer *vantrel_report(const VantrelSheet *const *sheets, size_t count,
+                              const VantrelSheet *second_sheet, const char *options,
+                              VantrelTell tell, void *user)
+{
+    return answer([&] {
+        std::vector<const Measurement *> measurements;
+        for (std::size_t i = 0; i < count; ++i)
+            measurements.push_back(&sheets[i]->measurement);
+        return report(measurements, second_sheet ? &second_sheet->measurement : nullptr,
+                      given(options), teller(tell, user));
+    });
+}
+
+VantrelAnswer *vantrel_compare(const VantrelSheet *reference, const VantrelSheet *sample,
+                               const char *options, VantrelTell tell, void *user)
+{
+    return answer([&] {
+        return compare(reference->measurement, sample->measurement, given(options),
+                       teller(tell, user));
+    });
+}
+
+VantrelAnswer *vantrel_predict(const VantrelSheet *sheet, const char *options)
+{
+    return answer([&] { return predict(sheet->measurement, given(options)); });
+}
+
+VantrelAnswer *vantrel_ink(const VantrelSheet *sheet, const char *options)
+{
+    return answer([&] { return ink(sheet->measurement, given(options)); });
+}
+
+int vantrel_answer_ok(const VantrelAnswer *answer) { return answer->ok; }
+const char *vantrel_answer_text(const VantrelAnswer *answer) { return answer->text.c_str(); }
+size_t vantrel_answer_size(const VantrelAnswer *answer) { return answer->text.size(); }
+
+void vantrel_answer_free(VantrelAnswer *answer)
+{
+    if (answer != &out_of_memory)
+        delete answer;
+}
