@@ -2,21 +2,37 @@
 
 #include "judge/colour.h"
 
+#include <Eigen/Core>
 #include <fmt/format.h>
 
 #include <algorithm>
 #include <array>
 #include <cmath>
 #include <limits>
-#include <numeric>
 
 namespace vantrel::sheets {
 namespace {
 
-constexpr std::size_t kMostInks = 4;
 constexpr std::array kFactors = {1.0, 1.25, 1.5, 1.8, 2.0, 2.5, 3.0, 3.5, 4.0, 5.0, 6.0, 8.0, 10.0};
 
 constexpr double kDark = 1e-300; // a solid that is no other than the paper
+// Beyond these the fit takes more than seconds.
+constexpr std::size_t kMostTints = 200;       // of one ink
+constexpr std::size_t kMostOverprints = 2000; // to fit to
+
+using Bands = Eigen::Array<double, VANTREL_BANDS, 1>;
+
+Eigen::Map<const Bands> bands_of(const Spectrum &refl)
+{
+    return Eigen::Map<const Bands>(refl.data());
+}
+
+Spectrum spectrum_of(const Bands &bands)
+{
+    Spectrum out;
+    Eigen::Map<Bands>(out.data()) = bands;
+    return out;
+}
 
 std::vector<std::size_t> inks_of(const Tints &tints)
 {
@@ -53,7 +69,7 @@ void for_each_node(const Tints &tints, const std::vector<std::vector<double>> &l
 
 } // namespace
 
-CalibratedModel::CalibratedModel(const Measurement &sheet, const Inks &inks, const Patch &paper,
+CalibratedModel::CalibratedModel(const Measurement &sheet, const Inks &inks, const Spectrum &paper,
                                  ILLUM_OBS illuminant)
     : inks(inks), ramps(inks.names().size())
 {
@@ -62,18 +78,22 @@ CalibratedModel::CalibratedModel(const Measurement &sheet, const Inks &inks, con
         const auto tints = inks.tints_of(patch);
         if (!tints || tints->empty())
             continue;
-        const Bands refl = Eigen::Map<const Bands>(patch.refl.data()).max(0);
+        const Bands refl = bands_of(patch.refl).max(0);
         const double count = ++patches[*tints];
-        Bands &mean = measured.try_emplace(*tints, Bands::Zero()).first->second;
-        mean += (refl - mean) / count;
+        Spectrum &mean = measured[*tints];
+        mean = spectrum_of(bands_of(mean) + (refl - bands_of(mean)) / count);
     }
-    measured[{}] = Eigen::Map<const Bands>(paper.refl.data()).max(0);
+    measured[{}] = spectrum_of(bands_of(paper).max(0));
     for (const auto &[tints, refl] : measured)
         if (tints.size() == 1 && measured.contains({{tints[0].ink, 100}}))
             ramps[tints[0].ink].push_back(tints[0].percent);
-    for (Levels &ramp : ramps)
-        if (!ramp.empty())
-            ramp.insert(ramp.begin(), 0);
+    for (std::size_t ink = 0; ink < ramps.size(); ++ink) {
+        if (ramps[ink].size() > kMostTints)
+            throw RequestError{fmt::format("{} tints of {}; {} are the most", ramps[ink].size(),
+                                           inks.names()[ink], kMostTints)};
+        if (!ramps[ink].empty())
+            ramps[ink].insert(ramps[ink].begin(), 0);
+    }
     fit(illuminant);
 }
 
@@ -85,34 +105,54 @@ std::vector<CalibratedModel::Levels> CalibratedModel::grid_of(const Tints &tints
     for (const Tint &tint : tints)
         grid.push_back(ramps[tint.ink]);
     for (;;) {
-        std::vector<std::vector<std::size_t>> overprints, holes; // of each level
-        for (const Levels &levels : grid)
-            overprints.emplace_back(levels.size(), 0);
-        holes = overprints;
-        for_each_node(tints, grid, [&](const Tints &node, const std::vector<std::size_t> &at) {
-            const bool hole = !all_solid(node) && !measured.contains(node);
-            for (std::size_t i = 0; i < at.size(); ++i) {
-                overprints[i][at[i]] += node.size() > 1;
-                holes[i][at[i]] += hole;
-            }
-        });
-        // Out goes the tint that lacks the largest share; at 0 and 100 stand the primaries.
+        // Out goes the tint that lacks the largest share of its overprints with the other inks'
+        // nodes; at 0 and 100 stand the primaries.
+        const std::vector<std::vector<std::size_t>> held = overprints_held(tints, grid);
         std::size_t worst_ink = 0, worst_level = 0;
         double largest = 0;
-        for (std::size_t i = 0; i < grid.size(); ++i)
-            for (std::size_t level = 1; level + 1 < grid[i].size(); ++level) {
-                const double share = static_cast<double>(holes[i][level]) /
-                                     static_cast<double>(overprints[i][level]);
-                if (share > largest) {
+        for (std::size_t i = 0; i < grid.size(); ++i) {
+            double overprints = 1;
+            for (std::size_t other = 0; other < grid.size(); ++other)
+                overprints *= other == i ? 1 : static_cast<double>(grid[other].size());
+            for (std::size_t level = 1; level + 1 < grid[i].size(); ++level)
+                // One of them is of no other ink.
+                if (const double share = 1 - static_cast<double>(held[i][level]) / (overprints - 1);
+                    share > largest) {
                     worst_ink = i;
                     worst_level = level;
                     largest = share;
                 }
-            }
+        }
         if (largest == 0)
             return grid;
         grid[worst_ink].erase(grid[worst_ink].begin() + static_cast<std::ptrdiff_t>(worst_level));
     }
+}
+
+// How many overprints of a grid's nodes the sheet holds, for each level of each ink.
+std::vector<std::vector<std::size_t>>
+CalibratedModel::overprints_held(const Tints &tints, const std::vector<Levels> &grid) const
+{
+    std::vector<std::vector<std::size_t>> out;
+    for (const Levels &levels : grid)
+        out.emplace_back(levels.size(), 0);
+    for (const auto &[overprint, refl] : measured) {
+        std::vector<std::size_t> at(grid.size(), 0);
+        std::size_t inks_found = 0;
+        for (std::size_t i = 0; i < grid.size(); ++i)
+            for (const Tint &tint : overprint)
+                if (tint.ink == tints[i].ink) {
+                    const auto level =
+                        std::lower_bound(grid[i].begin(), grid[i].end(), tint.percent);
+                    at[i] = static_cast<std::size_t>(level - grid[i].begin());
+                    inks_found += level != grid[i].end() && *level == tint.percent;
+                }
+        if (overprint.size() < 2 || inks_found != overprint.size())
+            continue;
+        for (std::size_t i = 0; i < grid.size(); ++i)
+            ++out[i][at[i]];
+    }
+    return out;
 }
 
 CalibratedModel::Place CalibratedModel::place_without(const Tints &tints) const
@@ -148,19 +188,19 @@ CalibratedModel::Place CalibratedModel::place_without(const Tints &tints) const
 }
 
 // R^(1/n) of a node of the grid. Solids that were not measured over one another are films.
-CalibratedModel::Bands CalibratedModel::primary(const Tints &tints, bool films) const
+Spectrum CalibratedModel::primary(const Tints &tints, bool films) const
 {
     const auto found = roots.find(tints);
     if (found != roots.end() && !films)
         return found->second;
     const Tints below(tints.begin(), tints.end() - 1);
     const auto over_paper = measured.find(below);
-    const Bands first =
-        over_paper == measured.end() ? primary(below, false).pow(n).eval() : over_paper->second;
-    const Bands &last = measured.at({tints.back()});
-    Bands refl;
-    CombineInkColors(first.data(), last.data(), refl.data());
-    return refl.pow(1 / n);
+    const Spectrum first = over_paper == measured.end()
+                               ? spectrum_of(bands_of(primary(below, false)).pow(n))
+                               : over_paper->second;
+    Spectrum refl;
+    CombineInkColors(first.data(), measured.at({tints.back()}).data(), refl.data());
+    return spectrum_of(bands_of(refl).pow(1 / n));
 }
 
 // The area that a tint covers of the cell between two nodes of its ramp. Of a tint between those of
@@ -168,9 +208,8 @@ CalibratedModel::Bands CalibratedModel::primary(const Tints &tints, bool films) 
 double CalibratedModel::area(const Tint &tint, double below, double above,
                              std::optional<double> no_tint) const
 {
-    const Bands from = primary({}, false);
     const auto node = [&](double percent) {
-        return percent > 0 ? roots.at({{tint.ink, percent}}) : from;
+        return bands_of(percent > 0 ? roots.at({{tint.ink, percent}}) : roots.at({}));
     };
     const Bands start = node(below), step = node(above) - start;
     double left = below, area_left = 0;
@@ -207,18 +246,16 @@ Spectrum CalibratedModel::estimate(const Place &place) const
         for (std::size_t i = 0; i < at.size(); ++i)
             weight *= share[i][at[i]];
         if (weight > 0)
-            sum += weight * primary(node, place.films && node.size() == tints.size());
+            sum += weight * bands_of(primary(node, place.films && node.size() == tints.size()));
     });
-    Spectrum refl;
-    Eigen::Map<Bands>(refl.data()) = sum.pow(n);
-    return refl;
+    return spectrum_of(sum.pow(n));
 }
 
 void CalibratedModel::set_factor(double factor)
 {
     n = factor;
     for (const auto &[tints, refl] : measured)
-        roots.insert_or_assign(tints, refl.pow(1 / n).eval());
+        roots.insert_or_assign(tints, spectrum_of(bands_of(refl).pow(1 / n)));
 }
 
 bool CalibratedModel::knows(const Tints &tints) const
@@ -232,28 +269,26 @@ bool CalibratedModel::knows(const Tints &tints) const
 // mixtures of paper and solid.
 void CalibratedModel::fit(ILLUM_OBS illuminant)
 {
-    std::vector<Place> overprints, tints_alone;
-    for (const auto &[tints, refl] : measured) {
-        if (!knows(tints) || all_solid(tints))
-            continue;
-        if (tints.size() == 1) {
-            tints_alone.push_back({.tints = tints, .nodes = {{0, 100}}});
-            continue;
-        }
-        if (const auto own = inks_of(tints); !grids.contains(own))
-            grids.emplace(own, grid_of(tints));
-        overprints.push_back(place_without(tints));
-    }
-    const std::vector<Place> &places = overprints.empty() ? tints_alone : overprints;
-    if (places.empty())
+    std::vector<const Tints *> overprints, tints_alone;
+    for (const auto &[tints, refl] : measured)
+        if (knows(tints) && !all_solid(tints))
+            (tints.size() == 1 ? tints_alone : overprints).push_back(&tints);
+    const auto &all = overprints.empty() ? tints_alone : overprints;
+    if (all.empty())
         throw RequestError{"no tints of an ink whose solid is there"};
+    const std::size_t count = std::min(all.size(), kMostOverprints); // an even choice will do
+    std::vector<Place> places;
+    for (std::size_t i = 0; i < count; ++i) {
+        const Tints &tints = *all[i * all.size() / count];
+        if (const auto own = inks_of(tints); tints.size() > 1 && !grids.contains(own))
+            grids.emplace(own, grid_of(tints));
+        places.push_back(tints.size() > 1 ? place_without(tints)
+                                          : Place{.tints = tints, .nodes = {{0, 100}}});
+    }
 
     std::vector<CIELABCOORD> labs;
-    for (const Place &place : places) {
-        Spectrum refl;
-        Eigen::Map<Bands>(refl.data()) = measured.at(place.tints);
-        labs.push_back(lab_of(refl, illuminant));
-    }
+    for (const Place &place : places)
+        labs.push_back(lab_of(measured.at(place.tints), illuminant));
     Eigen::ArrayXXd de00(places.size(), kFactors.size());
     for (std::size_t f = 0; f < kFactors.size(); ++f) {
         set_factor(kFactors[f]);
@@ -273,10 +308,7 @@ void CalibratedModel::fit(ILLUM_OBS illuminant)
         (sums - de00.row(i).transpose()).minCoeff(&without);
         errors.push_back(de00(i, without));
     }
-    std::sort(errors.begin(), errors.end());
-    const double count = static_cast<double>(errors.size());
-    left_out = {errors.size(), std::reduce(errors.begin(), errors.end()) / count,
-                errors[static_cast<std::size_t>(std::ceil(0.95 * count)) - 1], errors.back()};
+    left_out = {errors.size(), statistics_of(errors)};
 }
 
 std::optional<Spectrum> CalibratedModel::predict(const Tints &tints) const
@@ -306,6 +338,9 @@ std::vector<std::string> CalibratedModel::lacking(const Tints &tints) const
                 solids.push_back({tints[i].ink, 100});
         if (!measured.contains(solids))
             out.push_back(fmt::format("no overprint of {}: taken as films", names_of(solids)));
+        else if (solids == tints && tints.size() > 1)
+            out.push_back(fmt::format("no overprint of {} beside the one predicted: taken as films",
+                                      names_of(solids)));
     }
     return out;
 }

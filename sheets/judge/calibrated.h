@@ -2,9 +2,8 @@
 #pragma once
 
 #include "judge/inks.h"
+#include "judge/statistics.h"
 #include "read/measurement.h"
-
-#include <Eigen/Core>
 
 #include <map>
 #include <optional>
@@ -21,8 +20,10 @@ namespace vantrel::sheets {
 // sheet did not hold it.
 class CalibratedModel {
 public:
+    static constexpr std::size_t kMostInks = 4;
+
     // Throws RequestError that tells what the sheet lacks.
-    CalibratedModel(const Measurement &sheet, const Inks &inks, const Patch &paper,
+    CalibratedModel(const Measurement &sheet, const Inks &inks, const Spectrum &paper,
                     ILLUM_OBS illuminant);
 
     // Of one to four inks whose solids the sheet holds; nothing for others.
@@ -37,12 +38,11 @@ public:
     // too; nothing where there are none.
     struct Error {
         std::size_t patches;
-        double mean, p95, max;
+        Statistics de00;
     };
     const std::optional<Error> &error() const { return left_out; }
 
 private:
-    using Bands = Eigen::Array<double, VANTREL_BANDS, 1>;
     using Levels = std::vector<double>; // nominal percentages from 0 to 100, sorted
     // Where a combination lies: the nodes of its inks.
     struct Place {
@@ -55,17 +55,19 @@ private:
     bool knows(const Tints &tints) const;
     std::string names_of(const Tints &tints) const;
     std::vector<Levels> grid_of(const Tints &tints) const;
+    std::vector<std::vector<std::size_t>> overprints_held(const Tints &tints,
+                                                          const std::vector<Levels> &grid) const;
     Place place_without(const Tints &tints) const;
-    Bands primary(const Tints &tints, bool films) const;
+    Spectrum primary(const Tints &tints, bool films) const;
     double area(const Tint &tint, double below, double above, std::optional<double> no_tint) const;
     Spectrum estimate(const Place &place) const;
     void set_factor(double factor);
     void fit(ILLUM_OBS illuminant);
 
     const Inks &inks;
-    std::map<Tints, Bands> measured; // in percent; patches of the same combination averaged
-    std::map<Tints, Bands> roots;    // the same to the power of 1/n
-    std::vector<Levels> ramps;       // of each ink; empty without its solid
+    std::map<Tints, Spectrum> measured; // in percent; patches of the same combination averaged
+    std::map<Tints, Spectrum> roots;    // the same to the power of 1/n
+    std::vector<Levels> ramps;          // of each ink; empty without its solid
     std::map<std::vector<std::size_t>, std::vector<Levels>> grids; // of the overprinted inks
     double n = 1;
     std::optional<Error> left_out;

@@ -19,8 +19,9 @@ struct Layer {
 
 using Model = int(int n, const double *inks, const int *percent, const double *paper, double *refl);
 
-Estimate estimate(Model *model, const std::vector<Layer> &layers, const Spectrum &paper,
-                  ILLUM_OBS illuminant, int status, const std::optional<Measured> &measured)
+constexpr std::size_t kMostSolids = 3; // that these models take
+
+Spectrum estimate(Model *model, const std::vector<Layer> &layers, const Spectrum &paper)
 {
     std::vector<double> inks;
     std::vector<int> percent;
@@ -28,30 +29,87 @@ Estimate estimate(Model *model, const std::vector<Layer> &layers, const Spectrum
         inks.insert(inks.end(), layer.solid->refl.begin(), layer.solid->refl.end());
         percent.push_back(layer.percent);
     }
-    Estimate out;
-    model(static_cast<int>(layers.size()), inks.data(), percent.data(), paper.data(),
-          out.refl.data());
-    out.colour = colour_of(out.refl, illuminant);
-    out.reading = Densitometer(paper, status).read(out.refl);
-    if (measured)
-        out.to_measured = delta_e00(measured->colour.lab, out.colour.lab);
-    return out;
+    Spectrum refl;
+    model(static_cast<int>(layers.size()), inks.data(), percent.data(), paper.data(), refl.data());
+    return refl;
 }
 
-Prediction prediction_of(const std::vector<Layer> &layers, const Paper &paper, ILLUM_OBS illuminant,
-                         int status, const Patch *patch)
+// What the layers are as device values; nothing where a solid is no ink of the file.
+std::optional<Tints> tints_of(const std::vector<Layer> &layers, const Inks &inks)
 {
-    Prediction out;
-    for (const Layer &layer : layers)
-        out.inks.push_back({layer.solid->name, layer.percent});
-    if (patch)
-        out.measured = {patch->name, colour_of(patch->refl, illuminant),
-                        Densitometer(paper.refl, status).read(patch->refl)};
-    out.halftone = estimate(EstimateRefls, layers, paper.refl, illuminant, status, out.measured);
-    out.film = estimate(EstimateReflsForBestVisualColor, layers, paper.refl, illuminant, status,
-                        out.measured);
-    return out;
+    Tints tints;
+    for (const Layer &layer : layers) {
+        const auto ink = inks.ink_of_solid(*layer.solid);
+        if (!ink)
+            return std::nullopt;
+        if (layer.percent > 0)
+            tints.push_back({*ink, static_cast<double>(layer.percent)});
+    }
+    std::sort(tints.begin(), tints.end());
+    return tints;
 }
+
+// Predicts combinations of one sheet's inks on one paper.
+class Predictor {
+public:
+    Predictor(const Measurement &sheet, const Inks &inks, const Paper &paper, Predictions &out)
+        : paper(paper), out(out)
+    {
+        try {
+            calibrated.emplace(sheet, inks, paper.refl, out.illuminant);
+            out.n_factor = calibrated->n_factor();
+            out.error = calibrated->error();
+        } catch (const RequestError &error) {
+            out.not_calibrated = error.message;
+        }
+    }
+
+    // `patch` is the one that was printed with these layers, or null. Throws RequestError where no
+    // model can predict them.
+    void add(const std::vector<Layer> &layers, const std::optional<Tints> &tints,
+             const Patch *patch) const
+    {
+        Prediction prediction;
+        for (const Layer &layer : layers)
+            prediction.inks.push_back({layer.solid->name, layer.percent});
+        if (patch)
+            prediction.measured = {patch->name, colour_of(patch->refl, out.illuminant),
+                                   Densitometer(paper.refl, out.status).read(patch->refl)};
+        std::array<std::optional<Spectrum>, kModels.size()> refl;
+        if (layers.size() <= kMostSolids)
+            refl = {estimate(EstimateRefls, layers, paper.refl),
+                    estimate(EstimateReflsForBestVisualColor, layers, paper.refl)};
+        if (calibrated && tints) {
+            refl[2] = calibrated->predict(*tints);
+            prediction.lacking = calibrated->lacking(*tints);
+        }
+        for (std::size_t model = 0; model < refl.size(); ++model)
+            if (refl[model])
+                prediction.estimates[model] = measure(*refl[model], prediction.measured);
+        if (layers.size() > kMostSolids && !prediction.estimates[2])
+            throw RequestError{fmt::format(
+                "{}: {} inks take the calibrated model, but the sheet holds {}", out.file,
+                layers.size(),
+                prediction.lacking.empty() ? out.not_calibrated : prediction.lacking[0])};
+        out.all.push_back(std::move(prediction));
+    }
+
+private:
+    Estimate measure(const Spectrum &refl, const std::optional<Measured> &measured) const
+    {
+        Estimate estimate{.refl = refl,
+                          .colour = colour_of(refl, out.illuminant),
+                          .to_measured = {},
+                          .reading = Densitometer(paper.refl, out.status).read(refl)};
+        if (measured)
+            estimate.to_measured = delta_e00(measured->colour.lab, estimate.colour.lab);
+        return estimate;
+    }
+
+    const Paper &paper;
+    Predictions &out;
+    std::optional<CalibratedModel> calibrated;
+};
 
 // The solid that a name stands for: a patch by name or id, or the ink of a device field.
 const Patch &solid_named(const Measurement &sheet, const Inks &inks, std::string_view name)
@@ -68,28 +126,13 @@ const Patch &solid_named(const Measurement &sheet, const Inks &inks, std::string
     return ink ? *inks.solid(*ink) : patch_named(sheet, name);
 }
 
-// The patch that was printed with these layers, null where there is none.
-const Patch *measured_of(const std::vector<Layer> &layers, const Inks &inks)
-{
-    Tints tints;
-    for (const Layer &layer : layers) {
-        const auto ink = inks.ink_of_solid(*layer.solid);
-        if (!ink)
-            return nullptr;
-        if (layer.percent > 0)
-            tints.push_back({*ink, static_cast<double>(layer.percent)});
-    }
-    std::sort(tints.begin(), tints.end());
-    return inks.measured(tints);
-}
-
-// The solids of an overprint of two or three inks, nothing where it cannot be predicted.
-std::vector<Layer> layers_of(const Tints &tints, const Inks &inks)
+// The solids of an overprint, nothing where it cannot be predicted.
+std::vector<Layer> layers_of(const Tints &tints, const Inks &inks, std::size_t most)
 {
     std::vector<Layer> layers;
     for (const Tint &tint : tints) {
         const Patch *solid = inks.solid(tint.ink);
-        if (!solid || tints.size() > kMostInks || tint.percent != std::floor(tint.percent))
+        if (!solid || tints.size() > most || tint.percent != std::floor(tint.percent))
             return {};
         layers.push_back({solid, static_cast<int>(tint.percent)});
     }
@@ -99,8 +142,9 @@ std::vector<Layer> layers_of(const Tints &tints, const Inks &inks)
 std::vector<Layer> layers_named(const std::vector<InkTint> &wishes, const Measurement &sheet,
                                 const Inks &inks)
 {
-    if (wishes.size() > kMostInks)
-        throw RequestError{fmt::format("{} inks; {} are the most", wishes.size(), kMostInks)};
+    if (wishes.size() > CalibratedModel::kMostInks)
+        throw RequestError{
+            fmt::format("{} inks; {} are the most", wishes.size(), CalibratedModel::kMostInks)};
     std::vector<Layer> layers;
     for (const InkTint &wish : wishes) {
         const Layer layer{&solid_named(sheet, inks, wish.name), wish.percent};
@@ -113,23 +157,23 @@ std::vector<Layer> layers_named(const std::vector<InkTint> &wishes, const Measur
     return layers;
 }
 
-// Every measured overprint of two or three inks.
-void predict_overprints(Predictions &out, const Measurement &sheet, const Inks &inks,
-                        const Paper &paper)
+void predict_overprints(const Predictor &predictor, Predictions &out, const Measurement &sheet,
+                        const Inks &inks)
 {
+    const std::size_t most = out.n_factor ? CalibratedModel::kMostInks : kMostSolids;
     for (const Patch &patch : sheet.patches) {
         const auto tints = inks.tints_of(patch);
         if (!tints || tints->size() < 2)
             continue;
-        const std::vector<Layer> layers = layers_of(*tints, inks);
+        const std::vector<Layer> layers = layers_of(*tints, inks, most);
         if (layers.empty())
             ++out.left_out;
         else
-            out.all.push_back(prediction_of(layers, paper, out.illuminant, out.status, &patch));
+            predictor.add(layers, tints, &patch);
     }
     if (out.all.empty())
         throw RequestError{fmt::format(
-            "{} holds no overprint of two or three inks beside their solids; name inks with --ink",
+            "{} holds no overprint of two to four inks beside their solids; name inks with --ink",
             sheet.file)};
 }
 
@@ -148,12 +192,13 @@ Predictions predict(const Measurement &sheet, const PredictRequest &request)
                     .paper = paper.choice,
                     .all = {},
                     .warnings = std::move(warnings)};
+    const Predictor predictor(sheet, inks, paper, out);
     if (request.inks.empty()) {
-        predict_overprints(out, sheet, inks, paper);
+        predict_overprints(predictor, out, sheet, inks);
     } else {
         const std::vector<Layer> layers = layers_named(request.inks, sheet, inks);
-        out.all.push_back(
-            prediction_of(layers, paper, illuminant, request.status, measured_of(layers, inks)));
+        const auto tints = tints_of(layers, inks);
+        predictor.add(layers, tints, tints ? inks.measured(*tints) : nullptr);
     }
     return out;
 }

@@ -1,21 +1,25 @@
 // What inks will measure as tints and over one another, beside what was measured.
 #pragma once
 
+#include "judge/calibrated.h"
 #include "judge/colour.h"
 #include "judge/densitometer.h"
 #include "judge/paper.h"
 #include "judge/stated.h"
 #include "read/measurement.h"
 
+#include <array>
 #include <cstddef>
 #include <optional>
 #include <string>
+#include <string_view>
 #include <vector>
 
 namespace vantrel::sheets {
 
-// As many solids as the models take.
-constexpr std::size_t kMostInks = 3;
+// Tints as ink and paper mixed by area, as thinner films (these two know the solids and the paper
+// alone, of up to three inks), and by the model that is fitted to the sheet.
+constexpr std::array<std::string_view, 3> kModels = {"halftone", "film", "calibrated"};
 
 struct InkTint {
     std::string name; // of the solid's patch
@@ -37,9 +41,9 @@ struct Measured {
 };
 
 struct Prediction {
-    std::vector<InkTint> inks; // in the order of printing
-    Estimate halftone;         // tints as ink and paper mixed by area
-    Estimate film;             // tints as thinner films
+    std::vector<InkTint> inks;                                     // in the order of printing
+    std::array<std::optional<Estimate>, kModels.size()> estimates; // by model
+    std::vector<std::string> lacking; // on the sheet, for the calibrated model
     std::optional<Measured> measured;
 };
 
@@ -50,6 +54,10 @@ struct Predictions {
     PaperChoice paper;
     std::vector<Prediction> all;
     std::size_t left_out = 0; // measured overprints that cannot be predicted
+    // The calibrated model's Yule-Nielsen factor, and its error on patches that it was not shown.
+    std::optional<double> n_factor{};
+    std::optional<CalibratedModel::Error> error{};
+    std::string not_calibrated{}; // what the sheet holds instead of what such a model takes
     std::vector<std::string> warnings;
 };
 
@@ -59,7 +67,7 @@ struct PredictRequest {
     std::string paper;              // as paper_of() takes it
     std::vector<std::string> order; // of printing, as Inks takes it
     // The combination to predict, in the order of printing, each by its solid's patch, name or id,
-    // or by its device field; every measured overprint of two or three inks where it is empty.
+    // or by its device field; every measured overprint of two to four inks where it is empty.
     std::vector<InkTint> inks;
 };
 

@@ -9,6 +9,8 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <array>
+#include <memory>
 
 namespace vantrel::sheets {
 namespace {
@@ -37,30 +39,53 @@ std::string shown(const DensityReading &reading, int status)
                            : "none";
 }
 
-// The densities of the one prediction.
-std::string densities_of(const Predictions &predictions)
+// "Halftone"
+std::string title_of(std::string_view model)
 {
-    const Prediction &only = predictions.all[0];
-    std::string out =
-        fmt::format("\nDensity ({}): halftone {}, film {}", status_name(predictions.status),
-                    shown(only.halftone.reading, predictions.status),
-                    shown(only.film.reading, predictions.status));
-    if (only.measured)
-        out += ", measured " + shown(only.measured->reading, predictions.status);
-    return out;
+    return upper(model.substr(0, 1)) + std::string(model.substr(1));
 }
 
-// The mean and the largest difference of one model.
-std::string summary(const Predictions &predictions, const char *name, Estimate Prediction::*model)
+// The mean and the largest difference of one model; empty where it predicted nothing.
+std::string summary(const Predictions &predictions, std::size_t model)
 {
-    double sum = 0, largest = 0;
+    double sum = 0, largest = 0, count = 0;
     for (const Prediction &prediction : predictions.all) {
-        const double delta_e = (prediction.*model).to_measured.value_or(0);
+        if (!prediction.estimates[model])
+            continue;
+        const double delta_e = prediction.estimates[model]->to_measured.value_or(0);
         sum += delta_e;
         largest = std::max(largest, delta_e);
+        ++count;
     }
-    return fmt::format("{}: mean ΔE00 {}, largest {}", name,
-                       fixed(sum / static_cast<double>(predictions.all.size())), fixed(largest));
+    return count > 0 ? fmt::format("{}: mean ΔE00 {}, largest {}", title_of(kModels[model]),
+                                   fixed(sum / count), fixed(largest))
+                     : "";
+}
+
+// How the calibrated model was fitted, and how far it can be trusted.
+std::string fit_of(const Predictions &predictions)
+{
+    if (!predictions.n_factor)
+        return "Not calibrated: the sheet holds " + predictions.not_calibrated;
+    std::string out = fmt::format("Calibrated: n = {:g}; ", *predictions.n_factor);
+    if (!predictions.error)
+        return out + "no overprints of tints tell its error";
+    return out + fmt::format("on {} overprints that it was not shown, each in turn, mean ΔE00 {}, "
+                             "95 % {}, largest {}",
+                             predictions.error->patches, fixed(predictions.error->de00.mean),
+                             fixed(predictions.error->de00.p95),
+                             fixed(predictions.error->de00.max));
+}
+
+// What the sheet lacks, each once.
+std::vector<std::string> lacking_in(const Predictions &predictions)
+{
+    std::vector<std::string> out;
+    for (const Prediction &prediction : predictions.all)
+        for (const std::string &one : prediction.lacking)
+            if (std::find(out.begin(), out.end(), one) == out.end())
+                out.push_back(one);
+    return out;
 }
 
 Json estimate_json(const Estimate &estimate, int status)
@@ -71,6 +96,20 @@ Json estimate_json(const Estimate &estimate, int status)
                 {"refl", estimate.refl}};
     add_reading(out, estimate.reading, status);
     return out;
+}
+
+Json calibration_json(const Predictions &predictions)
+{
+    Json error;
+    if (predictions.error)
+        error = {{"patches", predictions.error->patches},
+                 {"mean", predictions.error->de00.mean},
+                 {"p95", predictions.error->de00.p95},
+                 {"max", predictions.error->de00.max}};
+    return {{"n", or_null(predictions.n_factor)},
+            {"left_out_error", error},
+            {"missing", predictions.n_factor ? Json() : Json(predictions.not_calibrated)},
+            {"words", fit_of(predictions)}};
 }
 
 Json prediction_json(const Prediction &prediction, int status)
@@ -85,55 +124,85 @@ Json prediction_json(const Prediction &prediction, int status)
                     {"lab", lab_json(prediction.measured->colour.lab)}};
         add_reading(measured, prediction.measured->reading, status);
     }
-    return {{"inks", inks},
-            {"halftone", estimate_json(prediction.halftone, status)},
-            {"film", estimate_json(prediction.film, status)},
-            {"measured", measured}};
+    Json out = {{"inks", inks}};
+    for (std::size_t model = 0; model < kModels.size(); ++model)
+        out[kModels[model]] = prediction.estimates[model]
+                                  ? estimate_json(*prediction.estimates[model], status)
+                                  : Json();
+    out["lacking"] = prediction.lacking;
+    out["measured"] = measured;
+    return out;
+}
+
+// Of one combination: a line for each model and the measurement.
+void add_models(Lines &lines, const Predictions &predictions, bool colour)
+{
+    const Prediction &only = predictions.all[0];
+    lines.add(inks_of(only, kWidestInText));
+    lines.add(fmt::format("\n{:<12} {}{:>7}{:>7}{:>7}{:>7}{:>11}", "", colour ? "    " : "", "L*",
+                          "a*", "b*", "ΔE00", "Density"));
+    const auto add = [&](std::string_view name, const Colour &shown_colour,
+                         const std::optional<double> &delta_e, const DensityReading &reading) {
+        lines.add(fmt::format("{:<12}{}{:>7}{:>11}", name, colour_columns(shown_colour, colour),
+                              fixed(delta_e), shown(reading, predictions.status)));
+    };
+    for (std::size_t model = 0; model < kModels.size(); ++model)
+        if (const auto &estimate = only.estimates[model])
+            add(title_of(kModels[model]), estimate->colour, estimate->to_measured,
+                estimate->reading);
+    if (only.measured)
+        add("Measured", only.measured->colour, {}, only.measured->reading);
+    lines.add("");
+}
+
+// Of many combinations: the measurement, what the best model says, and the difference of each.
+void add_combinations(Lines &lines, const Predictions &predictions, bool colour)
+{
+    std::size_t width = 11;
+    for (const Prediction &prediction : predictions.all)
+        width = std::max(width, characters(cut(prediction.measured->patch, kWidestName)));
+    const std::string gap = colour ? "    " : "";
+    const std::string lab = fmt::format(" {}{:>7}{:>7}{:>7}", gap, "L*", "a*", "b*");
+    lines.add(fmt::format("\n{:<{}} {}{:>21} {}{:>21}{:>33}", "", width, gap, "Measured", gap,
+                          "Calibrated", "ΔE00 to measured"));
+    lines.add(fmt::format("{:<{}}{}{}{:>12}{:>10}{:>11}", "Combination", width, lab, lab,
+                          "Halftone", "Film", "Calibrated"));
+    for (const Prediction &prediction : predictions.all) {
+        const auto &calibrated = prediction.estimates[2];
+        std::string line = fmt::format("{:<{}}{}", cut(prediction.measured->patch, kWidestName),
+                                       width, colour_columns(prediction.measured->colour, colour));
+        line += calibrated ? colour_columns(calibrated->colour, colour)
+                           : std::string(22 + gap.size(), ' ');
+        constexpr std::array widths = {12, 10, 11};
+        for (std::size_t model = 0; model < kModels.size(); ++model)
+            line += fmt::format(
+                "{:>{}}",
+                prediction.estimates[model] ? fixed(prediction.estimates[model]->to_measured) : "",
+                widths[model]);
+        lines.add(line);
+    }
+    lines.add("");
+    for (std::size_t model = 0; model < kModels.size(); ++model)
+        if (const std::string line = summary(predictions, model); !line.empty())
+            lines.add(line);
 }
 
 } // namespace
 
 void write_table(const Predictions &predictions, const Sink &sink, const TableStyle &style)
 {
-    const bool colour = style.colour;
-    const std::size_t widest = colour ? 26 : 38; // 120 columns in all
-    const auto title = [&](const Prediction &prediction) {
-        return cut(prediction.measured ? prediction.measured->patch
-                                       : inks_of(prediction, kWidestInText),
-                   widest);
-    };
-    std::size_t width = 11;
-    for (const Prediction &prediction : predictions.all)
-        width = std::max(width, characters(title(prediction)));
     Lines lines(sink);
     lines.add(fmt::format("{}: {}, on {}", predictions.file, said(predictions.illuminant),
                           said(predictions.paper)));
     if (predictions.all.size() == 1)
-        lines.add(inks_of(predictions.all[0], kWidestInText));
-    const std::string gap = colour ? "    " : "";
-    const std::string lab = fmt::format(" {}{:>7}{:>7}{:>7}", gap, "L*", "a*", "b*");
-    lines.add(fmt::format("\n{:<{}} {}{:>28} {}{:>28} {}{:>21}", "", width, gap, "Halftone", gap,
-                          "Film", gap, "Measured"));
-    lines.add(
-        fmt::format("{:<{}}{}{:>7}{}{:>7}{}", "Combination", width, lab, "ΔE00", lab, "ΔE00", lab));
-    for (const Prediction &prediction : predictions.all) {
-        std::string line = fmt::format("{:<{}}", title(prediction), width);
-        for (const Estimate *estimate : {&prediction.halftone, &prediction.film})
-            line += colour_columns(estimate->colour, colour) +
-                    fmt::format("{:>7}", fixed(estimate->to_measured));
-        if (prediction.measured)
-            line += colour_columns(prediction.measured->colour, colour);
-        lines.add(line);
-    }
-    if (predictions.all.size() > 1) { // every one of them measured
-        lines.add("");
-        lines.add(summary(predictions, "Halftone", &Prediction::halftone));
-        lines.add(summary(predictions, "Film", &Prediction::film));
-    }
-    if (predictions.all.size() == 1)
-        lines.add(densities_of(predictions));
+        add_models(lines, predictions, style.colour);
+    else // every one of them measured
+        add_combinations(lines, predictions, style.colour);
+    lines.add(fit_of(predictions));
+    for (const std::string &one : lacking_in(predictions))
+        lines.add("The sheet holds " + one);
     if (predictions.left_out)
-        lines.add(fmt::format("Left out: {} overprints of more than three inks, of fractions of a "
+        lines.add(fmt::format("Left out: {} overprints of more than four inks, of fractions of a "
                               "percent, or without a solid",
                               predictions.left_out));
 }
@@ -150,6 +219,7 @@ void write_json(const Predictions &predictions, const Sink &sink)
         {"paper", name_json(predictions.paper)},
         {"paper_chosen", predictions.paper.reason},
         {"left_out", predictions.left_out},
+        {"calibration", calibration_json(predictions)},
     };
     write_with_array(
         head, "predictions", predictions.all.size(),
@@ -160,34 +230,41 @@ void write_json(const Predictions &predictions, const Sink &sink)
 
 std::vector<Flat> flat_of(const Predictions &predictions)
 {
-    // Each prediction is a row for each model.
-    const std::vector<Prediction> &all = predictions.all;
+    // Each prediction is a row for each model that has one.
+    struct Place {
+        std::size_t prediction, model;
+    };
+    const auto places = std::make_shared<std::vector<Place>>();
+    for (std::size_t i = 0; i < predictions.all.size(); ++i)
+        for (std::size_t model = 0; model < kModels.size(); ++model)
+            if (predictions.all[i].estimates[model])
+                places->push_back({i, model});
     const int status = predictions.status;
-    const auto is_halftone = [](std::size_t i) { return i % 2 == 0; };
-    const auto estimate = [&all, is_halftone](std::size_t i) -> const Estimate & {
-        return is_halftone(i) ? all[i / 2].halftone : all[i / 2].film;
+    const auto prediction = [&all = predictions.all, places](std::size_t i) -> const Prediction & {
+        return all[(*places)[i].prediction];
     };
-    const auto model = [is_halftone](std::size_t i) {
-        return is_halftone(i) ? "halftone" : "film";
+    const auto estimate = [prediction, places](std::size_t i) -> const Estimate & {
+        return *prediction(i).estimates[(*places)[i].model];
     };
+    const auto model = [places](std::size_t i) { return std::string(kModels[(*places)[i].model]); };
     const auto response_of = [status](const DensityReading &reading) {
         return reading.response ? response_name(status, *reading.response) : "";
     };
-    const auto measured = [&all](std::size_t i) -> const std::optional<Measured> & {
-        return all[i / 2].measured;
+    const auto measured = [prediction](std::size_t i) -> const std::optional<Measured> & {
+        return prediction(i).measured;
     };
     Flat flat;
     flat.description = fmt::format("Predictions from {}: {}, on {}", predictions.file,
                                    name_of(predictions.illuminant), said(predictions.paper));
-    flat.rows = 2 * all.size();
+    flat.rows = places->size();
     flat.text("file", "", [&predictions](std::size_t) { return predictions.file; });
-    flat.text("name", "SAMPLE_NAME", [&all, model](std::size_t i) {
-        return fmt::format("{} {}", inks_of(all[i / 2], kLongestInkInName), model(i));
+    flat.text("name", "SAMPLE_NAME", [prediction, model](std::size_t i) {
+        return fmt::format("{} {}", inks_of(prediction(i), kLongestInkInName), model(i));
     });
     flat.text("model", "MODEL", model);
-    for (std::size_t ink = 0; ink < kMostInks; ++ink) {
-        const auto tint = [&all, ink](std::size_t i) {
-            return ink < all[i / 2].inks.size() ? &all[i / 2].inks[ink] : nullptr;
+    for (std::size_t ink = 0; ink < CalibratedModel::kMostInks; ++ink) {
+        const auto tint = [prediction, ink](std::size_t i) {
+            return ink < prediction(i).inks.size() ? &prediction(i).inks[ink] : nullptr;
         };
         flat.text(fmt::format("ink{}", ink + 1), fmt::format("INK_{}", ink + 1),
                   [tint](std::size_t i) { return tint(i) ? tint(i)->name : ""; });
@@ -213,6 +290,12 @@ std::vector<Flat> flat_of(const Predictions &predictions)
         return measured(i) ? measured(i)->reading.density : std::nullopt;
     });
     flat.text("paper", "PAPER", [&predictions](std::size_t) { return said(predictions.paper); });
+    flat.text("calibration", "CALIBRATION", [&predictions, prediction](std::size_t i) {
+        std::string out = fit_of(predictions);
+        for (const std::string &one : prediction(i).lacking)
+            out += "; the sheet holds " + one;
+        return out;
+    });
     flat.spectrum([estimate](std::size_t i) -> const Spectrum & { return estimate(i).refl; });
     return {flat};
 }

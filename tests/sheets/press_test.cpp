@@ -73,7 +73,7 @@ struct Press {
     double miss(double cyan, double yellow) const
     {
         const Inks inks(sheet, {});
-        const CalibratedModel model(sheet, inks, sheet.patches[0], D50_2DEG);
+        const CalibratedModel model(sheet, inks, sheet.patches[0].refl, D50_2DEG);
         const auto refl = model.predict({{0, cyan}, {1, yellow}});
         return delta_e00(lab_of(patch(cyan, yellow).refl, D50_2DEG), lab_of(*refl, D50_2DEG));
     }
@@ -89,10 +89,10 @@ TEST(CalibratedModel, FindsTheFactorAndTheDotsOfThePress)
 {
     const Press press(strip);
     const Inks inks(press.sheet, {});
-    const CalibratedModel model(press.sheet, inks, press.sheet.patches[0], D50_2DEG);
+    const CalibratedModel model(press.sheet, inks, press.sheet.patches[0].refl, D50_2DEG);
     EXPECT_EQ(model.n_factor(), 2);
     EXPECT_EQ(model.error()->patches, 2U);
-    EXPECT_LT(model.error()->max, 1e-6);
+    EXPECT_LT(model.error()->de00.max, 1e-6);
     EXPECT_LT(press.miss(50, 75), 1e-6); // not on the sheet
     EXPECT_LT(press.miss(60, 30), 0.3);  // between its tints
     EXPECT_TRUE(model.lacking({{0, 50}, {1, 75}}).empty());
@@ -112,13 +112,13 @@ TEST(CalibratedModel, SaysWhatTheSheetLacks)
 {
     Press press({{0, 0}, {50, 0}, {100, 0}, {0, 100}});
     const Inks inks(press.sheet, {});
-    const CalibratedModel model(press.sheet, inks, press.sheet.patches[0], D50_2DEG);
+    const CalibratedModel model(press.sheet, inks, press.sheet.patches[0].refl, D50_2DEG);
     EXPECT_FALSE(model.error());
     EXPECT_EQ(model.lacking({{0, 50}, {1, 75}}),
               (std::vector<std::string>{"no tints of CMYK_Y: its dots are as large as asked for",
                                         "no overprint of CMYK_C + CMYK_Y: taken as films"}));
     press.sheet.patches.erase(press.sheet.patches.begin() + 1);
-    EXPECT_THROW(CalibratedModel(press.sheet, inks, press.sheet.patches[0], D50_2DEG),
+    EXPECT_THROW(CalibratedModel(press.sheet, inks, press.sheet.patches[0].refl, D50_2DEG),
                  RequestError);
 }
 

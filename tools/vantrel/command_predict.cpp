@@ -48,9 +48,11 @@ Outcome run(const PredictOptions &options)
 }
 
 constexpr const char *kFooter =
-    "Two models stand side by side: tints as halftones, which mix ink and paper by area, and as "
-    "thinner\nfilms. Where the file holds the same combination, its colour and the difference are "
-    "shown.\n\n"
+    "Three models stand side by side: tints as halftones, which mix ink and paper by area; as "
+    "thinner\nfilms, both of up to three inks; and calibrated, the Yule-Nielsen-Neugebauer model "
+    "with the dots, the\nn, the overprints and the mid-tones of the sheet itself. It predicts a "
+    "combination as if the sheet did\nnot hold it, and tells its error on those that the sheet "
+    "holds. Where the file holds the combination,\nits colour and the difference are shown.\n\n"
     "CSV, CGATS and JSON (its fields stand in docs/json.md) hold the predicted spectra too; in CSV "
     "and\nCGATS each prediction is a row for each model.\n\n"
     "Example:\n  vantrel predict two_ink_halftone.txt --ink \"Magenta 100:40\" --ink CMYK_Y:70";
@@ -70,9 +72,9 @@ Command add_predict(CLI::App &app)
     add_order_option(*command, options->order);
     command
         ->add_option("--ink", options->ink_tints,
-                     "NAME:PERCENT, once for each of one to three inks in the order of printing. "
+                     "NAME:PERCENT, once for each of one to four inks in the order of printing. "
                      "NAME is the solid's patch by name or id, or the ink's device field. Without "
-                     "any, every measured overprint of two or three inks is predicted")
+                     "any, every measured overprint of two to four inks is predicted")
         ->allow_extra_args(false);
     command->footer(kFooter);
     return {command, [options] { return run(*options); }};

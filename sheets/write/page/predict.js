@@ -1,4 +1,4 @@
-// vantrel predict: what two models expect of each combination, beside the measurement.
+// vantrel predict: what three models expect of each combination, beside the measurement.
 
 import { chosenPaper, colourOf, count, fixed, h, named, warnings } from './dom.js';
 import { searchTable } from './table.js';
@@ -12,7 +12,7 @@ export function predictPage(result) {
   const density = (side) => ({ label: `D ${side}`, decimals: 3,
     title: `Density over the paper, ${side}`, value: (row) => row[side]?.density });
   const difference = (side) => ({ label: `ΔE00 ${side}`, decimals: 2,
-    title: 'CIEDE2000 to the measurement', value: (row) => row[side].de00_to_measured });
+    title: 'CIEDE2000 to the measurement', value: (row) => row[side]?.de00_to_measured });
   return [
     h('h1', {}, 'Predicted overprints'),
     h('p', { class: 'about' }, named(result.file), ` · ${result.illuminant} · on `,
@@ -20,17 +20,20 @@ export function predictPage(result) {
       ` · ${count(result.predictions.length, 'combination')}`),
     warnings(result.warnings),
     result.left_out ? h('p', { class: 'note' }, `Left out: ${count(result.left_out, 'overprint')} ` +
-      'of more than three inks, of fractions of a percent, or without a solid.') : null,
+      'of more than four inks, of fractions of a percent, or without a solid.') : null,
+    h('p', { class: 'note' }, result.calibration.words, '.'),
+    [...new Set(result.predictions.flatMap((row) => row.lacking))].map((text) =>
+      h('p', { class: 'note' }, `The sheet holds ${text}.`)),
     searchTable({
       caption: 'All combinations',
       noun: 'combination',
       columns: [
         { label: 'Combination', value: nameOf },
-        ...['halftone', 'film', 'measured'].flatMap((side) => [...lab(side), density(side),
-          ...(side === 'measured' ? [] : [difference(side)])]),
+        ...['halftone', 'film', 'calibrated', 'measured'].flatMap((side) => [...lab(side),
+          density(side), ...(side === 'measured' ? [] : [difference(side)])]),
       ],
       rows: result.predictions,
-      colour: (row) => colourOf(row.measured ?? row.halftone),
+      colour: (row) => colourOf(row.measured ?? row.calibrated ?? row.halftone),
       text: (row) => `${nameOf(row)} ${row.inks.map((ink) => ink.name).join(' ')}`,
     }),
   ];
