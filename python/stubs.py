@@ -1,6 +1,5 @@
 """Writes src/vantrel/__init__.pyi from the installed package: python stubs.py"""
 
-import enum
 import inspect
 import textwrap
 from pathlib import Path
@@ -15,13 +14,16 @@ Results are arrays of the kind that was handed in, NumPy scalars for single rows
 tuple that ends with the flags.
 """
 
-from enum import IntEnum
 from contextlib import AbstractContextManager
 from typing import Annotated, Any, Literal, Optional, Protocol, Sequence, TypeVar, Union, overload
 
 import numpy as np
 from numpy.typing import ArrayLike, NDArray
 
+from . import plot as plot
+from ._enums import IllumObs as IllumObs, Response as Response, Status as Status
+from ._judge import compare as compare, predict as predict, report as report
+from ._results import Comparison as Comparison, Predictions as Predictions, Report as Report
 from ._sheet import Origin as Origin, Sheet as Sheet, Source as Source, read as read, reads as reads
 
 class _SupportsArray(Protocol):
@@ -132,10 +134,6 @@ def stubs():
     parts += [names_of(kind) for kind in INDICES]
     parts += ["_Row = NDArray[np.float64]", "__version__: str", "ufuncs: Any"]
     parts += ["den_weight: NDArray[np.int64]", f"\n__all__ = [\n{inside(names)}\n]\n"]
-    for name, value in public.items():
-        if inspect.isclass(value) and issubclass(value, enum.Enum):
-            members = "".join(f"    {m.name} = {int(m)}\n" for m in value)
-            parts.append(f"class {name}(IntEnum):\n{members}")
     for name, value in public.items():
         if callable(value) and getattr(value, "__name__", None) in DECLARED:
             parts.append(declarations(name, value))

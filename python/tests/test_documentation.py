@@ -70,6 +70,10 @@ with vantrel.settings(hifi=([480, 560, 620],)):
 sheet = vantrel.read("sheet.cxf", condition="M1")
 names: list[str] = sheet.names
 vantrel.CIEDE2000.calculate(lab, lab)
+report = vantrel.report(sheet, status="T", illuminant=vantrel.IllumObs.D65_2DEG)
+gains: list[float] = [value.dot_gain for curve in report.tone_values for value in curve.values]
+says: str = vantrel.compare(sheet, sheet, formula=["cmc"], weights={"cmc": (1, 1)}).says
+vantrel.plot.ab_plane(report).figure.savefig("ab.png")
 """
 WRONG = [
     'vantrel.refl_to_density(spectra, None, "NONSENSE", 1)',
@@ -79,6 +83,9 @@ WRONG = [
     'vantrel.refl_to_xyz(spectra, "A_2DEG", okay=True)',
     "lab.nonsense()",
     'vantrel.read("sheet.cxf", condition="M7")',
+    'vantrel.report(sheet, status="NONSENSE")',
+    'vantrel.compare(sheet, sheet, formula="de2001")',
+    "float(report.patches[0].density)",
 ]
 
 

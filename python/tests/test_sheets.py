@@ -1,13 +1,22 @@
 """Measurement files of every format, as arrays."""
 
+import dataclasses
+import os
+import pickle
+import shlex
+import subprocess
+import warnings
+from dataclasses import replace
 from pathlib import Path
 
+import matplotlib
 import numpy as np
 import pytest
 
 import vantrel
 
-EXAMPLE = Path(__file__).parents[1] / "library/examples/two_ink_halftone.txt"
+LIBRARY = Path(__file__).resolve().parents[1] / "library"
+EXAMPLE = LIBRARY / "examples/two_ink_halftone.txt"
 
 WIDE = "NUMBER_OF_FIELDS 39\nBEGIN_DATA_FORMAT\nSAMPLE_ID SAMPLE_NAME CMYK_C LAB_L LAB_A LAB_B "
 WIDE += " ".join(f"SPECTRAL_NM{nm}" for nm in range(390, 711, 10)) + "\nEND_DATA_FORMAT\n"
@@ -73,3 +82,215 @@ def test_colours_alone_are_a_sheet_too():
 def test_what_cannot_be_read_says_why(call, reason):
     with pytest.raises(ValueError, match=reason):
         call()
+
+
+@pytest.fixture(scope="module")
+def sheet():
+    return vantrel.read(EXAMPLE)
+
+
+@pytest.fixture(scope="module")
+def darker(sheet):
+    """Of 31 patches, one measured twice and one without its name among the aims."""
+    kept = [*range(31), 4]
+    return replace(
+        sheet,
+        spectra=sheet.spectra[kept] * np.linspace(0.9, 1, 32)[:, None],
+        names=["no aim", *sheet.names[1:], sheet.names[4]],
+        ids=[*map(str, range(32))],
+        device={field: column[kept] for field, column in sheet.device.items()},
+        lines=[],
+        file="darker.txt",
+    )
+
+
+def agree(made, document):
+    """Whether a result holds all of a document, in whatever order."""
+    if dataclasses.is_dataclass(made):
+        attributes = {f.name: getattr(made, f.name) for f in dataclasses.fields(made)}
+        delta_e = attributes.pop("delta_e", {})
+        missing = {name for name, value in attributes.items() if value is None}
+        agree({**attributes, **delta_e}, {**dict.fromkeys(missing), **document})
+    elif isinstance(made, dict):
+        assert made.keys() == document.keys()
+        for key, value in made.items():
+            agree(value, document[key])
+    elif isinstance(made, tuple):
+        assert len(made) == len(document)
+        for value, other in zip(made, document):
+            agree(value, other)
+    else:
+        assert made == document and type(made) is type(document)
+
+
+ASKED = [
+    (
+        lambda sheet, _: vantrel.report(
+            sheet, illuminant="D65_10DEG", status="T", paper="none", n_factor=1.7, order=["CMYK_Y"]
+        ),
+        "report EXAMPLE --illuminant D65_10DEG --status T_STATUS --paper none --n-factor 1.7 --order CMYK_Y",
+    ),
+    (
+        lambda sheet, darker: vantrel.report(
+            sheet, second_paper="Magenta 10", second_sheet=darker, second_illuminant=12
+        ),
+        "report EXAMPLE --second-illuminant F11_2DEG --second-paper darker.txt:Magenta\\ 10",
+    ),
+    (
+        lambda sheet, darker: vantrel.compare(
+            sheet,
+            darker,
+            illuminant="C_2DEG",
+            status=vantrel.Status.I_STATUS,
+            pair="name",
+            repeats="each",
+            formula=["cmc", "de2000"],
+            weights={"de2000": (2, 1.5)},
+            second_illuminant="F2_2DEG",
+            words="hue",
+            tolerance=1.25,
+            tolerances=LIBRARY / "examples/proof.toml",
+            substrate_corrected=True,
+            allow_missing=True,
+        ),
+        "compare EXAMPLE darker.txt --illuminant C_2DEG --status I_STATUS --pair name --repeats each"
+        " --formula cmc,de2000 --weights de2000=2,1.5 --second-illuminant F2_2DEG --words hue"
+        " --tolerance 1.25 --tolerances LIBRARY/examples/proof.toml --substrate-corrected --allow-missing",
+    ),
+    (
+        lambda sheet, darker: vantrel.compare(sheet, darker, paper="1", pair="id", force_pairs=True),
+        "compare EXAMPLE darker.txt --paper 1 --pair id --force-pairs",
+    ),
+    (
+        lambda sheet, _: vantrel.predict(sheet, order=["CMYK_Y", "CMYK_M"], status="A"),
+        "predict EXAMPLE --order CMYK_Y,CMYK_M --status A_STATUS",
+    ),
+    (
+        lambda _, darker: vantrel.predict(darker, inks=[("CMYK_Y", 30), ("Magenta 100", 61)]),
+        "predict darker.txt --ink CMYK_Y:30 --ink Magenta\\ 100:61",
+    ),
+]
+
+
+@pytest.mark.parametrize("call, command", ASKED)
+def test_results_are_those_of_the_program(call, command, sheet, darker, tmp_path, monkeypatch):
+    program = os.environ.get("VANTREL_PROGRAM")
+    if not program:
+        pytest.skip("VANTREL_PROGRAM does not name the program")
+    monkeypatch.chdir(tmp_path)
+    darker.write("darker.txt")
+    darker = vantrel.read("darker.txt")
+    with warnings.catch_warnings(record=True) as caught:
+        warnings.simplefilter("always")
+        result = call(sheet, darker)
+    words = shlex.split(command.replace("EXAMPLE", str(EXAMPLE)).replace("LIBRARY", str(LIBRARY)))
+
+    def printed(form):
+        return subprocess.run([program, *words, "--format", form], capture_output=True, text=True)
+
+    run = printed("json")
+    assert (result.json, str(result)) == (run.stdout, printed("table").stdout)
+    told = "".join(f"vantrel: {w.message}\n" for w in caught)
+    assert told.replace("force_pairs= ", "--force-pairs ") == run.stderr
+    for ending, form in (".html", "html"), (".csv", "csv"), (".txt", "cgats"), (".json", "json"):
+        result.write("result" + ending)
+        assert Path("result" + ending).read_bytes() == printed(form).stdout.encode()
+    assert result.to_html() == Path("result.html").read_text()
+    document = result.to_dict()
+    assert document.pop("command") == command.split()[0]
+    agree(result, document["sheets"][0] if "sheets" in document else document)
+    assert pickle.loads(pickle.dumps(result)) == result
+    frame = result.to_pandas()
+    assert frame[550].tolist() == frame[550].dropna().tolist() and "<pre>" in result._repr_html_()
+
+
+@pytest.mark.filterwarnings("ignore:.*transmission, not reflectance")
+def test_what_is_written_reads_back(sheet, tmp_path):
+    odd = replace(
+        sheet,
+        names=[f'{name}, "no. {i}"' for i, name in enumerate(sheet.names)],
+        device={"CMYK_C": np.where(np.arange(31) == 3, np.nan, np.arange(31) / 7)},
+        spectra=sheet.spectra / 7,
+        lab=np.linspace(1, 90, 93).reshape(31, 3),
+        lab_illuminant=vantrel.IllumObs.D65_10DEG,
+        source=replace(sheet.source, condition="M2"),
+        origin=vantrel.Origin("me", "a sheet; of two", "2026-03-02", "reader", "job 7"),
+        kind="transmission",
+    )
+    for name, written in ("sheet.txt", odd), ("sheet.csv", replace(odd, kind="reflectance")):
+        written.write(tmp_path / name)
+        back = vantrel.read(tmp_path / name)
+        for field in "spectra", "lab":
+            assert getattr(back, field).tobytes() == getattr(written, field).tobytes()
+        for field in "names", "ids", "kind":
+            assert getattr(back, field) == getattr(written, field)
+        assert back.source.condition == "M2" and back.device["CMYK_C"][4] == 4 / 7
+    back = vantrel.read(tmp_path / "sheet.txt")
+    assert (back.origin, back.lab_illuminant) == (odd.origin, odd.lab_illuminant)
+    assert np.array_equal(back.device["CMYK_C"], odd.device["CMYK_C"], equal_nan=True)
+    for refused, reason in (odd, "transmittance"), (replace(sheet, spectra=sheet.spectra / 50), "scale"):
+        with pytest.raises(ValueError, match=reason):
+            refused.write(tmp_path / "refused.csv")
+
+
+@pytest.mark.parametrize(
+    "call, reason",
+    [
+        (lambda s: vantrel.report(s, illuminant="D50"), "illuminant: there is no 'D50'; 'D50_2DEG'"),
+        (lambda s: vantrel.report(s, status=10), "status: 10 is not one of"),
+        (lambda s: vantrel.report(s, paper="Cyan"), "Cyan"),
+        (lambda s: vantrel.compare(s, s, force_pairs=True), "force_pairs"),
+        (lambda s: vantrel.compare(s, s, weights={"de76": (1, 1)}), "de76 has no weights"),
+        (lambda s: vantrel.compare(s, s, formula=["de2000"] * 2), "named twice"),
+        (lambda s: vantrel.compare(s, s, tolerances=EXAMPLE), "two_ink_halftone.txt:1: "),
+        (lambda s: vantrel.predict(s, inks={"CMYK_M": 40.5}), "whole percentage"),
+        (lambda s: vantrel.predict(replace(s, device={})), "name inks with ink="),
+        (lambda s: vantrel.report(replace(s, spectra=s.spectra[:, :30])), "spectra: the shape"),
+        (lambda s: vantrel.report(replace(s, spectra=s.spectra * np.nan)), "spectra: numbers"),
+        (lambda s: vantrel.report(replace(s, ids=[])), "31 names, 0 ids"),
+        (lambda s: vantrel.report(replace(s, spectra=None)), "kind 'reflectance'"),
+        (lambda s: s.write("sheet.cxf"), "ends in .csv or .txt, not '.cxf'"),
+        (lambda s: vantrel.report(s).write("report.doc"), "not '.doc'"),
+        (lambda s: vantrel.plot.differences(vantrel.compare(s, s), "cmc"), "'cmc' is not one"),
+    ],
+)
+@pytest.mark.filterwarnings("ignore:.*hold the same spectra")
+def test_what_cannot_be_said_says_why(call, reason, sheet):
+    with pytest.raises(ValueError, match=reason):
+        call(sheet)
+
+
+def test_figures_show_what_the_sheet_has(sheet, darker):
+    matplotlib.use("Agg")
+    white = replace(sheet, spectra=np.vstack([np.full(31, 100.0), sheet.spectra[1:]]))
+    ax = vantrel.plot.spectra(white)
+    lines = ax.get_lines()
+    assert np.array_equal([line.get_ydata() for line in lines], white.spectra)
+    assert lines[0].get_color().tolist() == [1, 1, 1]
+    assert lines[0].get_xdata()[[0, -1]].tolist() == [400, 700]
+
+    report = vantrel.report(sheet)
+    _, magenta, yellow = vantrel.plot.tone_curves(report).get_lines()
+    assert magenta.get_label() == "CMYK_M" and yellow.get_xydata()[0].tolist() == [0, 0]
+    assert magenta.get_xydata()[5] == pytest.approx([50, 68.62], abs=0.005)
+
+    ax = vantrel.plot.ab_plane(report)
+    points = ax.collections[0]
+    assert np.array_equal(points.get_offsets(), [patch.lab[1:] for patch in report.patches])
+    shown = matplotlib.colors.to_rgba_array([patch.rgb for patch in report.patches])
+    assert np.array_equal(points.get_facecolors(), shown)
+    around = matplotlib.path.Path(ax.get_lines()[0].get_xydata())
+    assert around.contains_points(points.get_offsets(), radius=1e-9).all()
+    along = np.diff(around.vertices, axis=0)
+    assert (along[:-1, 0] * along[1:, 1] > along[:-1, 1] * along[1:, 0]).all()  # convex
+
+    with pytest.warns(UserWarning, match="up to ΔE00 1.05 from their mean"):
+        comparison = vantrel.compare(sheet, darker, formula=["cmc", "de2000"], tolerance=1.5)
+    ax = vantrel.plot.ab_plane(comparison)
+    assert len(ax.get_lines()) == len(comparison.pairs) + 3
+    ax = vantrel.plot.differences(comparison)
+    heights = [bar.get_height() for bar in ax.patches]
+    assert heights == sorted((pair.delta_e["cmc"] for pair in comparison.pairs), reverse=True)
+    assert ax.get_lines()[0].get_ydata()[0] == 1.5 and ax.get_ylabel() == "ΔE CMC(2:1)"
+    assert not vantrel.plot.differences(comparison, "de2000").get_lines()
+    matplotlib.pyplot.close("all")

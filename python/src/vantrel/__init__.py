@@ -20,6 +20,7 @@ were accepted.
 """
 
 from . import _ufuncs as ufuncs
+from . import plot
 from ._enums import IllumObs, Response, Status
 from ._colour import (
     calc_labch,
@@ -145,6 +146,8 @@ from ._constants import (
 )
 from ._resample import resample
 from ._sheet import Origin, Sheet, Source, read, reads
+from ._results import Comparison, Predictions, Report
+from ._judge import compare, predict, report
 
 __version__ = ufuncs.version
 __all__ = [name for name in dir() if not name.startswith("_")]  # what help() lists

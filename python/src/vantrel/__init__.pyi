@@ -4,13 +4,16 @@ Results are arrays of the kind that was handed in, NumPy scalars for single rows
 tuple that ends with the flags.
 """
 
-from enum import IntEnum
 from contextlib import AbstractContextManager
 from typing import Annotated, Any, Literal, Optional, Protocol, Sequence, TypeVar, Union, overload
 
 import numpy as np
 from numpy.typing import ArrayLike, NDArray
 
+from . import plot as plot
+from ._enums import IllumObs as IllumObs, Response as Response, Status as Status
+from ._judge import compare as compare, predict as predict, report as report
+from ._results import Comparison as Comparison, Predictions as Predictions, Report as Report
 from ._sheet import Origin as Origin, Sheet as Sheet, Source as Source, read as read, reads as reads
 
 class _SupportsArray(Protocol):
@@ -87,81 +90,40 @@ ufuncs: Any
 den_weight: NDArray[np.int64]
 
 __all__ = [
-    "CIEDE2000", "IllumObs", "Origin", "Response", "Sheet", "Source", "Status",
-    "adjust_for_paper_refls", "calc_labch", "calculate_ccr_densities",
-    "calculate_special_density", "calculate_spectral_density", "calculate_spectralx_density",
-    "calculate_tint_color", "choose_bp_wavelen", "cie_yxy_to_white_e313_98", "cielab_to_cielch",
-    "cielab_to_cielch_ex", "cielch_to_cielab", "cielch_to_de94", "color_at_equivalent_density",
-    "combine_3_ink_colors", "combine_3_ink_colors_ex", "combine_ink_colors",
-    "combine_ink_colors_ex", "den_weight", "density_from_dot_area", "density_ratio",
-    "density_to_dot_area", "density_to_hue_gray", "density_to_integrated_refl",
-    "density_to_print_contrast", "density_to_trap", "determine_density_response",
-    "estimate_color", "estimate_refls", "estimate_refls_ex",
-    "estimate_refls_ex_for_best_visual_color", "estimate_refls_for_best_visual_color",
-    "estimate_refls_for_thickness", "estimate_refls_for_tint_color",
-    "estimate_refls_for_tint_color_for_best_visual_color", "estimate_tint_color",
-    "find_density_max", "find_density_min", "find_max_density_points",
+    "CIEDE2000", "Comparison", "IllumObs", "Origin", "Predictions", "Report", "Response",
+    "Sheet", "Source", "Status", "adjust_for_paper_refls", "calc_labch",
+    "calculate_ccr_densities", "calculate_special_density", "calculate_spectral_density",
+    "calculate_spectralx_density", "calculate_tint_color", "choose_bp_wavelen",
+    "cie_yxy_to_white_e313_98", "cielab_to_cielch", "cielab_to_cielch_ex", "cielch_to_cielab",
+    "cielch_to_de94", "color_at_equivalent_density", "combine_3_ink_colors",
+    "combine_3_ink_colors_ex", "combine_ink_colors", "combine_ink_colors_ex", "compare",
+    "den_weight", "density_from_dot_area", "density_ratio", "density_to_dot_area",
+    "density_to_hue_gray", "density_to_integrated_refl", "density_to_print_contrast",
+    "density_to_trap", "determine_density_response", "estimate_color", "estimate_refls",
+    "estimate_refls_ex", "estimate_refls_ex_for_best_visual_color",
+    "estimate_refls_for_best_visual_color", "estimate_refls_for_thickness",
+    "estimate_refls_for_tint_color", "estimate_refls_for_tint_color_for_best_visual_color",
+    "estimate_tint_color", "find_density_max", "find_density_min", "find_max_density_points",
     "get_achromatic_constants", "get_hexachrome_constants", "get_hifi_constants",
     "get_normalized_density_weights", "get_num_illuminant_observers", "get_num_responses",
     "get_num_status_responses", "get_num_statuses", "get_spectralx_constants", "is_chromatic",
     "is_chromatic_lch", "lab_to_de2000", "lab_to_de2000_ex", "lab_to_de94", "lab_to_de_cmc",
-    "lab_to_de_lab", "lab_to_dh", "lab_to_xyz", "metamerism", "pol_determine_density_response",
-    "pol_refl_adjust", "pol_refl_auto_adjust", "pol_refl_to_densities", "pol_refl_to_density",
-    "pol_refl_to_dot_area", "pol_refl_to_dot_gain", "pol_refl_to_hue_gray",
-    "pol_refl_to_print_contrast", "pol_refl_to_trap", "read", "reads",
-    "refl_to_ab_error_weights", "refl_to_brightness", "refl_to_cie_yxy", "refl_to_cielab",
-    "refl_to_cielch", "refl_to_cieluv", "refl_to_densities", "refl_to_densities_no_paper",
-    "refl_to_density", "refl_to_din6172", "refl_to_dot_area", "refl_to_dot_gain",
-    "refl_to_hue_gray", "refl_to_hunter_lab", "refl_to_pol_intercept", "refl_to_print_contrast",
+    "lab_to_de_lab", "lab_to_dh", "lab_to_xyz", "metamerism", "plot",
+    "pol_determine_density_response", "pol_refl_adjust", "pol_refl_auto_adjust",
+    "pol_refl_to_densities", "pol_refl_to_density", "pol_refl_to_dot_area",
+    "pol_refl_to_dot_gain", "pol_refl_to_hue_gray", "pol_refl_to_print_contrast",
+    "pol_refl_to_trap", "predict", "read", "reads", "refl_to_ab_error_weights",
+    "refl_to_brightness", "refl_to_cie_yxy", "refl_to_cielab", "refl_to_cielch",
+    "refl_to_cieluv", "refl_to_densities", "refl_to_densities_no_paper", "refl_to_density",
+    "refl_to_din6172", "refl_to_dot_area", "refl_to_dot_gain", "refl_to_hue_gray",
+    "refl_to_hunter_lab", "refl_to_pol_intercept", "refl_to_print_contrast",
     "refl_to_refl_density", "refl_to_rgb", "refl_to_trap", "refl_to_white_e313_98",
-    "refl_to_xyz", "refl_to_xyzs", "resample", "saunderson", "set_achromatic_constants",
-    "set_hexachrome_constants", "set_hifi_constants", "set_spectralx_constants", "settings",
-    "ufuncs", "un_saunderson", "unpack_rgb", "verbal_color_difference", "xyz_to_cie_yxy",
-    "xyz_to_cielab", "xyz_to_cielch", "xyz_to_cieluv", "xyz_to_rgb", "xyz_to_xyz"
+    "refl_to_xyz", "refl_to_xyzs", "report", "resample", "saunderson",
+    "set_achromatic_constants", "set_hexachrome_constants", "set_hifi_constants",
+    "set_spectralx_constants", "settings", "ufuncs", "un_saunderson", "unpack_rgb",
+    "verbal_color_difference", "xyz_to_cie_yxy", "xyz_to_cielab", "xyz_to_cielch",
+    "xyz_to_cieluv", "xyz_to_rgb", "xyz_to_xyz"
 ]
-
-class IllumObs(IntEnum):
-    A_2DEG = 0
-    A_10DEG = 1
-    C_2DEG = 2
-    C_10DEG = 3
-    D50_2DEG = 4
-    D50_10DEG = 5
-    D65_2DEG = 6
-    D65_10DEG = 7
-    F2_2DEG = 8
-    F2_10DEG = 9
-    F7_2DEG = 10
-    F7_10DEG = 11
-    F11_2DEG = 12
-    F11_10DEG = 13
-    F12_2DEG = 14
-    F12_10DEG = 15
-    D75_2DEG = 16
-    D75_10DEG = 17
-
-class Response(IntEnum):
-    VISUAL_RESPONSE = 0
-    RED_RESPONSE = 1
-    GREEN_RESPONSE = 2
-    BLUE_RESPONSE = 3
-    HIFI1_RESPONSE = 4
-    HIFI2_RESPONSE = 5
-    HIFI3_RESPONSE = 6
-    HEXACHROME1_RESPONSE = 7
-    HEXACHROME2_RESPONSE = 8
-
-class Status(IntEnum):
-    A_STATUS = 0
-    E_STATUS = 1
-    I_STATUS = 2
-    T_STATUS = 3
-    SPECTRAL_STATUS = 4
-    SPECTRALX_STATUS = 5
-    HIFI_STATUS = 6
-    HEXACHROME_STATUS = 7
-    CCR1_STATUS = 8
-    CCR2_STATUS = 9
 
 @overload
 def adjust_for_paper_refls(spectra: _Other, *others: Any, **named: Any) -> Any: ...

@@ -2,15 +2,17 @@
 
 import html
 import os
+import re
 import warnings
 from dataclasses import dataclass, field
-from typing import Any, Dict, List, Literal, Optional, Union
+from typing import Any, Dict, List, Literal, Optional, Sequence, Union
 
 import numpy as np
 from numpy.typing import NDArray
 
-from ._colour import refl_to_cielab, refl_to_rgb, unpack_rgb
+from ._colour import refl_to_cielab
 from ._enums import IllumObs
+from ._text import cgats_text, csv_text
 from ._wavelengths import NM
 
 Scale = Literal["automatic", "percent", "fraction"]
@@ -23,7 +25,8 @@ _MOST_SHOWN = 200  # patches in a notebook
 class Source:
     """What the spectra looked like in the file.
 
-    `averaged`: several of its values make a band. `scaled`: they are not in percent there, and
+    `averaged`: several of its values make a band. `interpolated`: they are 20 nm apart. `held`: the
+    last value stands for bands outside their range. `scaled`: they are not in percent there, and
     `scale_by` says what told so. `condition`: M0 to M3 (ISO 13655), "" where the file does not say.
     """
 
@@ -32,6 +35,8 @@ class Source:
     step_nm: float
     bands: int
     averaged: bool
+    interpolated: bool
+    held: bool
     scaled: bool
     scale_by: str
     condition: str
@@ -70,10 +75,16 @@ class Sheet:
         What the spectra looked like in the file; None for colours alone.
     origin : Origin
         Who measured what and when.
+    collection : bool
+        Of colours, a spot library for instance: no paper is among them.
     file : str
         The name of the file, "" for bytes.
     warnings : list of str
         What the reader found odd.
+    named, has_ids : bool
+        Whether names or ids, and whether ids, are the file's own; places stand for them otherwise.
+    lines : list of int
+        Where the patches stand in the file.
     """
 
     spectra: Optional[NDArray[np.float64]]
@@ -86,8 +97,13 @@ class Sheet:
     kind: str
     source: Optional[Source]
     origin: Origin
+    collection: bool = False
     file: str = ""
     warnings: List[str] = field(default_factory=list)
+    named: bool = True
+    has_ids: bool = True
+    lines: Sequence[int] = field(default=(), repr=False)
+    _warnings: Sequence[str] = field(default=(), repr=False)  # in the words of the program
 
     def __len__(self) -> int:
         return len(self.names)
@@ -126,21 +142,32 @@ class Sheet:
         coordinates = {label: ("patch", values) for label, values in by_patch.items()}
         return xr.DataArray(self.spectra, {**coordinates, "nm": NM}, ("patch", "nm"), name="refl")
 
+    def write(self, file: Union[str, "os.PathLike[str]"]) -> None:
+        """Writes CSV to a name that ends in .csv, CGATS text (ISO 28178) to one in .txt.
+
+        read() gives the same doubles back; CSV has no room for the origin.
+        """
+        ending = os.path.splitext(os.fspath(file))[1].lower()
+        if ending not in (".csv", ".txt"):
+            raise ValueError(f"file: its name ends in .csv or .txt, not {ending!r}")
+        text = csv_text(self) if ending == ".csv" else cgats_text(self)
+        with open(file, "w", encoding="utf-8", newline="") as opened:
+            opened.write(text)
+
     def _colours(self) -> Any:
-        """(L*a*b*, what it is for, swatches) of the patches that a notebook shows."""
+        """(L*a*b*, what it is for) of the patches that a notebook shows."""
         if self.spectra is None:
             stated = self.lab_illuminant.name if self.lab_illuminant is not None else ""
-            return self.lab[:_MOST_SHOWN], stated or self.lab_stated, None
-        shown = self.spectra[:_MOST_SHOWN]
-        # under D65, the white of displays
-        return refl_to_cielab(shown), "D50_2DEG", unpack_rgb(refl_to_rgb(shown, "D65_2DEG"))
+            return self.lab[:_MOST_SHOWN], stated or self.lab_stated
+        return refl_to_cielab(self.spectra[:_MOST_SHOWN]), "D50_2DEG"
 
     def _repr_html_(self) -> str:
-        lab, light, swatches = self._colours()
+        lab, light = self._colours()
+        swatches = srgb(lab)
         head = ["", "id", "name", *self.device, "L*", "a*", "b*"]
         rows = []
         for i, colour in enumerate(lab):
-            rgb = "none" if swatches is None else f"rgb{tuple(swatches[i].tolist())}"
+            rgb = f"rgb{tuple(swatches[i].tolist())}"
             values = [f"{column[i]:g}" for column in self.device.values()]
             cells = [self.ids[i], self.names[i], *values, *(f"{c:.2f}" for c in colour)]
             rows.append(
@@ -158,6 +185,26 @@ class Sheet:
         )
 
 
+def extension() -> Any:
+    """The extension module of measurement files."""
+    try:
+        from . import _sheets
+    except ImportError:
+        raise NotImplementedError("vantrel was built without the reader of measurement files")
+    return _sheets
+
+
+def srgb(lab: Any) -> NDArray[np.uint8]:
+    """Red, green and blue of a display, 0 to 255, for L*a*b* (..., 3); its white is 255, 255, 255."""
+    lab = np.ascontiguousarray(lab, dtype=np.float64)
+    return np.frombuffer(extension().srgb(lab), dtype=np.uint8).reshape(lab.shape)
+
+
+def in_python(text: str) -> str:
+    """Text of the program with its options as arguments: "--force-pairs" as "force_pairs="."""
+    return re.sub(r"--([a-z][a-z-]*)", lambda found: found[1].replace("-", "_") + "=", text)
+
+
 def _array(buffer: Any, *shape: int) -> NDArray[np.float64]:
     return np.frombuffer(buffer, dtype=np.float64).reshape(shape)
 
@@ -165,22 +212,17 @@ def _array(buffer: Any, *shape: int) -> NDArray[np.float64]:
 def _sheet(
     content: bytes, file: str, scale: str, condition: Optional[str], level: int
 ) -> Sheet:
-    try:
-        from . import _sheets
-    except ImportError:
-        raise NotImplementedError("vantrel was built without the reader of measurement files")
+    module = extension()
     if scale not in _SCALES:
         raise ValueError(f"scale: {scale!r} is not one of {', '.join(_SCALES)}")
     if condition not in (None, "M0", "M1", "M2", "M3"):
         raise ValueError(f"condition: {condition!r} is not one of M0, M1, M2, M3")
     try:
-        found = _sheets.read(content, _SCALES[scale], condition or "")
+        found = module.read(content, _SCALES[scale], condition or "")
     except ValueError as error:
-        raise ValueError(f"{file}: {error}" if file else str(error)) from None
-    said = [
-        line.strip().replace("--condition", "condition=").replace("--scale", "scale=")
-        for line in found["warnings"]
-    ]
+        text = in_python(str(error))
+        raise ValueError(f"{file}: {text}" if file else text) from None
+    said = [in_python(line.strip()) for line in found["warnings"]]
     for line in said:
         warnings.warn(f"{file}: {line}" if file else line, stacklevel=level)
     illuminant = found.get("lab_illuminant")
@@ -192,11 +234,12 @@ def _sheet(
         lab=_array(found["lab"], -1, 3) if "lab" in found else None,
         lab_illuminant=None if illuminant is None else IllumObs(illuminant),
         lab_stated=found["lab_stated"],
-        kind=found["kind"],
+        **{name: found[name] for name in ("kind", "collection", "named", "has_ids", "lines")},
         source=Source(**found["source"]) if "spectra" in found else None,
         origin=Origin(**found["origin"]),
         file=file,
         warnings=said,
+        _warnings=found["warnings"],
     )
 
 

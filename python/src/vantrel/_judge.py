@@ -1,0 +1,315 @@
+"""What the program's commands say of sheets: report, compare, predict."""
+
+import functools
+import json
+import os
+import warnings
+from dataclasses import asdict, replace
+from typing import Any, Dict, List, Literal, Mapping, Optional, Sequence, Tuple, Union
+
+import numpy as np
+
+from ._arguments import INDICES
+from ._enums import IllumObs, Status
+from ._results import Comparison, Predictions, Report
+from ._sheet import Sheet, extension, in_python
+
+Illuminant = Union[
+    IllumObs,
+    Literal[
+        "A_2DEG", "A_10DEG", "C_2DEG", "C_10DEG", "D50_2DEG", "D50_10DEG", "D65_2DEG",
+        "D65_10DEG", "F2_2DEG", "F2_10DEG", "F7_2DEG", "F7_10DEG", "F11_2DEG", "F11_10DEG",
+        "F12_2DEG", "F12_10DEG", "D75_2DEG", "D75_10DEG"
+    ],
+]
+StatusName = Union[
+    Status,
+    Literal[
+        "A", "E", "I", "T", "SPECTRAL", "SPECTRALX", "HIFI", "HEXACHROME", "CCR1", "CCR2",
+        "A_STATUS", "E_STATUS", "I_STATUS", "T_STATUS", "SPECTRAL_STATUS", "SPECTRALX_STATUS",
+        "HIFI_STATUS", "HEXACHROME_STATUS", "CCR1_STATUS", "CCR2_STATUS"
+    ],
+]
+Formula = Literal["de2000", "cmc", "de94", "de76"]
+Inks = Union[Mapping[str, float], Sequence[Tuple[str, float]], None]
+Path = Union[str, "os.PathLike[str]"]
+_LARGEST = 1e6  # of reflectances in percent and of colours, as the readers take them
+
+
+def _doubles(values: Any, shape: Tuple[int, ...], name: str, missing: bool = False) -> Any:
+    array = np.ascontiguousarray(values, dtype=np.float64)
+    if array.shape != shape:
+        raise ValueError(f"{name}: the shape {shape} is needed, not {array.shape}")
+    if not np.all((np.abs(array) <= _LARGEST) | (missing & np.isnan(array))):
+        raise ValueError(f"{name}: numbers of at most {_LARGEST:g} are needed")
+    return array
+
+
+def _fields(sheet: Sheet) -> Dict[str, Any]:
+    """A sheet as the extension takes it."""
+    patches = len(sheet)
+    if not patches or len(sheet.ids) != patches:
+        raise ValueError(f"sheet: {patches} names, {len(sheet.ids)} ids; a patch at least has both")
+    if (sheet.spectra is None) != (sheet.kind == "colours"):
+        raise ValueError(f"sheet: a sheet of kind {sheet.kind!r} with spectra {sheet.spectra}")
+    lines = sheet.lines if len(sheet.lines) == patches else np.zeros(patches)
+    taken: Dict[str, Any] = {name: getattr(sheet, name) for name in vars(sheet)}
+    taken["warnings"] = [*sheet._warnings]
+    taken["lines"] = _doubles(lines, (patches,), "lines")
+    taken["device"] = {
+        field: _doubles(column, (patches,), field, missing=True)
+        for field, column in sheet.device.items()
+    }
+    if sheet.spectra is not None:
+        taken["spectra"] = _doubles(sheet.spectra, (patches, 31), "spectra")
+    if sheet.lab is not None:
+        taken["lab"] = _doubles(sheet.lab, (patches, 3), "lab", missing=True)
+    taken["origin"] = asdict(sheet.origin)
+    taken["source"] = None if sheet.source is None else asdict(sheet.source)
+    return taken
+
+
+def _answer(command: str, sheets: Sequence[Sheet], options: Dict[str, Any], form: str) -> str:
+    wishes = json.dumps({**options, "format": form})
+    try:
+        text: str = extension().answer(command, [_fields(sheet) for sheet in sheets], wishes)
+    except ValueError as error:
+        raise ValueError(in_python(str(error))) from None
+    return text
+
+
+def _result(kind: Any, command: str, sheets: Sequence[Sheet], options: Dict[str, Any]) -> Any:
+    names = {key: value for key, value in options.items() if value is not None}
+    result = kind._of(functools.partial(_answer, command, sheets, names))
+    told = {f"{s.file}: {line}" if s.file else line for s in sheets for line in s._warnings}
+    for line in result.warnings:
+        if line not in told:  # by read()
+            warnings.warn(in_python(line), stacklevel=3)
+    return result
+
+
+def _name(kind: str, value: Any, argument: str) -> Optional[str]:
+    """The full name of an illuminant or a status, given by name, member or number."""
+    if value is None:
+        return None
+    index = INDICES[kind]
+    number = index.number(value, argument)
+    index.check(number, argument)
+    name: str = index.members(number).name
+    return name
+
+
+def _usual(illuminant: Any, status: Any, paper: Optional[str]) -> Dict[str, Any]:
+    return {
+        "illuminant": _name("Illuminant", illuminant, "illuminant"),
+        "status": _name("StatusName", status, "status"),
+        "paper": paper,
+    }
+
+
+def report(
+    sheet: Sheet,
+    *,
+    illuminant: Optional[Illuminant] = None,
+    status: StatusName = "E",
+    paper: Optional[str] = None,
+    n_factor: float = 1,
+    order: Optional[Sequence[str]] = None,
+    second_paper: Optional[str] = None,
+    second_sheet: Optional[Sheet] = None,
+    second_illuminant: Optional[Illuminant] = None,
+) -> Report:
+    """The colour, density and print attributes of every patch of a sheet, as `vantrel report`.
+
+    Parameters
+    ----------
+    sheet : Sheet
+    illuminant : IllumObs or its name, optional
+        What the file states by default, or else D50 and 2 degrees.
+    status : Status or its name, default "E"
+    paper : str, optional
+        The paper's patch by name or id, or "none" for absolute densities; by default the mean of the
+        patches without ink, or else the lightest.
+    n_factor : float, default 1
+        The Yule-Nielsen factor of the dot areas.
+    order : list of str, optional
+        The inks in the order of printing, by device field or solid.
+    second_paper : str, optional
+        A paper to compare with, by name or id, of `second_sheet` where there is one; "" is its paper.
+    second_sheet : Sheet, optional
+    second_illuminant : IllumObs or its name, optional
+        Of that metamerism, beside `illuminant`.
+
+    Returns
+    -------
+    report : Report
+        What it finds odd becomes warnings.
+
+    Raises
+    ------
+    ValueError
+        Where the sheet does not hold what is asked for.
+
+    Examples
+    --------
+    >>> report = vantrel.report(vantrel.read("examples/two_ink_halftone.txt"))
+    >>> [(curve.ink, round(curve.values[4].dot_gain, 2)) for curve in report.tone_values]
+    [('CMYK_M', 18.62), ('CMYK_Y', 19.13)]
+    """
+    options = {
+        **_usual(illuminant, status, paper),
+        "n_factor": n_factor,
+        "order": None if order is None else [*order],
+        "second_paper": second_paper,
+        "second_illuminant": _name("Illuminant", second_illuminant, "second_illuminant"),
+    }
+    sheets = [sheet] if second_sheet is None else [sheet, second_sheet]
+    result: Report = _result(Report, "report", sheets, options)
+    return result
+
+
+def _tolerances(file: Optional[Path]) -> Dict[str, Any]:
+    if file is None:
+        return {}
+    with open(file, encoding="utf-8") as opened:
+        return {"tolerances": opened.read(), "tolerances_name": os.fspath(file)}
+
+
+def compare(
+    aims: Sheet,
+    sheet: Sheet,
+    *,
+    illuminant: Optional[Illuminant] = None,
+    status: StatusName = "E",
+    paper: Optional[str] = None,
+    pair: Literal["auto", "name", "id", "device", "order"] = "auto",
+    force_pairs: bool = False,
+    repeats: Literal["mean", "each"] = "mean",
+    allow_missing: bool = False,
+    formula: Union[Formula, Sequence[Formula]] = "de2000",
+    weights: Optional[Mapping[Formula, Tuple[float, float]]] = None,
+    second_illuminant: Optional[Illuminant] = None,
+    words: Literal["ab", "hue"] = "ab",
+    tolerance: Optional[float] = None,
+    tolerances: Optional[Path] = None,
+    substrate_corrected: bool = False,
+) -> Comparison:
+    """How a sheet differs from its aims, patch by patch, as `vantrel compare`.
+
+    Parameters
+    ----------
+    aims, sheet : Sheet
+    illuminant : IllumObs or its name, optional
+        What the files state by default, or else D50 and 2 degrees.
+    status : Status or its name, default "E"
+    paper : str, optional
+        The paper's patch of both by name or id, or "none".
+    pair : {"auto", "name", "id", "device", "order"}
+        What patches pair by.
+    force_pairs : bool
+        Whether pairs are taken whose device values disagree.
+    repeats : {"mean", "each"}
+        Whether the mean of several measurements of a patch is judged, or each of them.
+    allow_missing : bool
+        Whether patches and aims without a partner leave the verdict complete.
+    formula : {"de2000", "cmc", "de94", "de76"} or a list of them
+        The first decides on worst and tolerance.
+    weights : dict, optional
+        By formula the factors of lightness and chroma, {"cmc": (1, 1)} for instance.
+    second_illuminant : IllumObs or its name, optional
+        Of the metamerism, beside `illuminant`.
+    words : {"ab", "hue"}
+        The difference in words along a* and b*, or as chroma and hue.
+    tolerance : float, optional
+        The largest difference that is accepted.
+    tolerances : str or path, optional
+        A TOML file of limits by group of patches.
+    substrate_corrected : bool
+        Whether the sheet is judged too by aims that are moved to its paper (ISO 13655).
+
+    Returns
+    -------
+    comparison : Comparison
+        What it finds odd becomes warnings.
+
+    Raises
+    ------
+    ValueError
+        Where the sheets do not pair, or do not hold what is asked for.
+    OSError
+        Where there is no such file of tolerances.
+
+    Examples
+    --------
+    >>> import dataclasses
+    >>> aims = vantrel.read("examples/two_ink_halftone.txt")
+    >>> sheet = dataclasses.replace(aims, spectra=aims.spectra * 0.9, file="sheet")
+    >>> comparison = vantrel.compare(aims, sheet, formula=["de2000", "cmc"], tolerance=2)
+    >>> comparison.verdict, round(comparison.statistics["cmc"].max, 2)
+    ('failed', 1.48)
+    """
+    options = {
+        **_usual(illuminant, status, paper),
+        "pair": pair,
+        "force_pairs": force_pairs,
+        "repeats": repeats,
+        "allow_missing": allow_missing,
+        "formula": [formula] if isinstance(formula, str) else [*formula],
+        "weights": None if weights is None else {name: [*two] for name, two in weights.items()},
+        "second_illuminant": _name("Illuminant", second_illuminant, "second_illuminant"),
+        "words": words,
+        "tolerance": tolerance,
+        **_tolerances(tolerances),
+        "substrate_corrected": substrate_corrected,
+    }
+    conditions = [s.source.condition if s.source else "" for s in (aims, sheet)]
+    sheets = [aims, sheet]
+    if aims.file == sheet.file and conditions[0] != conditions[1]:
+        sheets = [replace(s, file=f"{s.file} ({c})") for s, c in zip(sheets, conditions)]
+    result: Comparison = _result(Comparison, "compare", sheets, options)
+    return result
+
+
+def predict(
+    sheet: Sheet,
+    *,
+    inks: Inks = None,
+    illuminant: Optional[Illuminant] = None,
+    status: StatusName = "E",
+    paper: Optional[str] = None,
+    order: Optional[Sequence[str]] = None,
+) -> Predictions:
+    """The colour that inks will have as tints and over one another, as `vantrel predict`.
+
+    Parameters
+    ----------
+    sheet : Sheet
+    inks : dict or list of (str, int), optional
+        Inks in the order of printing, each by its solid's patch, name or id, or its device field,
+        and its percentage; every measured overprint by default.
+    illuminant, status, paper, order
+        As of report().
+
+    Returns
+    -------
+    predictions : Predictions
+        What is odd becomes warnings.
+
+    Raises
+    ------
+    ValueError
+        Where the sheet does not hold what is asked for.
+
+    Examples
+    --------
+    >>> sheet = vantrel.read("examples/two_ink_halftone.txt")
+    >>> [prediction] = vantrel.predict(sheet, inks={"CMYK_M": 40, "CMYK_Y": 70}).predictions
+    >>> prediction.calibrated.rgb, round(prediction.halftone.density, 2)
+    ('#e2c282', 0.37)
+    """
+    options = {**_usual(illuminant, status, paper), "order": None if order is None else [*order]}
+    if inks is not None:
+        pairs: List[Tuple[str, float]] = [*(inks.items() if isinstance(inks, Mapping) else inks)]
+        options["ink"] = [[name, percent] for name, percent in pairs]
+    result: Predictions = _result(Predictions, "predict", [sheet], options)
+    return result

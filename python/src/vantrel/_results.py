@@ -1,0 +1,522 @@
+"""What the commands of the program say of sheets, as objects: the numbers of its JSON."""
+
+import functools
+import html
+import json
+import os
+from dataclasses import dataclass, fields, is_dataclass
+from typing import Any, Callable, Dict, Optional, Tuple, Union, get_args, get_origin, get_type_hints
+
+from ._wavelengths import NM
+
+Lab = Tuple[float, float, float]
+Refl = Optional[Tuple[float, ...]]
+
+
+FORMULAS = ("de2000", "cmc", "de94", "de76")
+
+
+@functools.lru_cache(maxsize=None)
+def _hints(kind: Any) -> Dict[str, Any]:
+    hints = get_type_hints(kind)
+    return {f.name: hints[f.name] for f in fields(kind)}
+
+
+def made(kind: Any, value: Any) -> Any:
+    """What JSON holds, as the dataclass, tuple, dictionary or plain value that `kind` asks for."""
+    if value is None:
+        return None
+    if is_dataclass(kind):
+        hints = _hints(kind)
+        known = {name: made(hint, value[name]) for name, hint in hints.items() if name in value}
+        if "delta_e" in hints:  # members that go by the names of the formulas
+            known["delta_e"] = {name: value[name] for name in FORMULAS if name in value}
+        return kind(**known)
+    if get_origin(kind) is Union:
+        return made(get_args(kind)[0], value)  # of Optional
+    if get_origin(kind) is tuple:
+        return tuple(made(get_args(kind)[0], item) for item in value)
+    if get_origin(kind) is dict:
+        return {key: made(get_args(kind)[1], item) for key, item in value.items()}
+    return value
+
+
+class Result:
+    """An answer of the program: its JSON, its page and its other formats."""
+
+    json: str
+    """The document that `vantrel --format json` prints, byte for byte."""
+    _answer: Callable[[str], str]
+
+    @classmethod
+    def _of(cls, answer: Callable[[str], str]) -> Any:
+        text = answer("json")
+        result = made(cls, cls._body(json.loads(text)))
+        object.__setattr__(result, "json", text)
+        object.__setattr__(result, "_answer", answer)
+        return result
+
+    @staticmethod
+    def _body(document: Dict[str, Any]) -> Dict[str, Any]:
+        return document
+
+    def to_dict(self) -> Dict[str, Any]:
+        """The document as dictionaries and lists."""
+        document: Dict[str, Any] = json.loads(self.json)
+        return document
+
+    def to_html(self) -> str:
+        """The page of `vantrel --format html`: one file with tables and charts."""
+        return self._answer("html")
+
+    def write(self, file: Union[str, "os.PathLike[str]"]) -> None:
+        """Writes .json, .html, .csv, or CGATS text as .txt, which the ending of the name chooses."""
+        ending = os.path.splitext(os.fspath(file))[1].lower()
+        formats = {".json": "json", ".html": "html", ".csv": "csv", ".txt": "cgats"}
+        if ending not in formats:
+            raise ValueError(f"file: its name ends in {', '.join(formats)}, not {ending!r}")
+        text = self._answer(formats[ending])
+        with open(file, "w", encoding="utf-8", newline="") as opened:
+            opened.write(text)
+
+    def __str__(self) -> str:
+        return self._answer("table")
+
+    def _repr_html_(self) -> str:
+        return f"<pre>{html.escape(str(self))}</pre>"
+
+
+def _frame(rows: Any) -> Any:
+    import pandas as pd
+
+    return pd.DataFrame.from_records([*rows])
+
+
+def _plain(patch: Any, *left_out: str) -> Dict[str, Any]:
+    """The fields of one patch as columns, but colours and spectra."""
+    left = {"lab", "lch", "refl", "device", *left_out}
+    return {f.name: getattr(patch, f.name) for f in fields(patch) if f.name not in left}
+
+
+def _lab(lab: Optional[Lab], prefix: str = "") -> Dict[str, Any]:
+    return {} if lab is None else {prefix + axis: value for axis, value in zip("Lab", lab)}
+
+
+def _refl(refl: Refl) -> Dict[int, float]:
+    return {} if refl is None else dict(zip(NM.astype(int).tolist(), refl))
+
+
+@dataclass(frozen=True)
+class PatchReport:
+    """A patch of a report; what makes no sense for it is None.
+
+    `response` reads it, `density` is in that, over the paper; `dot_area` and `dot_gain` are those of
+    tints of one ink, `print_contrast` of those from 75 to 80 %, `hue_error` and `grayness` of solids,
+    `trap` of overprints of two solids, all in percent. `rgb` is the sRGB colour as "#rrggbb".
+    """
+
+    id: str
+    name: str
+    device: Dict[str, float]
+    rgb: str
+    lab: Lab
+    lch: Lab
+    de00_to_paper: Optional[float]
+    response: Optional[str]
+    response_id: Optional[int]
+    density: Optional[float]
+    dot_area: Optional[float]
+    dot_gain: Optional[float]
+    print_contrast: Optional[float]
+    hue_error: Optional[float]
+    grayness: Optional[float]
+    trap: Optional[float]
+    refl: Refl
+
+
+@dataclass(frozen=True)
+class Metamerism:
+    """A second paper beside the first: ΔE00, ΔE*ab under two illuminants together, DIN 6172."""
+
+    file: str
+    paper: Optional[str]
+    chosen: str
+    de00: float
+    illuminant: str
+    sum: float
+    din6172: float
+
+
+@dataclass(frozen=True)
+class PaperReport:
+    """The paper: the patch `name` (None without one), how it was `chosen`, and what it measures."""
+
+    name: Optional[str]
+    chosen: str
+    lab: Optional[Lab]
+    brightness: Optional[float]
+    whiteness: Optional[float]
+    no_whiteness: Optional[str] = None
+    metamerism: Optional[Metamerism] = None
+
+
+@dataclass(frozen=True)
+class ToneValue:
+    """The mean of `patches` of one nominal value."""
+
+    nominal: float
+    dot_area: float
+    dot_gain: float
+    patches: int
+
+
+@dataclass(frozen=True)
+class ToneCurve:
+    """The tone values of an ink, a device field, over its solid, a patch."""
+
+    ink: str
+    solid: str
+    values: Tuple[ToneValue, ...]
+
+
+@dataclass(frozen=True)
+class ReportSource:
+    """What the spectra were in the file."""
+
+    first_nm: float
+    last_nm: float
+    step_nm: float
+    bands: int
+    averaged: bool
+    interpolated: bool
+    held: bool
+    scaled_to_percent: bool
+    scale_by: str
+    condition: Optional[str]
+
+
+@dataclass(frozen=True, repr=False)
+class Report(Result):
+    """What `vantrel report` says of a sheet; print() shows it as the program does."""
+
+    file: str
+    warnings: Tuple[str, ...]
+    illuminant: str
+    illuminant_by: str
+    status: str
+    n_factor: float
+    inks: Tuple[str, ...]
+    source: ReportSource
+    paper: PaperReport
+    tone_values: Tuple[ToneCurve, ...]
+    patches: Tuple[PatchReport, ...]
+
+    @staticmethod
+    def _body(document: Dict[str, Any]) -> Dict[str, Any]:
+        body: Dict[str, Any] = document["sheets"][0]
+        return body
+
+    def to_pandas(self) -> Any:
+        """A DataFrame with a row for each patch."""
+        return _frame(
+            {
+                **_plain(p),
+                **p.device,
+                **_lab(p.lab),
+                "C": p.lch[1],
+                "h": p.lch[2],
+                **_refl(p.refl),
+            }
+            for p in self.patches
+        )
+
+    def __repr__(self) -> str:
+        return f"<Report of {self.file}: {len(self.patches)} patches, {self.illuminant}>"
+
+
+@dataclass(frozen=True)
+class Side:
+    """One side of a pair: the mean of so many `repeats`, the farthest `spread` (ΔE00) from it."""
+
+    id: str
+    name: str
+    rgb: str
+    lab: Lab
+    density: Optional[float]
+    refl: Refl
+    repeats: int
+    spread: Optional[float]
+
+
+@dataclass(frozen=True)
+class CorrectedAim:
+    """The aim moved to the sample's paper, and the differences from it by formula."""
+
+    lab: Lab
+    delta_e: Dict[str, Optional[float]]
+
+
+@dataclass(frozen=True)
+class Pair:
+    """A patch beside its aim; `delta_e` holds the differences by formula."""
+
+    name: str
+    reference: Side
+    sample: Side
+    delta_e: Dict[str, Optional[float]]
+    verbal: Optional[str]
+    metamerism: Optional[float]
+    din6172: Optional[float]
+    response: Optional[str]
+    density_difference: Optional[float]
+    corrected: Optional[CorrectedAim] = None
+
+
+@dataclass(frozen=True)
+class Statistics:
+    """Of all pairs: at least 95 % of them do not exceed `p95`; `max_patch` has the largest."""
+
+    mean: Optional[float]
+    p95: Optional[float]
+    max: Optional[float]
+    max_patch: str
+
+
+@dataclass(frozen=True)
+class Limit:
+    """A limit of the tolerances and how it was judged; `margin` is limit less measured."""
+
+    patches: str
+    label: str
+    group: str
+    ink: Optional[str]
+    nominal: Optional[float]
+    formula: Optional[str]
+    statistic: str
+    aim: Optional[float]
+    found: int
+    judged: int
+    measured: Optional[float]
+    limit: float
+    margin: Optional[float]
+    verdict: str
+    max_patch: Optional[str]
+    note: Optional[str]
+
+
+@dataclass(frozen=True)
+class Corrected:
+    """The judgement against aims that were moved to the sample's paper (ISO 13655)."""
+
+    reference_paper: Lab
+    sample_paper: Lab
+    darkest: str
+    verdict: Optional[str]
+    limits: Tuple[Limit, ...]
+    statistics: Dict[str, Statistics]
+
+
+@dataclass(frozen=True)
+class Compared:
+    """A file of a comparison, its paper, and how that was chosen."""
+
+    file: str
+    paper: Optional[str]
+    paper_chosen: str
+
+
+@dataclass(frozen=True)
+class Papers:
+    """From the paper of the aims to that of the sample."""
+
+    de00: float
+    metamerism: Optional[float]
+
+
+@dataclass(frozen=True)
+class Judged:
+    """How much was judged: `patches` of the sample by `aims` of the reference."""
+
+    patches: int
+    of_patches: int
+    aims: int
+    of_aims: int
+    strip: bool
+    allow_missing: bool
+
+
+@dataclass(frozen=True)
+class PairingTry:
+    """What came of a key of pairing that was not taken."""
+
+    by: str
+    aims: int
+    patches: int
+    disagreeing: int
+
+
+@dataclass(frozen=True)
+class Means:
+    """So many `patches` are means of repeats; the `widest` has so many, with this `spread`."""
+
+    patches: int
+    widest: str
+    repeats: int
+    spread: float
+
+
+@dataclass(frozen=True, repr=False)
+class Comparison(Result):
+    """What `vantrel compare` says of a sheet beside its aims.
+
+    `verdict` is "passed", "failed" or "incomplete", None without a tolerance or limits; `says` is
+    the same in a sentence.
+    """
+
+    verdict: Optional[str]
+    says: str
+    passed: Optional[bool]
+    judged: Judged
+    warnings: Tuple[str, ...]
+    reference: Compared
+    sample: Compared
+    papers: Optional[Papers]
+    illuminant: str
+    illuminant_by: str
+    second_illuminant: str
+    status: str
+    paired_by: str
+    passed_over: Tuple[PairingTry, ...]
+    formulas: Tuple[str, ...]
+    labels: Dict[str, str]
+    weights: Dict[str, Tuple[float, ...]]
+    tolerance: Optional[float]
+    tolerances: Optional[str]
+    limits: Tuple[Limit, ...]
+    corrected: Optional[Corrected]
+    statistics: Dict[str, Statistics]
+    means: Dict[str, Optional[Means]]
+    worst: Tuple[int, ...]
+    unpaired: Dict[str, Tuple[str, ...]]
+    pairs: Tuple[Pair, ...]
+
+    def to_pandas(self) -> Any:
+        """A DataFrame with a row for each pair."""
+        return _frame(
+            {
+                **_plain(p, "reference", "sample", "delta_e", "corrected"),
+                **p.delta_e,
+                **_lab(p.reference.lab, "reference_"),
+                **_lab(p.sample.lab),
+                **{f"corrected_{k}": v for k, v in (p.corrected.delta_e if p.corrected else {}).items()},
+                **_refl(p.sample.refl),
+            }
+            for p in self.pairs
+        )
+
+    def __repr__(self) -> str:
+        return f"<Comparison of {self.sample.file} with {self.reference.file}: {self.says}>"
+
+
+@dataclass(frozen=True)
+class InkTint:
+    """An ink, by its solid's patch, at a percentage."""
+
+    name: str
+    percent: int
+
+
+@dataclass(frozen=True)
+class Estimate:
+    """What a model predicts."""
+
+    rgb: str
+    lab: Lab
+    de00_to_measured: Optional[float]
+    refl: Refl
+    response: Optional[str]
+    density: Optional[float]
+
+
+@dataclass(frozen=True)
+class Measured:
+    """The patch of the sheet that holds the combination."""
+
+    name: str
+    rgb: str
+    lab: Lab
+    response: Optional[str]
+    density: Optional[float]
+
+
+MODELS = ("halftone", "film", "calibrated")
+
+
+@dataclass(frozen=True)
+class Prediction:
+    """Inks in the order of printing by each model, None where it does not take them.
+
+    `halftone` mixes ink and paper by area, `film` takes tints as thinner films, `calibrated` is
+    fitted to the sheet and did without what is `lacking` there.
+    """
+
+    inks: Tuple[InkTint, ...]
+    halftone: Optional[Estimate]
+    film: Optional[Estimate]
+    calibrated: Optional[Estimate]
+    lacking: Tuple[str, ...]
+    measured: Optional[Measured]
+
+
+@dataclass(frozen=True)
+class LeftOutError:
+    """Of the calibrated model, ΔE00 on so many `patches`, each predicted without itself."""
+
+    patches: int
+    mean: float
+    p95: float
+    max: float
+
+
+@dataclass(frozen=True)
+class Calibration:
+    """How the calibrated model was fitted, `words` says it; `missing`: why there is none."""
+
+    n: Optional[float]
+    left_out_error: Optional[LeftOutError]
+    missing: Optional[str]
+    words: str
+
+
+@dataclass(frozen=True, repr=False)
+class Predictions(Result):
+    """What `vantrel predict` says; `left_out` overprints could not be predicted."""
+
+    file: str
+    illuminant: str
+    illuminant_by: str
+    status: str
+    warnings: Tuple[str, ...]
+    paper: Optional[str]
+    paper_chosen: str
+    left_out: int
+    calibration: Calibration
+    predictions: Tuple[Prediction, ...]
+
+    def to_pandas(self) -> Any:
+        """A DataFrame with a row for each prediction and model."""
+        return _frame(
+            {
+                "inks": " + ".join(f"{ink.name} {ink.percent} %" for ink in prediction.inks),
+                "model": model,
+                **_plain(estimate),
+                **_lab(estimate.lab),
+                **_refl(estimate.refl),
+            }
+            for prediction in self.predictions
+            for model, estimate in ((model, getattr(prediction, model)) for model in MODELS)
+            if estimate is not None
+        )
+
+    def __repr__(self) -> str:
+        return f"<Predictions of {len(self.predictions)} combinations of {self.file}>"
