@@ -57,3 +57,20 @@ python_environment() {
     "$folder/bin/pip" install --quiet --disable-pip-version-check \
         --config-settings=build-dir="$PWD/$folder/cmake" "$@"
 }
+
+# The source of pugixml, of which Debian has a compiled library, in a folder.
+pugixml_source() {
+    local folder=$1 apt
+    [[ ! -f $folder/pugixml.cpp ]] || return 0
+    rm -rf "$folder.apt"
+    mkdir -p "$folder.apt/lists/partial" "$folder.apt/parts"
+    sed 's/^Types: deb$/Types: deb-src/' /etc/apt/sources.list.d/debian.sources \
+        >"$folder.apt/parts/source.sources"
+    apt=(apt-get -qq -o Dir::Etc::sourcelist=/dev/null -o Dir::Etc::sourceparts="$folder.apt/parts"
+        -o Dir::State::lists="$folder.apt/lists" -o APT::Sandbox::User="$(id -un)")
+    "${apt[@]}" update
+    (cd "$folder.apt" && "${apt[@]}" source pugixml >&2)
+    mkdir -p "$folder"
+    mv "$folder.apt"/pugixml-*/src/* "$folder"
+    rm -r "$folder.apt"
+}

@@ -254,16 +254,17 @@ void add_device_values(std::vector<Patch> &patches, const Value &device)
 template <typename Result>
 std::string written(Result result, const std::string &format, const Tell &tell = {})
 {
-    if (format == "html")
+    if (format == "html" || format == "page")
         choose_for_page(result);
     std::string out;
-    write_as(format, result, {[&](std::string_view text) { out += text; }, tell});
+    write_as(format == "page" ? "json" : format, result,
+             {[&](std::string_view text) { out += text; }, tell});
     return out;
 }
 
 std::string format_of(Options &options)
 {
-    return options.one_of("format", {"json", "html", "csv", "cgats", "table"});
+    return options.one_of("format", {"json", "page", "html", "csv", "cgats", "table"});
 }
 
 } // namespace

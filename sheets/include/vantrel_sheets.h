@@ -69,13 +69,16 @@ VANTREL_SHEETS_API const char *vantrel_patch_name(const VantrelSheet *sheet, siz
 VANTREL_SHEETS_API const char *vantrel_patch_id(const VantrelSheet *sheet, size_t patch);
 
 /* What the commands of the program say. The second sheet of a report, null for none, holds the
- * second paper. Options have the names of the program's, with underscores, and its defaults: all
- * illuminant, status, paper, format (json, html, csv, cgats, table) report   n_factor, order (a
- * list), second_paper, second_illuminant compare  pair (auto, name, id, device, order),
- * force_pairs, repeats (mean, each), allow_missing, formula (a list), weights ({"cmc": [2, 1]}),
- * second_illuminant, words (ab, hue), tolerance, tolerances (TOML text), tolerances_name (where it
- * has none), substrate_corrected predict  order (a list), ink ([["Magenta 100", 40], …]) ink patch,
- * against, order (a list) */
+ * second paper. Options have the names of the program's, with underscores, and its defaults:
+ *
+ * - all: illuminant, status, paper, format (json, html, csv, cgats, table; page: the JSON that html
+ *   holds, of very many patches a choice)
+ * - report: n_factor, order (a list), second_paper, second_illuminant
+ * - compare: pair (auto, name, id, device, order), force_pairs, repeats (mean, each),
+ *   allow_missing, formula (a list), weights ({"cmc": [2, 1]}), second_illuminant, words (ab, hue),
+ *   tolerance, tolerances (TOML text), tolerances_name (where it has none), substrate_corrected
+ * - predict: order (a list), ink ([["Magenta 100", 40], ["Cyan 100", 7]])
+ * - ink: patch, against, order (a list) */
 VANTREL_SHEETS_API VantrelAnswer *vantrel_report(const VantrelSheet *const *sheets, size_t count,
                                                  const VantrelSheet *second_sheet,
                                                  const char *options, VantrelTell tell, void *user);

@@ -34,7 +34,7 @@ if(page_missing)
 endif()
 
 file(GLOB page_sources CONFIGURE_DEPENDS
-     ${page_dir}/*.js ${page_dir}/*.css ${page_dir}/*.html ${page_dir}/build.mjs)
+     ${page_dir}/*.js ${page_dir}/*.css ${page_dir}/*.html ${page_dir}/*.mjs)
 add_custom_command(OUTPUT ${page_build}/page.cpp
   COMMAND ${VANTREL_NODE} ${page_dir}/build.mjs ${page_build}/node_modules ${page_build}/page.cpp
   DEPENDS ${page_sources} ${page_modules}

@@ -11,10 +11,10 @@ import { fileURLToPath } from 'node:url';
 const { MODULES, VANTREL } = process.env; // node_modules and the program
 const { chromium } = createRequire(resolve(MODULES, 'any.js'))('playwright-core');
 const root = fileURLToPath(new URL('../../..', import.meta.url));
-const folder = mkdtempSync(join(tmpdir(), 'vantrel_page_'));
+export const folder = mkdtempSync(join(tmpdir(), 'vantrel_page_'));
 for (const sheets of ['tests/sheets/data', 'examples'])
   cpSync(join(root, sheets), folder, { recursive: true });
-const browser = await chromium.launch({ executablePath: process.env.CHROMIUM ?? '/usr/bin/chromium' });
+export const browser = await chromium.launch({ executablePath: process.env.CHROMIUM ?? '/usr/bin/chromium' });
 
 export async function end() {
   await browser.close();
