@@ -27,5 +27,5 @@ def test_the_tutorial_does_what_it_says(tmp_path):
     )
     assert run.returncode == 0, run.stderr
     assert run.stdout.split(MARK + "\n")[:-1] == [printed for _, printed in blocks]
-    for figure in "tone_values.png", "ab_plane.png", "density_map.png":
+    for figure in "tone_values.png", "ab_plane.png", "differences.png", "density_map.png":
         assert (tmp_path / figure).stat().st_size > 5000

@@ -1,8 +1,7 @@
 """How a print shows its inks.
 
-What is computed from densities follows ANSI CGATS.4. The refl_ functions measure every patch,
-spectra in percent, in one status and response as refl_to_density() does, over the paper or, with
-None, absolutely.
+What is computed from densities follows ANSI CGATS.4. Functions of spectra in percent measure every
+patch in one status and response as refl_to_density() does, over the paper or, with None, absolutely.
 """
 
 from ._function import function

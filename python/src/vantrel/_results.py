@@ -1,89 +1,13 @@
 """What the commands of the program say of sheets, as objects: the numbers of its JSON."""
 
-import functools
-import html
-import json
-import os
-from dataclasses import dataclass, fields, is_dataclass
-from typing import Any, Callable, Dict, Optional, Tuple, Union, get_args, get_origin, get_type_hints
+from dataclasses import dataclass, fields
+from typing import Any, Dict, Optional, Tuple
 
+from ._result import Result
 from ._wavelengths import NM
 
 Lab = Tuple[float, float, float]
 Refl = Optional[Tuple[float, ...]]
-
-
-FORMULAS = ("de2000", "cmc", "de94", "de76")
-
-
-@functools.lru_cache(maxsize=None)
-def _hints(kind: Any) -> Dict[str, Any]:
-    hints = get_type_hints(kind)
-    return {f.name: hints[f.name] for f in fields(kind)}
-
-
-def made(kind: Any, value: Any) -> Any:
-    """What JSON holds, as the dataclass, tuple, dictionary or plain value that `kind` asks for."""
-    if value is None:
-        return None
-    if is_dataclass(kind):
-        hints = _hints(kind)
-        known = {name: made(hint, value[name]) for name, hint in hints.items() if name in value}
-        if "delta_e" in hints:  # members that go by the names of the formulas
-            known["delta_e"] = {name: value[name] for name in FORMULAS if name in value}
-        return kind(**known)
-    if get_origin(kind) is Union:
-        return made(get_args(kind)[0], value)  # of Optional
-    if get_origin(kind) is tuple:
-        return tuple(made(get_args(kind)[0], item) for item in value)
-    if get_origin(kind) is dict:
-        return {key: made(get_args(kind)[1], item) for key, item in value.items()}
-    return value
-
-
-class Result:
-    """An answer of the program: its JSON, its page and its other formats."""
-
-    json: str
-    """The document that `vantrel --format json` prints, byte for byte."""
-    _answer: Callable[[str], str]
-
-    @classmethod
-    def _of(cls, answer: Callable[[str], str]) -> Any:
-        text = answer("json")
-        result = made(cls, cls._body(json.loads(text)))
-        object.__setattr__(result, "json", text)
-        object.__setattr__(result, "_answer", answer)
-        return result
-
-    @staticmethod
-    def _body(document: Dict[str, Any]) -> Dict[str, Any]:
-        return document
-
-    def to_dict(self) -> Dict[str, Any]:
-        """The document as dictionaries and lists."""
-        document: Dict[str, Any] = json.loads(self.json)
-        return document
-
-    def to_html(self) -> str:
-        """The page of `vantrel --format html`: one file with tables and charts."""
-        return self._answer("html")
-
-    def write(self, file: Union[str, "os.PathLike[str]"]) -> None:
-        """Writes .json, .html, .csv, or CGATS text as .txt, which the ending of the name chooses."""
-        ending = os.path.splitext(os.fspath(file))[1].lower()
-        formats = {".json": "json", ".html": "html", ".csv": "csv", ".txt": "cgats"}
-        if ending not in formats:
-            raise ValueError(f"file: its name ends in {', '.join(formats)}, not {ending!r}")
-        text = self._answer(formats[ending])
-        with open(file, "w", encoding="utf-8", newline="") as opened:
-            opened.write(text)
-
-    def __str__(self) -> str:
-        return self._answer("table")
-
-    def _repr_html_(self) -> str:
-        return f"<pre>{html.escape(str(self))}</pre>"
 
 
 def _frame(rows: Any) -> Any:

@@ -53,7 +53,7 @@ class Origin:
     job: str
 
 
-@dataclass(frozen=True, eq=False)
+@dataclass(frozen=True, eq=False, repr=False)
 class Sheet:
     """The patches of a measurement file.
 
@@ -102,8 +102,11 @@ class Sheet:
     warnings: List[str] = field(default_factory=list)
     named: bool = True
     has_ids: bool = True
-    lines: Sequence[int] = field(default=(), repr=False)
-    _warnings: Sequence[str] = field(default=(), repr=False)  # in the words of the program
+    lines: Sequence[int] = ()
+    _warnings: Sequence[str] = ()  # in the words of the program
+
+    def __repr__(self) -> str:
+        return f"<Sheet of {self.file}: {len(self)} patches, {self.kind}>"
 
     def __len__(self) -> int:
         return len(self.names)
