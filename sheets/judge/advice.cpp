@@ -40,6 +40,16 @@ template <typename Function> double minimum(Function f, double low, double high)
 
 } // namespace
 
+std::string_view words_of(const Advice &advice)
+{
+    constexpr double near_enough = 0.5; // ΔE00
+    if (advice.de00 < near_enough)
+        return "on its aim";
+    if (!advice.reaches_aim())
+        return "hue is off: ink, paper or trapping, not density";
+    return advice.density_change > 0 ? "more ink" : "less ink";
+}
+
 std::optional<Advice> advise(const Spectrum &solid, const Spectrum &paper, const CIELABCOORD &aim,
                              ILLUM_OBS illuminant, int status)
 {

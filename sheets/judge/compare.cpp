@@ -401,7 +401,8 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
     out.worst = largest_first(values_of(out.pairs, &PairReport::delta_e, 0));
     out.worst.resize(std::min(out.worst.size(), kMostWorst));
     warn_of_wide_means(out.reference_means, reference.file, out.warnings);
-    warn_of_wide_means(out.sample_means, sample.file, out.warnings);
+    if (!request.pairing.zones) // which differ
+        warn_of_wide_means(out.sample_means, sample.file, out.warnings);
     warn_of_same(out);
     warn_of_exchanged(out);
     return out;

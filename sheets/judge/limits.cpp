@@ -13,19 +13,6 @@ namespace {
 
 constexpr double kNeutralChroma = 10; // C*ab of an aim that passes for neutral
 
-bool is_neutral(const ControlPatch &patch)
-{
-    if (patch.inks.size() != 3 || !(std::hypot(patch.aim.a, patch.aim.b) <= kNeutralChroma))
-        return false;
-    bool solid = true;
-    for (const auto &[field, percent] : patch.inks) {
-        if (field != "CMYK_C" && field != "CMYK_M" && field != "CMYK_Y")
-            return false;
-        solid = solid && percent == 100;
-    }
-    return !solid;
-}
-
 bool is_in(Group group, const ControlPatch &patch)
 {
     const auto &inks = patch.inks;
@@ -199,6 +186,19 @@ LimitResult judge(const Tolerance &limit, const std::vector<ControlPatch> &patch
 }
 
 } // namespace
+
+bool is_neutral(const ControlPatch &patch)
+{
+    if (patch.inks.size() != 3 || !(std::hypot(patch.aim.a, patch.aim.b) <= kNeutralChroma))
+        return false;
+    bool solid = true;
+    for (const auto &[field, percent] : patch.inks) {
+        if (field != "CMYK_C" && field != "CMYK_M" && field != "CMYK_Y")
+            return false;
+        solid = solid && percent == 100;
+    }
+    return !solid;
+}
 
 std::vector<LimitResult> judge_limits(const Tolerances &tolerances,
                                       const std::vector<ControlPatch> &patches)

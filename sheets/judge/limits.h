@@ -23,6 +23,9 @@ struct ControlPatch {
     std::optional<double> aim_gain, gain;       // of a tint
 };
 
+// Of cyan, magenta and yellow, with an aim of hardly any chroma.
+bool is_neutral(const ControlPatch &patch);
+
 struct LimitResult {
     Tolerance limit;
     Verdict verdict = Verdict::incomplete;

@@ -157,8 +157,10 @@ Outcome pairs_by(Pairing by, const Sheets &sheets, const PairingRequest &request
             if (!request.force)
                 continue;
         }
-        const auto [number, is_new] = patches.add(
-            request.each ? std::to_string(i) : fmt::format("{}\n{}", found->aim, marks.all()));
+        const auto [number, is_new] =
+            patches.add(request.each    ? std::to_string(i)
+                        : request.zones ? std::to_string(found->aim)
+                                        : fmt::format("{}\n{}", found->aim, marks.all()));
         if (is_new) {
             matched.push_back({aim, {}});
             for (const std::size_t place : aim)

@@ -21,6 +21,7 @@ struct PairingRequest {
     Pairing by = Pairing::automatic;
     bool force = false; // pairs too whose device values disagree; not of automatic
     bool each = false;  // repeats of a patch are judged one by one
+    bool zones = false; // all patches of an aim are repeats of one, whatever their names
 };
 
 // An aim and what was measured for it: places in the two sheets, of several their mean.

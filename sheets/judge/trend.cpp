@@ -1,5 +1,6 @@
 #include "judge/trend.h"
 
+#include <algorithm>
 #include <array>
 #include <cmath>
 
@@ -52,6 +53,49 @@ std::optional<Trend> trend_of(const Series &series)
                      mean_y - slope * mean_x};
     }
     return out;
+}
+
+double median_of(const Series &series)
+{
+    std::vector<double> values;
+    for (const auto &value : series)
+        if (value)
+            values.push_back(*value);
+    if (values.empty())
+        return 0;
+    std::sort(values.begin(), values.end());
+    const std::size_t half = values.size() / 2;
+    return values.size() % 2 ? values[half] : (values[half - 1] + values[half]) / 2;
+}
+
+std::vector<std::size_t> outliers_of(const Series &series, double least)
+{
+    constexpr std::size_t fewest = 5;
+    constexpr double farthest = 8;
+    const double median = median_of(series);
+    Series distances;
+    for (const auto &value : series)
+        distances.push_back(value ? std::optional(std::fabs(*value - median)) : std::nullopt);
+    const double mad = median_of(distances);
+    std::vector<std::size_t> out;
+    const auto readings = std::count_if(series.begin(), series.end(),
+                                        [](const auto &value) { return value.has_value(); });
+    if (static_cast<std::size_t>(readings) < fewest || !(mad > 0))
+        return out;
+    for (std::size_t i = 0; i < series.size(); ++i)
+        if (distances[i] && *distances[i] >= least && 0.6745 * *distances[i] > farthest * mad)
+            out.push_back(i);
+    return out;
+}
+
+std::vector<std::size_t> outliers_about(const Series &series, const Trend &trend, double least)
+{
+    Series distances = series;
+    if (trend.drift && trend.drift->significant())
+        for (std::size_t i = 0; i < distances.size(); ++i)
+            if (distances[i])
+                *distances[i] -= trend.drift->at(static_cast<double>(i));
+    return outliers_of(distances, least);
 }
 
 std::optional<std::size_t> first_outside(const Series &series, const Limits &limits)

@@ -31,6 +31,17 @@ struct Trend {
 // and 4.1.4; intervals by Student's t.
 std::optional<Trend> trend_of(const Series &series);
 
+// Of the readings there are; nothing is 0.
+double median_of(const Series &series);
+
+// Readings whose modified z-score, 0.6745 (x - median) / MAD, is beyond 8 (Iglewicz and Hoaglin,
+// How to Detect and Handle Outliers, 1993, take 3.5 for a single series; of a run dozens are looked
+// at). Nothing of fewer than five, or where half of them are equal.
+std::vector<std::size_t> outliers_of(const Series &series, double least);
+
+// The same of the distances from the drift where it is significant.
+std::vector<std::size_t> outliers_about(const Series &series, const Trend &trend, double least);
+
 // What a reading may be; a missing limit does not bound it.
 struct Limits {
     std::optional<double> low, high;

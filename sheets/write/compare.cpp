@@ -10,8 +10,8 @@
 #include <fmt/format.h>
 
 #include <algorithm>
-#include <memory>
 #include <numeric>
+#include <utility>
 
 namespace vantrel::sheets {
 namespace {
@@ -94,16 +94,6 @@ void add_unpaired(Lines &lines, const std::string &file, const std::vector<Unpai
     if (unpaired.size() > most)
         line += fmt::format(" and {} more", unpaired.size() - most);
     lines.add(line);
-}
-
-// "judged 160 of 160 patches by 20 of 72 aims, as a strip"
-std::string told(const Coverage &coverage)
-{
-    std::string out = fmt::format("judged {} of {} patches by {} of {} aims", coverage.patches,
-                                  coverage.of_patches, coverage.aims, coverage.of_aims);
-    if (coverage.is_strip())
-        return out + ", as a strip of them";
-    return out + (coverage.allow_missing ? ", which is allowed" : "");
 }
 
 // "Failed: 3 of 5 pairs are above ΔE00 2; all 7 limits are held; judged 5 of 5 patches by 5 of 5
@@ -308,13 +298,7 @@ void write_json(const Comparison &comparison, const Sink &sink)
         {"command", "compare"},
         {"verdict", comparison.verdict ? Json(name_of(*comparison.verdict)) : Json()},
         {"says", sentence_of(comparison)},
-        {"judged",
-         {{"patches", comparison.coverage.patches},
-          {"of_patches", comparison.coverage.of_patches},
-          {"aims", comparison.coverage.aims},
-          {"of_aims", comparison.coverage.of_aims},
-          {"strip", comparison.coverage.is_strip()},
-          {"allow_missing", comparison.coverage.allow_missing}}},
+        {"judged", coverage_json(comparison.coverage)},
         {"warnings", comparison.warnings},
         {"reference", sheet_json(comparison.reference, comparison.reference_paper)},
         {"sample", sheet_json(comparison.sample, comparison.sample_paper)},
@@ -389,22 +373,14 @@ std::string word_of(const std::optional<Verdict> &verdict)
 // What the verdicts rest on, and the warnings.
 Flat flat_of_statements(const Comparison &comparison)
 {
-    struct Statement {
-        std::string name, verdict, note;
-    };
-    const auto rows = std::make_shared<std::vector<Statement>>();
-    rows->push_back({"Verdict", word_of(comparison.verdict), sentence_of(comparison)});
+    std::vector<Statement> rows;
+    rows.push_back({"Verdict", word_of(comparison.verdict), sentence_of(comparison)});
     if (const std::string sentence = corrected_sentence_of(comparison); !sentence.empty())
-        rows->push_back({"Verdict", word_of(comparison.corrected->verdict), sentence});
+        rows.push_back({"Verdict", word_of(comparison.corrected->verdict), sentence});
     for (const std::string &warning : comparison.warnings)
-        rows->push_back({"Warning", "", warning});
-    Flat flat;
-    flat.description = comparison.warnings.empty() ? "Verdict" : "Verdict and warnings";
-    flat.rows = rows->size();
-    flat.text("name", "STATEMENT", [rows](std::size_t i) { return (*rows)[i].name; });
-    flat.text("verdict", "VERDICT", [rows](std::size_t i) { return (*rows)[i].verdict; });
-    flat.text("note", "NOTE", [rows](std::size_t i) { return (*rows)[i].note; });
-    return flat;
+        rows.push_back({"Warning", "", warning});
+    return flat_of(std::move(rows),
+                   comparison.warnings.empty() ? "Verdict" : "Verdict and warnings");
 }
 
 } // namespace

@@ -50,6 +50,20 @@ Json patch_json(const PatchReport &patch, int status)
     return out;
 }
 
+void add_advice(Json &object, const std::vector<SolidAdvice> &advice)
+{
+    Json rows = Json::array();
+    for (const auto &[ink, one] : advice)
+        rows.push_back({{"ink", ink},
+                        {"de00", one.de00},
+                        {"density_change", one.density_change},
+                        {"de00_after", one.de00_after},
+                        {"words", words_of(one)}});
+    object["advice"] = rows;
+    if (!advice.empty())
+        object["advice_from"] = kAdviceFrom;
+}
+
 void add_left_out(Json &object, const LeftOut &left_out)
 {
     if (left_out.count == 0)

@@ -1,6 +1,7 @@
 // Small helpers of the JSON documents.
 #pragma once
 
+#include "judge/advice.h"
 #include "judge/colour.h"
 #include "judge/densitometer.h"
 #include "judge/left_out.h"
@@ -14,6 +15,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
 namespace vantrel::sheets {
 
@@ -34,6 +36,9 @@ Json name_json(const PaperChoice &paper); // null where there is none
 void add_reading(Json &object, const DensityReading &reading, int status);
 
 Json patch_json(const PatchReport &patch, int status);
+
+// Adds `advice` and, where there is any, `advice_from`.
+void add_advice(Json &object, const std::vector<SolidAdvice> &advice);
 
 // Adds `left_out` and `kept` where the page does not hold all.
 void add_left_out(Json &object, const LeftOut &left_out);

@@ -5,6 +5,8 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <memory>
+#include <utility>
 
 namespace vantrel::sheets {
 namespace {
@@ -16,13 +18,12 @@ std::string judged_of(const LimitResult &result)
                                            : fmt::format("{} of {}", result.judged, result.patches);
 }
 
-// Densities have three decimals.
+} // namespace
+
 int decimals_of(const LimitResult &result)
 {
     return result.limit.quantity == Quantity::density ? 3 : 2;
 }
-
-} // namespace
 
 void add_limits(Lines &lines, const std::string &title, const std::vector<LimitResult> &limits)
 {
@@ -68,6 +69,23 @@ std::string counts_of(const std::vector<LimitResult> &limits)
         return out;
     return limits.size() == 1 ? "the limit is held"
                               : fmt::format("all {} limits are held", limits.size());
+}
+
+// "judged 160 of 160 patches by 20 of 72 aims, as a strip"
+std::string told(const Coverage &coverage)
+{
+    std::string out = fmt::format("judged {} of {} patches by {} of {} aims", coverage.patches,
+                                  coverage.of_patches, coverage.aims, coverage.of_aims);
+    if (coverage.is_strip())
+        return out + ", as a strip of them";
+    return out + (coverage.allow_missing ? ", which is allowed" : "");
+}
+
+Json coverage_json(const Coverage &coverage)
+{
+    return {{"patches", coverage.patches},  {"of_patches", coverage.of_patches},
+            {"aims", coverage.aims},        {"of_aims", coverage.of_aims},
+            {"strip", coverage.is_strip()}, {"allow_missing", coverage.allow_missing}};
 }
 
 Json limits_json(const std::vector<LimitResult> &limits)
@@ -117,6 +135,18 @@ Flat flat_of(const std::vector<LimitResult> &limits, const std::string &aims,
               [&limits](std::size_t i) { return std::string(name_of(limits[i].verdict)); });
     flat.text("max_patch", "MAX_PATCH", [&limits](std::size_t i) { return limits[i].worst; });
     flat.text("note", "NOTE", [&limits](std::size_t i) { return limits[i].note; });
+    return flat;
+}
+
+Flat flat_of(std::vector<Statement> statements, const std::string &description)
+{
+    const auto rows = std::make_shared<const std::vector<Statement>>(std::move(statements));
+    Flat flat;
+    flat.description = description;
+    flat.rows = rows->size();
+    flat.text("name", "STATEMENT", [rows](std::size_t i) { return (*rows)[i].name; });
+    flat.text("verdict", "VERDICT", [rows](std::size_t i) { return (*rows)[i].verdict; });
+    flat.text("note", "NOTE", [rows](std::size_t i) { return (*rows)[i].note; });
     return flat;
 }
 

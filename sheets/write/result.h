@@ -7,6 +7,7 @@
 #include "judge/list.h"
 #include "judge/predict.h"
 #include "judge/report.h"
+#include "judge/run.h"
 #include "write/flat.h"
 #include "write/sink.h"
 
@@ -22,12 +23,14 @@ struct TableStyle {
 void write_table(const std::vector<Report> &sheets, const Sink &sink, const TableStyle &style);
 void write_table(const Comparison &comparison, const Sink &sink, const TableStyle &style);
 void write_table(const Predictions &predictions, const Sink &sink, const TableStyle &style);
+void write_table(const Run &run, const Sink &sink, const TableStyle &style);
 void write_table(const PatchStudy &study, const Sink &sink, const TableStyle &style);
 void write_table(const List &list, const Sink &sink, const TableStyle &style);
 
 void write_json(const std::vector<Report> &sheets, const Sink &sink);
 void write_json(const Comparison &comparison, const Sink &sink);
 void write_json(const Predictions &predictions, const Sink &sink);
+void write_json(const Run &run, const Sink &sink);
 void write_json(const PatchStudy &study, const Sink &sink);
 void write_json(const List &list, const Sink &sink);
 
@@ -35,6 +38,7 @@ void write_json(const List &list, const Sink &sink);
 std::vector<Flat> flat_of(const std::vector<Report> &sheets); // throws RequestError
 std::vector<Flat> flat_of(const Comparison &comparison);
 std::vector<Flat> flat_of(const Predictions &predictions);
+std::vector<Flat> flat_of(const Run &run);
 std::vector<Flat> flat_of(const PatchStudy &study);
 std::vector<Flat> flat_of(const List &list);
 

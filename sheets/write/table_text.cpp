@@ -51,6 +51,19 @@ std::string swatch(const Rgb &rgb)
     return fmt::format("\x1b[48;2;{};{};{}m    \x1b[0m", rgb.red, rgb.green, rgb.blue);
 }
 
+void add_advice(Lines &lines, const std::string &title, const std::vector<SolidAdvice> &advice)
+{
+    if (advice.empty())
+        return;
+    lines.add(
+        fmt::format("\n{:<24}{:>8}{:>16}{:>12}", title, "ΔE00", "density change", "ΔE00 after"));
+    for (const auto &[ink, one] : advice)
+        lines.add(fmt::format("{:<24}{:>8}{:>16}{:>12}  {}", cut(ink, 23), fixed(one.de00),
+                              (one.density_change > 0 ? "+" : "") + fixed(one.density_change, 3),
+                              fixed(one.de00_after), words_of(one)));
+    lines.add(std::string(kAdviceFrom));
+}
+
 void Lines::add(std::string line)
 {
     line.resize(line.find_last_not_of(' ') + 1);

@@ -1,6 +1,7 @@
 // Small helpers of the tables on a terminal.
 #pragma once
 
+#include "judge/advice.h"
 #include "judge/colour.h"
 #include "judge/paper.h"
 #include "judge/stated.h"
@@ -9,6 +10,7 @@
 #include <cstddef>
 #include <optional>
 #include <string>
+#include <vector>
 
 namespace vantrel::sheets {
 
@@ -39,5 +41,7 @@ public:
 private:
     const Sink &sink;
 };
+
+void add_advice(Lines &lines, const std::string &title, const std::vector<SolidAdvice> &advice);
 
 } // namespace vantrel::sheets

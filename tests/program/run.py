@@ -5,7 +5,7 @@
 A file holds commands as one types them, each with what it prints: standard output as it is, lines of
 standard error behind "! ", an exit status other than 0 behind "? ". Lines that begin with "> " go on
 with a command, those with "# " before it say what it is for. The commands of a file run in order, in
-a new folder that holds copies of the sheets in tests/sheets/data and of the example. Control
+a new folder that holds copies of the sheets in tests/sheets/data and of the examples. Control
 characters are shown as the symbols for them. Where both numbers have 12 digits or more they may
 differ in the last places; everything else is compared to the letter.
 """
@@ -73,7 +73,7 @@ def run_file(program, path, renew):
                                 "PATH": f"{program.parent}:{os.environ['PATH']}"}
     environment.pop("NO_COLOR", None)
     with tempfile.TemporaryDirectory() as folder:
-        for sheet in [*(ROOT / "tests/sheets/data").iterdir(), ROOT / "examples/two_ink_halftone.txt"]:
+        for sheet in [*(ROOT / "tests/sheets/data").iterdir(), *(ROOT / "examples").glob("*.*")]:
             shutil.copy(sheet, folder)
         blocks = re.split(r"\n\n(?=(?:# .*\n)*\$ )", expected.removesuffix("\n"))
         actual = "\n\n".join(run(block, folder, environment) for block in blocks) + "\n"

@@ -1,6 +1,5 @@
 // vantrel compare REFERENCE SAMPLE
 
-#include "file.h"
 #include "judge/compare.h"
 #include "options.h"
 #include "progress.h"
@@ -70,21 +69,6 @@ Pairing pairing_of(const std::string &name)
 {
     return *std::find_if(kPairings.begin(), kPairings.end(),
                          [&](Pairing pairing) { return name == name_of(pairing); });
-}
-
-Tolerances tolerances_of(const std::string &path)
-{
-    if (path.empty())
-        return {};
-    const std::string file = printable(path);
-    try {
-        Tolerances tolerances = read_tolerances(read_file(path));
-        if (tolerances.name.empty())
-            tolerances.name = file;
-        return tolerances;
-    } catch (const InputError &error) {
-        throw RequestError{complaint_of(file, error)};
-    }
 }
 
 Outcome run(const CompareOptions &options)
@@ -196,7 +180,7 @@ Command add_compare(CLI::App &app)
         ->capture_default_str();
     command->add_option("--tolerance", options->tolerance, "Largest difference that is accepted");
     command->add_option("--tolerances", options->tolerances,
-                        "TOML file of limits by group of patches; examples/ has two");
+                        "TOML file of limits by group of patches; examples/ has three");
     command->add_flag("--substrate-corrected", options->substrate_corrected,
                       "Judge too by aims that are moved to the sample's paper (ISO 13655)");
     command->add_flag("--all", options->all, "List every pair in the table, not the worst ten");

@@ -28,8 +28,8 @@ Outcome run(CLI::App &app, int count, char **words)
 {
     app.require_subcommand(1);
     app.set_version_flag("--version", VANTREL_VERSION);
-    const Command commands[] = {add_report(app), add_compare(app), add_predict(app), add_ink(app),
-                                add_list(app)};
+    const Command commands[] = {add_report(app),  add_compare(app), add_run(app),
+                                add_predict(app), add_ink(app),     add_list(app)};
     std::vector<std::string> names;
     for (const Command &command : commands)
         names.push_back(command.app->get_name());

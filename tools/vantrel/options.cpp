@@ -106,6 +106,21 @@ Measurement sheet_of(const std::string &path, const Options &options, bool colou
     }
 }
 
+Tolerances tolerances_of(const std::string &path)
+{
+    if (path.empty())
+        return {};
+    const std::string file = printable(path);
+    try {
+        Tolerances tolerances = read_tolerances(read_file(path));
+        if (tolerances.name.empty())
+            tolerances.name = file;
+        return tolerances;
+    } catch (const InputError &error) {
+        throw RequestError{complaint_of(file, error)};
+    }
+}
+
 bool shows_colour(const Options &options)
 {
     const char *terminal = std::getenv("TERM");

@@ -1,6 +1,7 @@
 // What every command takes, and how its result leaves the program.
 #pragma once
 
+#include "judge/tolerances.h"
 #include "read/measurement.h"
 #include "write/format.h"
 
@@ -44,6 +45,7 @@ struct Command {
 // The commands; each stands in a file of its own.
 Command add_report(CLI::App &app);
 Command add_compare(CLI::App &app);
+Command add_run(CLI::App &app);
 Command add_predict(CLI::App &app);
 Command add_ink(CLI::App &app);
 Command add_list(CLI::App &app);
@@ -64,6 +66,10 @@ std::optional<ILLUM_OBS> optional_illuminant(const std::string &name);
 
 // Reads a file; one of colours alone will do where `colours` says so. Throws RequestError.
 Measurement sheet_of(const std::string &path, const Options &options, bool colours = false);
+
+// The limits of a TOML file, under its name where it names itself not; none where the path is
+// empty. Throws RequestError.
+Tolerances tolerances_of(const std::string &path);
 
 bool shows_colour(const Options &options);
 

@@ -5,11 +5,11 @@ import { colourOf, h, named, swatch } from './dom.js';
 
 export const mostPoints = 2000;
 const bands = Array.from({ length: 31 }, (_, i) => 400 + 10 * i);
-const printWidth = 330; // half of a sheet of paper
+const printWidths = { half: 330, quarter: 165 }; // of a sheet of paper
 const drawn = new Set();
 const self = (field) => ({ value: field, scale: null }); // colours that are the data's own
 
-addEventListener('beforeprint', () => drawn.forEach((draw) => draw(printWidth)));
+addEventListener('beforeprint', () => drawn.forEach((draw) => draw(true)));
 addEventListener('afterprint', () => drawn.forEach((draw) => draw()));
 
 // A picture with its title, what it says in words, and further elements. `plot(width)` gives Plot's
@@ -18,12 +18,14 @@ export function picture(title, plot, label, ...more) {
   const frame = h('div', { class: 'plot' });
   const words = h('span', { class: 'says' });
   let shown = 0;
-  function draw(width = frame.clientWidth) {
+  function draw(printed = false) {
+    const width = !printed ? frame.clientWidth
+      : frame.closest('.strip') ? printWidths.quarter : printWidths.half;
     if (!width) return;
     shown = width;
     const svg = Plot.plot({
       width, marginTop: 28, marginRight: 16, marginBottom: 36,
-      style: { fontSize: width === printWidth ? '9px' : '12px', fontFamily: 'inherit', background: 'none', overflow: 'visible' },
+      style: { fontSize: printed ? '9px' : '12px', fontFamily: 'inherit', background: 'none', overflow: 'visible' },
       ...plot(width),
     });
     svg.setAttribute('role', 'img');
@@ -174,6 +176,46 @@ export function histogramPlot(values, label, limit) {
       Plot.ruleX(marked, { stroke: 'var(--fail)', strokeWidth: 2 }),
       Plot.text(marked, { x: (value) => value, frameAnchor: 'top', dy: -12, fill: 'var(--fail)',
         textAnchor: limit > top / 2 ? 'end' : 'start', text: (value) => `Tolerance ${value}` }),
+    ],
+  });
+}
+
+// A reading over the sheets of a run: the value of each, the range of its zones, the limits.
+export function seriesPlot({ values, lowest, highest, low, high, aim, decimals }, colour) {
+  const points = values.map((value, i) => ({ sheet: i + 1, value, low: lowest[i],
+    high: highest[i] })).filter(({ value }) => value !== null);
+  const limits = [low, high].filter((limit) => limit !== null);
+  return (width) => ({
+    height: width < 200 ? 90 : 200,
+    marginTop: 8, marginBottom: 20,
+    x: { label: null, domain: [0.5, values.length + 0.5], ticks: Math.min(values.length, 6),
+      tickFormat: (sheet) => (Number.isInteger(sheet) ? sheet : '') },
+    y: { label: null, nice: true, grid: true, ticks: 4 },
+    marks: [
+      Plot.areaY(points, { x: 'sheet', y1: 'low', y2: 'high', fill: colour, fillOpacity: 0.2 }),
+      Plot.ruleY(limits, { stroke: 'var(--fail)', strokeDasharray: '4 3' }),
+      aim === null ? null : Plot.ruleY([aim], { strokeOpacity: 0.5 }),
+      Plot.line(points, { x: 'sheet', y: 'value', stroke: colour, strokeWidth: 2 }),
+      Plot.dot(points, { x: 'sheet', y: 'value', r: 2.5, fill: colour }),
+      Plot.tip(points, Plot.pointerX({ x: 'sheet', y: 'value', title: (point) =>
+        `Sheet ${point.sheet}: ${point.value.toFixed(decimals)}\nzones ` +
+        `${point.low.toFixed(decimals)} to ${point.high.toFixed(decimals)}` })),
+    ],
+  });
+}
+
+// curves: [{ name, colour, value, zones: { 1: density, … } }, …]
+export function zonesPlot(curves) {
+  const points = curves.flatMap(({ name, colour, value, zones }) => Object.entries(zones).map(
+    ([zone, density]) => ({ name, colour, zone: Number(zone), density, off: density - value })));
+  return () => ({
+    height: 200,
+    fx: { label: 'Zone' }, x: { axis: null, domain: curves.map(({ name }) => name) },
+    y: { label: 'ΔD', grid: true, nice: true },
+    marks: [
+      Plot.barY(points, { fx: 'zone', x: 'name', y: 'off', fill: self('colour'), tip: true,
+        title: (point) => `${point.name}, zone ${point.zone}: ${point.density.toFixed(3)}` }),
+      Plot.ruleY([0]),
     ],
   });
 }

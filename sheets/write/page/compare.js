@@ -36,7 +36,7 @@ const repeats = ({ means }) => ['reference', 'sample'].map((side) => means[side]
 const digits = (limit) => (limit.formula === 'density' ? 3 : 2);
 const statisticNames = { maximum: 'largest', mean: 'mean', p95: '95th percentile' };
 
-const limitsTable = (caption, limits) => (limits?.length ? smallTable(caption, [
+export const limitsTable = (caption, limits) => (limits?.length ? smallTable(caption, [
   { label: 'Patches', text: (limit) => limit.patches },
   { label: 'Quantity', text: (limit) => `${limit.label}, ${statisticNames[limit.statistic]}` },
   { label: 'Judged', number: true, text: (limit) => `${limit.judged} of ${limit.found}` },

@@ -5,6 +5,7 @@ import { inkPage } from './ink.js';
 import { listPage } from './list.js';
 import { predictPage } from './predict.js';
 import { reportPage } from './report.js';
+import { runPage } from './run.js';
 
 // Puts the result in place of what an element holds, and gives its title.
 export function show(result, place) {
@@ -12,6 +13,7 @@ export function show(result, place) {
     report: [reportPage, () => result.sheets.map((sheet) => sheet.file).join(', ')],
     compare: [comparePage, () => `${result.sample.file} against ${result.reference.file}`],
     predict: [predictPage, () => `${result.file}, predicted`],
+    run: [runPage, () => `Press run of ${result.sheets.length} sheets`],
     ink: [inkPage, () => `${result.patch.name}, ${result.file}`],
     list: [listPage, () => result.list],
   };

@@ -1,0 +1,390 @@
+#include "judge/readings.h"
+
+#include "judge/control.h"
+#include "judge/densitometer.h"
+#include "judge/inks.h"
+#include "judge/repeats.h"
+#include "judge/tone_value.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <array>
+#include <cctype>
+#include <charconv>
+#include <cmath>
+#include <utility>
+
+namespace vantrel::sheets {
+namespace {
+
+constexpr std::array<std::pair<std::string_view, std::string_view>, 4> kProcessInks = {{
+    {"CMYK_C", "Cyan"},
+    {"CMYK_M", "Magenta"},
+    {"CMYK_Y", "Yellow"},
+    {"CMYK_K", "Black"},
+}};
+
+struct Row {
+    Attribute attribute;
+    std::string_view key, title;
+    int decimals;
+    double apart;
+};
+constexpr std::array<Row, 10> kAttributes = {{
+    {Attribute::density, "density", "density", 3, 0.02},
+    {Attribute::tone_value, "tone_value", "tone value", 2, 1},
+    {Attribute::contrast, "contrast", "contrast", 2, 1},
+    {Attribute::trap, "trap", "trap", 2, 1},
+    {Attribute::paper, "paper", "paper ΔE00", 2, 0.5},
+    {Attribute::solid, "solid", "solid ΔE00", 2, 0.5},
+    {Attribute::delta_ch, "delta_ch", "ΔCh", 2, 0.5},
+    {Attribute::delta_l, "delta_l", "ΔL*", 2, 0.5},
+    {Attribute::mean_de00, "mean_de00", "mean ΔE00", 2, 0.5},
+    {Attribute::max_de00, "max_de00", "largest ΔE00", 2, 0.5},
+}};
+
+const Row &row_of(Attribute attribute) { return kAttributes[static_cast<std::size_t>(attribute)]; }
+
+// The patches of one combination of inks.
+struct Printed {
+    std::vector<std::size_t> places;
+    Spectrum mean{};
+    std::map<int, Spectrum> zones;
+    const ControlPatch *control = nullptr; // the mean beside its aim
+    std::optional<int> response;           // that reads it
+};
+
+// A sheet whose patches are told apart by their inks and their zones.
+class Zoned {
+public:
+    Zoned(const Measurement &aims, Measurement measured, const CompareRequest &request)
+        : sheet(std::move(measured))
+    {
+        for (Patch &patch : sheet.patches)
+            zones.push_back(take_zone(patch));
+        std::vector<std::string> warnings; // which compare() gives too
+        pairs = pairs_of(aims, sheet, request.pairing, warnings);
+        for (const Pair &pair : pairs.matched)
+            for (const std::size_t place : pair.sample)
+                if (sheet.patches[place].device.empty())
+                    sheet.patches[place].device = aims.patches[pair.reference.front()].device;
+        if (std::all_of(zones.begin(), zones.end(), [](int zone) { return zone == 0; }))
+            number_by_place();
+    }
+
+    Measurement sheet;
+    Pairs pairs;
+    std::vector<int> zones; // of the patches; 0 for none
+
+private:
+    // Where most aims serve the same number of patches.
+    void number_by_place()
+    {
+        std::map<std::size_t, std::size_t> often;
+        for (const Pair &pair : pairs.matched)
+            ++often[pair.sample.size()];
+        const auto most = std::max_element(often.begin(), often.end(), [](auto &a, auto &b) {
+                              return a.second < b.second;
+                          })->first;
+        if (most < 2)
+            return;
+        for (const Pair &pair : pairs.matched)
+            for (std::size_t i = 0; i < pair.sample.size() && pair.sample.size() == most; ++i)
+                zones[pair.sample[i]] = static_cast<int>(i) + 1;
+    }
+};
+
+using AllPrinted = std::map<Tints, Printed>;
+
+AllPrinted printed_on(const Zoned &zoned, const Inks &inks, const Comparison &comparison,
+                      const std::vector<ControlPatch> &controls, const Densitometer &densitometer)
+{
+    const Measurement &sheet = zoned.sheet;
+    AllPrinted out;
+    for (std::size_t i = 0; i < sheet.patches.size(); ++i)
+        if (const auto tints = inks.tints_of(sheet.patches[i]))
+            out[*tints].places.push_back(i);
+    for (auto &[tints, printed] : out) {
+        printed.mean = mean_of(sheet, printed.places, comparison.illuminant).patch.refl;
+        printed.response = densitometer.response(printed.mean);
+        for (const std::size_t place : printed.places)
+            if (zoned.zones[place] > 0)
+                printed.zones.emplace(zoned.zones[place], sheet.patches[place].refl);
+    }
+    for (std::size_t i = 0; i < controls.size(); ++i) {
+        const auto tints = inks.tints_of(sheet.patches[zoned.pairs.matched[i].sample.front()]);
+        if (!tints || out[*tints].control) // several aims of the same inks: the first
+            continue;
+        Printed &printed = out[*tints];
+        printed.control = &controls[i];
+        printed.mean = comparison.pairs[i].sample.refl.value();
+        if (comparison.pairs[i].response)
+            printed.response = comparison.pairs[i].response;
+    }
+    return out;
+}
+
+// Reads what was printed on one sheet, beside other patches of the same sheet or zone.
+class Reader {
+public:
+    Reader(const Paper &paper, const Inks &inks, const AllPrinted &all, ILLUM_OBS illuminant,
+           int status)
+        : paper(paper), inks(inks), all(all), illuminant(illuminant),
+          densitometer(paper.refl, status)
+    {
+    }
+
+    void read(const Tints &tints, const Printed &printed)
+    {
+        if (tints.size() == 1 && tints[0].percent == 100)
+            add_solid(tints, printed);
+        else if (tints.size() == 1)
+            add_tint(tints, printed);
+        else if (tints.size() == 2 && tints[0].percent == 100 && tints[1].percent == 100)
+            add_trap(tints, printed);
+        if (printed.control)
+            add_distances(tints, printed);
+    }
+
+    std::vector<ZoneReading> readings;
+
+private:
+    // Of the mean where the sheet has no such patch in this zone, null where it has none at all.
+    const Spectrum *find(const Tints &tints, int zone) const
+    {
+        const auto found = all.find(tints);
+        if (found == all.end())
+            return nullptr;
+        const auto in_zone = found->second.zones.find(zone);
+        return in_zone == found->second.zones.end() ? &found->second.mean : &in_zone->second;
+    }
+
+    // `read` gives what a spectrum reads in a zone, 0 for the mean of all.
+    template <typename Read>
+    void add(const Measurand &measurand, const Printed &printed, std::optional<double> aim,
+             Read read)
+    {
+        const std::optional<double> value = read(printed.mean, 0);
+        if (!value || !std::isfinite(*value))
+            return;
+        ZoneReading reading{.measurand = measurand, .value = *value, .aim = aim};
+        for (const auto &[zone, refl] : printed.zones)
+            if (const std::optional<double> own = read(refl, zone); own && std::isfinite(*own))
+                reading.zones[zone] = *own;
+        readings.push_back(std::move(reading));
+    }
+
+    void add_solid(const Tints &tints, const Printed &printed)
+    {
+        if (printed.response)
+            add({Attribute::density, title_of(tints[0])}, printed,
+                printed.control ? printed.control->aim_density : std::nullopt,
+                [&](const Spectrum &refl, int) {
+                    return std::optional(densitometer.density(refl, *printed.response));
+                });
+    }
+
+    void add_tint(const Tints &tints, const Printed &printed)
+    {
+        const Tints solid = {{tints[0].ink, 100}};
+        if (!find(solid, 0) || !is_shown(tints[0]))
+            return;
+        const std::string ink = title_of(tints[0]);
+        const double nominal = tints[0].percent;
+        if (is_process_ink(ink)) {
+            std::optional<double> aim;
+            if (printed.control && printed.control->aim_gain)
+                aim = nominal + *printed.control->aim_gain;
+            add({Attribute::tone_value, ink, nominal}, printed, aim,
+                [&](const Spectrum &refl, int zone) {
+                    return densitometer.dot_area(*find(solid, zone), refl, 1);
+                });
+        } else {
+            add({Attribute::tone_value, ink, nominal, true}, printed, sctv_aim(solid, printed),
+                [&](const Spectrum &refl, int zone) {
+                    return spot_colour_tone_value(lab_of(paper, illuminant),
+                                                  lab_of(*find(solid, zone), illuminant),
+                                                  lab_of(refl, illuminant));
+                });
+        }
+        if (nominal >= 75 && nominal <= 80)
+            add({Attribute::contrast, ink, nominal}, printed, {},
+                [&](const Spectrum &refl, int zone) {
+                    return densitometer.print_contrast(*find(solid, zone), refl);
+                });
+    }
+
+    // Of a ramp with 25, 50 and 75 % these.
+    bool is_shown(const Tint &tint) const
+    {
+        const bool quarters =
+            find({{tint.ink, 25}}, 0) && find({{tint.ink, 50}}, 0) && find({{tint.ink, 75}}, 0);
+        return !quarters || std::fmod(tint.percent, 25) == 0;
+    }
+
+    std::optional<double> sctv_aim(const Tints &solid, const Printed &tint) const
+    {
+        const auto bare = all.find({}), full = all.find(solid);
+        if (bare == all.end() || !bare->second.control || !full->second.control || !tint.control)
+            return std::nullopt;
+        return spot_colour_tone_value(bare->second.control->aim, full->second.control->aim,
+                                      tint.control->aim);
+    }
+
+    void add_trap(const Tints &tints, const Printed &printed)
+    {
+        const Tints first = {tints[0]}, second = {tints[1]};
+        if (find(first, 0) && find(second, 0))
+            add({Attribute::trap, title_of(tints[0]) + " + " + title_of(tints[1])}, printed, {},
+                [&](const Spectrum &refl, int zone) {
+                    return densitometer.trap(*find(first, zone), *find(second, zone), refl);
+                });
+    }
+
+    void add_distances(const Tints &tints, const Printed &printed)
+    {
+        const ControlPatch &control = *printed.control;
+        const auto de00 = [&](const Spectrum &refl, int) {
+            return std::optional(delta_e00(control.aim, lab_of(refl, illuminant)));
+        };
+        if (tints.empty())
+            add({Attribute::paper, ""}, printed, {}, de00);
+        else if (tints.size() == 1 && tints[0].percent == 100)
+            add({Attribute::solid, title_of(tints[0])}, printed, {}, de00);
+        if (!is_neutral(control))
+            return;
+        add({Attribute::delta_ch, short_title_of(tints)}, printed, {},
+            [&](const Spectrum &refl, int) {
+                const CIELABCOORD lab = lab_of(refl, illuminant);
+                return std::optional(std::hypot(lab.a - control.aim.a, lab.b - control.aim.b));
+            });
+        add({Attribute::delta_l, short_title_of(tints)}, printed, {},
+            [&](const Spectrum &refl, int) {
+                return std::optional(lab_of(refl, illuminant).L - control.aim.L);
+            });
+    }
+
+    std::string title_of(const Tint &tint) const { return ink_title(inks.names()[tint.ink]); }
+
+    // "C 50 M 40 Y 40"
+    std::string short_title_of(const Tints &tints) const
+    {
+        std::string out;
+        for (const Tint &tint : tints)
+            out += fmt::format("{}{} {:g}", out.empty() ? "" : " ",
+                               inks.names()[tint.ink].substr(5), tint.percent);
+        return out;
+    }
+
+    const Paper &paper;
+    const Inks &inks;
+    const AllPrinted &all;
+    ILLUM_OBS illuminant;
+    Densitometer densitometer;
+};
+
+// Over all patches that have an aim.
+void add_statistics(std::vector<ZoneReading> &readings, const AllPrinted &all,
+                    const Comparison &comparison)
+{
+    std::map<int, std::vector<double>> zones;
+    for (const auto &[tints, printed] : all)
+        if (printed.control)
+            for (const auto &[zone, refl] : printed.zones)
+                zones[zone].push_back(
+                    delta_e00(printed.control->aim, lab_of(refl, comparison.illuminant)));
+    ZoneReading mean{.measurand = {.attribute = Attribute::mean_de00, .subject = {}},
+                     .value = comparison.statistics[0].mean},
+        largest{.measurand = {.attribute = Attribute::max_de00, .subject = {}},
+                .value = comparison.statistics[0].max};
+    for (const auto &[zone, values] : zones) {
+        const Statistics statistics = statistics_of(values);
+        mean.zones[zone] = statistics.mean;
+        largest.zones[zone] = statistics.max;
+    }
+    readings.push_back(std::move(mean));
+    readings.push_back(std::move(largest));
+}
+
+} // namespace
+
+std::string ink_title(const std::string &field)
+{
+    for (const auto &[name, title] : kProcessInks)
+        if (name == field)
+            return std::string(title);
+    return field;
+}
+
+bool is_process_ink(const std::string &title)
+{
+    return std::any_of(kProcessInks.begin(), kProcessInks.end(),
+                       [&](const auto &ink) { return ink.second == title; });
+}
+
+std::string_view key_of(Attribute attribute) { return row_of(attribute).key; }
+
+int decimals_of(Attribute attribute) { return row_of(attribute).decimals; }
+
+double apart_by(Attribute attribute) { return row_of(attribute).apart; }
+
+std::string Measurand::title() const
+{
+    std::string out = subject;
+    if (nominal < 100)
+        out += fmt::format(" {:g} %", nominal);
+    return fmt::format("{}{}{}{}", out, out.empty() ? "" : " ", row_of(attribute).title,
+                       sctv ? " (SCTV)" : "");
+}
+
+int take_zone(Patch &patch)
+{
+    std::string &name = patch.name;
+    const auto z = name.find_last_of("Zz");
+    if (z == std::string::npos || z == 0 || std::isalnum(static_cast<unsigned char>(name[z - 1])))
+        return 0;
+    int zone = 0;
+    const char *last = name.data() + name.size();
+    const auto [end, error] = std::from_chars(name.data() + z + 1, last, zone);
+    if (error != std::errc() || end != last || zone <= 0)
+        return 0;
+    name.resize(name.find_last_not_of(" _-.", z - 1) + 1);
+    return zone;
+}
+
+SheetReadings readings_of(const Measurement &aims, Measurement measured, CompareRequest request,
+                          const std::vector<std::string> &order)
+{
+    request.pairing.zones = true;
+    const Zoned zoned(aims, std::move(measured), request);
+    const Measurement &sheet = zoned.sheet;
+    Comparison comparison = compare(aims, sheet, request);
+    require_paper(comparison.sample_paper, sheet.file, "a press run");
+    std::vector<std::string> told; // by compare() too
+    const Paper paper = paper_of(sheet, request.paper, comparison.illuminant, told),
+                aim_paper = paper_of(aims, request.paper, comparison.illuminant, told);
+    const std::vector<ControlPatch> controls =
+        control_patches(comparison.pairs, aim_paper, paper, request.status, aims.collection);
+    const Inks inks(sheet, order);
+    const AllPrinted all =
+        printed_on(zoned, inks, comparison, controls, Densitometer(paper.refl, request.status));
+    Reader reader(paper, inks, all, comparison.illuminant, request.status);
+    SheetReadings out;
+    for (const auto &[tints, printed] : all) {
+        reader.read(tints, printed);
+        if (const auto ink = Inks::ink_of_solid(tints); ink && printed.control)
+            out.solids.push_back(
+                {ink_title(inks.names()[*ink]), printed.mean, printed.control->aim});
+    }
+    add_statistics(reader.readings, all, comparison);
+    out.readings = std::move(reader.readings);
+    out.coverage = comparison.coverage;
+    out.limits = std::move(comparison.limits);
+    out.verdict = comparison.verdict;
+    out.paper = paper.refl;
+    out.warnings = std::move(comparison.warnings);
+    return out;
+}
+
+} // namespace vantrel::sheets

@@ -1,0 +1,417 @@
+#include "judge/run.h"
+
+#include <fmt/format.h>
+#include <fmt/ranges.h>
+
+#include <algorithm>
+#include <array>
+#include <cctype>
+#include <cmath>
+#include <set>
+#include <utility>
+
+namespace vantrel::sheets {
+namespace {
+
+constexpr std::size_t kAhead = 10; // sheets for which the drift is followed
+
+// The reading of a single patch that a limit bounds on each sheet; nothing where it bounds none.
+std::optional<Attribute> attribute_of(const Tolerance &limit)
+{
+    using enum Quantity;
+    const bool solids = limit.group == Group::solids || limit.group == Group::spots;
+    const Metric &metric = limit.metric;
+    const bool de00 = limit.quantity == colour_difference && metric.formula == Formula::de2000 &&
+                      metric.lightness == 1 && metric.chroma == 1;
+    if (de00 && limit.group == Group::all && limit.statistic == Statistic::mean)
+        return Attribute::mean_de00;
+    if (limit.statistic != Statistic::maximum)
+        return std::nullopt;
+    if (limit.quantity == density && solids)
+        return Attribute::density;
+    if (limit.quantity == gain && limit.group == Group::tints)
+        return Attribute::tone_value;
+    if (limit.group == Group::neutrals && limit.quantity == neutral_chroma)
+        return Attribute::delta_ch;
+    if (limit.group == Group::neutrals && limit.quantity == lightness)
+        return Attribute::delta_l;
+    if (!de00)
+        return std::nullopt;
+    return limit.group == Group::paper ? std::optional(Attribute::paper)
+           : solids                    ? std::optional(Attribute::solid)
+           : limit.group == Group::all ? std::optional(Attribute::max_de00)
+                                       : std::nullopt;
+}
+
+// Gains are by density.
+bool is_about(const Tolerance &limit, const Measurand &measurand)
+{
+    return attribute_of(limit) == measurand.attribute && !measurand.sctv &&
+           (limit.ink.empty() || ink_title(limit.ink) == measurand.subject) &&
+           (limit.group != Group::spots || !is_process_ink(measurand.subject)) &&
+           (!limit.nominal || *limit.nominal == measurand.nominal);
+}
+
+// The aim of a gain is over the nominal value.
+std::optional<double> aim_of(const Tolerance &limit, const Measurand &measurand)
+{
+    if (!limit.aim)
+        return std::nullopt;
+    return measurand.attribute == Attribute::tone_value ? measurand.nominal + *limit.aim
+                                                        : *limit.aim;
+}
+
+// Nothing where there is no aim to stay by.
+std::optional<Limits> limits_of(const Measurand &measurand, const std::optional<double> &aim,
+                                double limit)
+{
+    switch (measurand.attribute) {
+    case Attribute::density:
+    case Attribute::tone_value:
+        return aim ? std::optional(Limits{*aim - limit, *aim + limit}) : std::nullopt;
+    case Attribute::delta_l:
+        return Limits{-limit, limit};
+    default: // differences
+        return Limits{{}, limit};
+    }
+}
+
+// The stricter on each side.
+Limits both(const Limits &first, const Limits &second)
+{
+    Limits out = first;
+    if (second.low && (!out.low || *second.low > *out.low))
+        out.low = second.low;
+    if (second.high && (!out.high || *second.high < *out.high))
+        out.high = second.high;
+    return out;
+}
+
+OverZones over_zones(const ZoneReading &reading)
+{
+    Series values;
+    OverZones out{.value = reading.value,
+                  .low = reading.value,
+                  .high = reading.value,
+                  .deviation = {},
+                  .zones = reading.zones};
+    for (const auto &[zone, value] : reading.zones) {
+        values.emplace_back(value);
+        out.low = std::fmin(values.size() > 1 ? out.low : value, value);
+        out.high = std::fmax(values.size() > 1 ? out.high : value, value);
+    }
+    if (!values.empty())
+        out.deviation = trend_of(values)->deviation;
+    return out;
+}
+
+// Year, month, day, hour, minute and second of "2026-03-02 08:07:00" or "2026-03-02T08:07"; nothing
+// of other ways to write a date.
+std::optional<std::array<int, 6>> date_in(const std::string &created)
+{
+    std::array<int, 6> out{};
+    std::size_t part = 0;
+    bool digits = false;
+    if (created.size() < 10 || created[4] != '-' || created[7] != '-')
+        return std::nullopt;
+    for (const char c : created) {
+        if (std::isdigit(static_cast<unsigned char>(c))) {
+            out[part] = (out[part] * 10 + (c - '0')) % 10000;
+            digits = true;
+        } else if (digits) {
+            ++part;
+            digits = false;
+        }
+        if (c == '.' || c == '+' || part == out.size())
+            break; // parts of a second, the time zone
+    }
+    return out;
+}
+
+// Zones whose readings are apart from those of the others in the mean of the sheets.
+std::map<int, double> odd_zones(const RunSeries &series)
+{
+    std::map<int, std::pair<double, double>> sums; // of the differences from the sheet, and count
+    for (const auto &sheet : series.sheets)
+        if (sheet)
+            for (const auto &[zone, value] : sheet->zones) {
+                sums[zone].first += value - sheet->value;
+                sums[zone].second += 1;
+            }
+    Series differences;
+    std::vector<int> zones;
+    for (const auto &[zone, sum] : sums) {
+        zones.push_back(zone);
+        differences.emplace_back(sum.first / sum.second);
+    }
+    std::map<int, double> out;
+    for (const std::size_t i : outliers_of(differences, apart_by(series.measurand.attribute)))
+        out[zones[i]] = *differences[i] - median_of(differences);
+    return out;
+}
+
+// "A, B, C and 4 more"
+std::string listed(const std::vector<std::string> &names)
+{
+    constexpr std::size_t most = 3;
+    const std::vector<std::string> first(
+        names.begin(), names.begin() + static_cast<std::ptrdiff_t>(std::min(most, names.size())));
+    return fmt::format("{}{}", fmt::join(first, ", "),
+                       names.size() > most ? fmt::format(" and {} more", names.size() - most) : "");
+}
+
+} // namespace
+
+RunJudge::RunJudge(Measurement aims, RunRequest request)
+    : aims(std::move(aims)), request(std::move(request))
+{
+    for (Patch &patch : this->aims.patches)
+        take_zone(patch);
+}
+
+void RunJudge::add(const Measurement &sheet)
+{
+    try {
+        std::vector<std::string> told; // by compare() too
+        if (!illuminant)
+            illuminant = illuminant_for(request.illuminant, {&aims, &sheet}, told);
+        CompareRequest beside;
+        beside.metrics = {usual_metric(Formula::de2000)};
+        beside.illuminant = illuminant->illuminant;
+        beside.status = request.status;
+        beside.tolerances = request.tolerances;
+        beside.paper = request.paper;
+        Entry entry{.sheet = {.file = sheet.file, .created = sheet.origin.created},
+                    .readings = readings_of(aims, sheet, beside, request.order),
+                    .origin = sheet.origin,
+                    .condition = sheet.source.condition};
+        entry.sheet.coverage = entry.readings.coverage;
+        entry.sheet.verdict = entry.readings.verdict;
+        std::set<int> zones;
+        for (const ZoneReading &reading : entry.readings.readings)
+            for (const auto &[zone, value] : reading.zones)
+                zones.insert(zone);
+        entry.sheet.zones.assign(zones.begin(), zones.end());
+        entries.push_back(std::move(entry));
+    } catch (const RequestError &error) {
+        add_unread(error.message.starts_with(sheet.file)
+                       ? error.message
+                       : fmt::format("{}: {}", sheet.file, error.message));
+    }
+}
+
+void RunJudge::add_unread(const std::string &reason) { unread.push_back(reason); }
+
+void RunJudge::sort_by_date(Run &run)
+{
+    run.by_date = std::all_of(entries.begin(), entries.end(), [](const Entry &entry) {
+        return date_in(entry.sheet.created).has_value();
+    });
+    if (run.by_date)
+        std::stable_sort(entries.begin(), entries.end(), [](const Entry &a, const Entry &b) {
+            return date_in(a.sheet.created) < date_in(b.sheet.created);
+        });
+    else if (entries.size() > 1)
+        run.warnings.emplace_back(
+            "not every sheet tells when it was made; the sheets stand as they were named");
+}
+
+// By attribute, then as the sheets first have them.
+void RunJudge::add_series(Run &run) const
+{
+    std::map<Measurand, std::size_t> places;
+    for (std::size_t i = 0; i < entries.size(); ++i)
+        for (const ZoneReading &reading : entries[i].readings.readings) {
+            const auto [place, is_new] = places.try_emplace(reading.measurand, run.series.size());
+            if (is_new)
+                run.series.push_back({.measurand = reading.measurand,
+                                      .aim = reading.aim,
+                                      .sheets = decltype(RunSeries::sheets)(entries.size())});
+            run.series[place->second].sheets[i] = over_zones(reading);
+        }
+    std::stable_sort(run.series.begin(), run.series.end(), [](const auto &a, const auto &b) {
+        return a.measurand.attribute < b.measurand.attribute;
+    });
+}
+
+void RunJudge::judge(RunSeries &series) const
+{
+    for (const Tolerance &limit : request.tolerances.limits)
+        if (is_about(limit, series.measurand)) {
+            if (const auto aim = aim_of(limit, series.measurand))
+                series.aim = aim;
+            if (const auto limits = limits_of(series.measurand, series.aim, limit.limit))
+                series.limits = series.limits ? both(*series.limits, *limits) : *limits;
+        }
+    Series values;
+    for (const auto &sheet : series.sheets)
+        values.push_back(sheet ? std::optional(sheet->value) : std::nullopt);
+    series.trend = trend_of(values).value();
+    series.outliers = outliers_about(values, series.trend, apart_by(series.measurand.attribute));
+    series.odd_zones = odd_zones(series);
+    if (!series.limits)
+        return;
+    series.first_outside = first_outside(values, *series.limits);
+    if (!series.first_outside && series.trend.drift)
+        series.leaves_at = leaves_at(*series.trend.drift, *series.limits, values.size(), kAhead);
+}
+
+// What a sheet lacks of what any other has.
+void RunJudge::find_gaps(Run &run) const
+{
+    for (std::size_t i = 0; i < entries.size(); ++i) {
+        std::vector<std::string> lacking;
+        std::map<int, std::pair<std::size_t, std::size_t>> zones; // lacking, of all
+        for (const RunSeries &series : run.series) {
+            std::set<int> known;
+            for (const auto &sheet : series.sheets)
+                if (sheet)
+                    for (const auto &[zone, value] : sheet->zones)
+                        known.insert(zone);
+            if (!series.sheets[i])
+                lacking.push_back(series.measurand.title());
+            else
+                for (const int zone : known) {
+                    zones[zone].first += !series.sheets[i]->zones.contains(zone);
+                    zones[zone].second += 1;
+                }
+        }
+        const std::string &file = entries[i].sheet.file;
+        if (!lacking.empty())
+            run.gaps.push_back(fmt::format("{}: no {}", file, listed(lacking)));
+        std::map<std::string, std::vector<int>> same; // zones by what they lack
+        for (const auto &[zone, count] : zones)
+            if (count.first == count.second)
+                same["missing"].push_back(zone);
+            else if (count.first)
+                same[fmt::format("without {} of {} readings", count.first, count.second)].push_back(
+                    zone);
+        for (const auto &[what, numbers] : same)
+            run.gaps.push_back(fmt::format("{}: zone{} {} {}", file, numbers.size() == 1 ? "" : "s",
+                                           fmt::join(numbers, ", "), what));
+    }
+}
+
+void RunJudge::add_limits(Run &run) const
+{
+    for (std::size_t k = 0; k < request.tolerances.limits.size(); ++k) {
+        LimitResult worst = entries[0].readings.limits[k];
+        LimitPlaces places;
+        for (std::size_t i = 0; i < entries.size(); ++i) {
+            const LimitResult &result = entries[i].readings.limits[k];
+            const bool worse_verdict = worse(result.verdict, worst.verdict) != worst.verdict;
+            const bool farther = result.verdict == worst.verdict &&
+                                 result.measured > worst.measured; // none is least
+            if (worse_verdict || farther) {
+                worst = result;
+                places.worst = i;
+            }
+            if (result.verdict == Verdict::failed && !places.first_failed)
+                places.first_failed = i;
+        }
+        places.is_told =
+            std::any_of(run.series.begin(), run.series.end(), [&](const RunSeries &series) {
+                return series.first_outside && is_about(worst.limit, series.measurand);
+            });
+        run.limits.push_back(std::move(worst));
+        run.limit_places.push_back(places);
+    }
+    if (run.limits.empty())
+        return;
+    run.verdict = run.unread.empty() && run.gaps.empty() ? Verdict::passed : Verdict::incomplete;
+    for (const RunSheet &sheet : run.sheets)
+        run.verdict = worse(*run.verdict, sheet.verdict.value_or(Verdict::incomplete));
+}
+
+void RunJudge::add_advice(Run &run) const
+{
+    const SheetReadings &last = entries.back().readings;
+    for (const auto &[ink, solid, aim] : last.solids)
+        if (const auto advice = advise(solid, last.paper, aim, *illuminant, request.status))
+            run.advice.push_back({ink, *advice});
+}
+
+// Sheets of one run are of one job, read by one instrument in one way, and no two are one.
+void RunJudge::compare_origins(Run &run) const
+{
+    const Entry &first = entries.front();
+    run.job = first.origin.job;
+    run.instrument = first.origin.instrument;
+    run.condition = first.condition;
+    for (std::size_t i = 1; i < entries.size(); ++i) {
+        const Entry &entry = entries[i];
+        const auto differs = [&](const char *what, const std::string &own,
+                                 const std::string &of_first) {
+            if (own != of_first)
+                run.warnings.push_back(fmt::format("{}: {} \"{}\", of {} \"{}\"", entry.sheet.file,
+                                                   what, own, first.sheet.file, of_first));
+        };
+        differs("job", entry.origin.job, run.job);
+        differs("instrument", entry.origin.instrument, run.instrument);
+        differs("condition", entry.condition, run.condition);
+        for (std::size_t k = 0; k < i; ++k)
+            if (entries[k].readings.readings == entry.readings.readings) {
+                run.warnings.push_back(fmt::format("{} and {} read the same to the last digit",
+                                                   entries[k].sheet.file, entry.sheet.file));
+                break;
+            }
+    }
+}
+
+// Each once; what is said of several sheets with the number of the others.
+void RunJudge::add_warnings(Run &run) const
+{
+    std::vector<std::pair<std::string, std::size_t>> all; // without the sheet; how many sheets
+    std::map<std::string, std::size_t> places;
+    std::vector<std::string> first;
+    for (const Entry &entry : entries)
+        for (const std::string &warning : entry.readings.warnings) {
+            const bool own = warning.starts_with(entry.sheet.file);
+            const std::string text =
+                own ? warning.substr(entry.sheet.file.size()) : std::string(warning);
+            const auto [place, is_new] = places.try_emplace(text, all.size());
+            if (is_new) {
+                all.emplace_back(text, 0);
+                first.push_back(warning);
+            }
+            all[place->second].second += own;
+        }
+    for (std::size_t i = 0; i < all.size(); ++i)
+        run.warnings.push_back(all[i].second > 1 ? fmt::format("{} (and so of {} more sheets)",
+                                                               first[i], all[i].second - 1)
+                                                 : first[i]);
+}
+
+Run RunJudge::result()
+{
+    if (entries.empty())
+        throw RequestError{fmt::format("none of the {} sheets can be judged; {}", unread.size(),
+                                       unread.empty() ? "there is none" : unread[0])};
+    Run run{.aims = aims.file,
+            .illuminant = *illuminant,
+            .status = request.status,
+            .sheets = {},
+            .unread = unread,
+            .tolerances = request.tolerances.name,
+            .limits = {},
+            .limit_places = {},
+            .series = {},
+            .advice = {},
+            .gaps = {},
+            .warnings = {},
+            .verdict = {}};
+    sort_by_date(run);
+    for (const Entry &entry : entries)
+        run.sheets.push_back(entry.sheet);
+    add_series(run);
+    for (RunSeries &series : run.series)
+        judge(series);
+    find_gaps(run);
+    add_limits(run);
+    add_advice(run);
+    compare_origins(run);
+    add_warnings(run);
+    return run;
+}
+
+} // namespace vantrel::sheets
