@@ -1,0 +1,13 @@
+import create from './module.mjs';
+import { constants, table } from './functions.js';
+import { functionsOf } from './rows.js';
+import { load } from './vantrel.js';
+
+const url = new URL('module.wasm', import.meta.url);
+const inNode = typeof process === 'object' && process.versions?.node;
+const bytes = inNode ? await (await import('node:fs/promises')).readFile(url)
+  : await (await fetch(url)).arrayBuffer();
+const { wasm, ...files } = await load(create, bytes);
+
+export const { read, readSpectra, report, compare, predict, ink } = files;
+export { constants };

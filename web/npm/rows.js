@@ -1,0 +1,108 @@
+// The functions of the library over rows of Float64Array.
+
+const SIZES = { double: 8, float: 4, int: 4, unsigned: 4, wchar_t: 4 };
+const HEAPS = { double: 'HEAPF64', float: 'HEAPF32', int: 'HEAP32', unsigned: 'HEAPU32', wchar_t: 'HEAPU32' };
+
+// `table` has a row for each function: its C name, its arguments in their order, `call(f, at, i)` that
+// calls f for row i, whether it tells of success, and why it would not. `constants` are the numbers
+// behind names.
+export function functionsOf(wasm, table, constants) {
+  let arena = 0;
+  let capacity = 0;
+  function reserve(size) {
+    if (size <= capacity) return;
+    wasm._free(arena);
+    capacity = 0;
+    arena = wasm._malloc(size) >>> 0;
+    if (!arena) throw new Error('not enough memory');
+    capacity = size;
+  }
+
+  function numberOf(value, name) {
+    if (typeof value === 'number') return value;
+    const found = ['', '_STATUS', '_RESPONSE'].map((ending) => constants[value + ending])
+      .find((constant) => constant !== undefined);
+    if (found === undefined) throw new TypeError(`${name} is ${value}, no number and no name`);
+    return found;
+  }
+
+  // What is given for an argument: { data, rows } of an array, { value } of a number.
+  function taken(argument, value, name) {
+    const { count, kind, nullable } = argument;
+    if (kind === 'number') {
+      return typeof value === 'object' && value !== null ? { data: value, rows: value.length }
+        : { value: numberOf(value, `${argument.name} of ${name}()`), rows: 1 };
+    }
+    if ((value === null || value === undefined) && nullable) return { value: 0, rows: 1 };
+    const rows = value?.length / count;
+    if (!(rows >= 1) || !Number.isInteger(rows))
+      throw new TypeError(`${argument.name} of ${name}() takes rows of ${count} numbers`);
+    return { data: value, rows };
+  }
+
+  const textAt = (codes) => String.fromCodePoint(...codes.subarray(0, codes.indexOf(0)));
+
+  function resultOf({ count, type }, at, rows) {
+    const heap = wasm[HEAPS[type]];
+    const begin = at / SIZES[type];
+    if (type === 'wchar_t') {
+      const texts = Array.from({ length: rows }, (_, i) =>
+        textAt(heap.subarray(begin + i * count, begin + (i + 1) * count)));
+      return rows === 1 ? texts[0] : texts;
+    }
+    if (rows === 1 && count === 1) return heap[begin];
+    return Float64Array.from(heap.subarray(begin, begin + rows * count));
+  }
+
+  function run({ name, js, args, call, succeeds, reason }, given) {
+    const inputs = args.filter(({ kind }) => kind !== 'output');
+    if (given.length > inputs.length)
+      throw new TypeError(`${js}() takes ${inputs.length} arguments, not ${given.length}`);
+    const values = inputs.map((argument, i) => taken(argument, given[i], js));
+    const rows = Math.max(1, ...values.map((value) => value.rows));
+    if (values.some((value) => value.rows !== 1 && value.rows !== rows))
+      throw new TypeError(`${js}() takes arrays of equally many rows, or of one`);
+
+    // Each array has its place, and each argument where it begins and how far it is to the next row.
+    let size = 16; // of the four pointers of weights
+    const place = (bytes) => (size += bytes) - bytes;
+    const at = args.map((argument) => {
+      const { kind, count, type } = argument;
+      if (kind === 'output')
+        return { begin: place(Math.ceil(rows * count * SIZES[type] / 8) * 8), step: count * SIZES[type] };
+      const { data, value, rows: own } = values[inputs.indexOf(argument)];
+      if (!data) return { begin: value, step: 0 };
+      if (kind === 'number') return { values: data };
+      return { begin: place(Math.ceil(data.length * SIZES[type] / 8) * 8), data, type,
+        step: own === 1 ? 0 : count * SIZES[type], weights: kind === 'weights' };
+    });
+    reserve(size);
+    args.forEach(({ kind }, i) => {
+      const one = at[i];
+      if (kind !== 'output' && !one.data) return;
+      one.begin += arena;
+      if (one.data) wasm[HEAPS[one.type]].set(one.data, one.begin / SIZES[one.type]);
+      if (one.weights) {
+        const curves = [0, 1, 2, 3].map((curve) => one.begin + curve * 31 * 8);
+        wasm.HEAPU32.set(curves, arena / 4);
+        one.begin = arena;
+      }
+    });
+
+    const outputs = args.map((argument, i) => [argument, at[i].begin])
+      .filter(([{ kind }]) => kind === 'output');
+    const returned = new Float64Array(outputs.length ? 0 : rows);
+    for (let i = 0; i < rows; ++i) {
+      const result = call(wasm[name], at, i);
+      if (!outputs.length) returned[i] = result;
+      else if (succeeds && !result)
+        throw new RangeError(`${js}()${rows === 1 ? '' : `, row ${i}`}: ${reason}`);
+    }
+    if (!outputs.length) return rows === 1 ? returned[0] : returned;
+    const results = outputs.map(([argument, begin]) =>
+      [argument.name, resultOf(argument, begin, rows)]);
+    return results.length === 1 ? results[0][1] : Object.fromEntries(results);
+  }
+
+  return Object.fromEntries(table.map((row) => [row.js, (...given) => run(row, given)]));
+}
