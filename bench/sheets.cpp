@@ -29,28 +29,35 @@ public:
     void end(const char *what)
     {
         const auto now = std::clock();
-        all.emplace_back(what, static_cast<double>(now - begin) / CLOCKS_PER_SEC);
+        rusage use{};
+        getrusage(RUSAGE_SELF, &use);
+        all.push_back({what, static_cast<double>(now - begin) / CLOCKS_PER_SEC,
+                       1024 * static_cast<double>(use.ru_maxrss)});
         begin = now;
     }
 
     void print(const std::string &title, std::size_t patches) const
     {
-        rusage use{};
-        getrusage(RUSAGE_SELF, &use);
         double sum = 0;
-        for (const auto &[what, seconds] : all)
-            sum += seconds;
+        for (const Phase &phase : all)
+            sum += phase.seconds;
         std::printf("%-28s%8.2f s%8.2f us%8.0f bytes a patch  (", title.c_str(), sum,
                     1e6 * sum / static_cast<double>(patches),
-                    1024.0 * static_cast<double>(use.ru_maxrss) / static_cast<double>(patches));
-        for (const auto &[what, seconds] : all)
-            std::printf("%s%s %.2f s", what == all.front().first ? "" : ", ", what, seconds);
+                    all.back().most / static_cast<double>(patches));
+        for (const Phase &phase : all)
+            std::printf("%s%s %.2f s %.0f bytes", &phase == all.data() ? "" : ", ", phase.what,
+                        phase.seconds, phase.most / static_cast<double>(patches));
         std::puts(")");
     }
 
 private:
     std::clock_t begin = std::clock();
-    std::vector<std::pair<const char *, double>> all;
+    struct Phase {
+        const char *what;
+        double seconds;
+        double most; // bytes in memory so far
+    };
+    std::vector<Phase> all;
 };
 
 Measurement read(const char *path)
