@@ -198,32 +198,43 @@ template <class V> V exp10(V x)
 }
 
 // x^y = ∛x x^-d, d = 1/3 - y: the cube root by a step of Halley's from 23 bits on, and
-// x^-d = 1 - u + u²/2, u = d ln x.
-template <class V> V near_cube_root(V x, double y)
+// x^-d = 1 - u + u²/2, u = d ln x, for which ten decimals of the logarithm are enough.
+
+/// For a normal x, which stands for x 2^-down.
+template <class V> V root_of_normal(V x, double y, V down)
 {
     static constexpr double kRoot[] = {
         0x1.b42648613923ap-2,  0x1.0e47e0f53ce4fp+0, -0x1.c77345675bc91p-1, 0x1.4a3f9857830ap-1,
         -0x1.4b882010c8d23p-2, 0x1.abd8ea5835697p-4, -0x1.3ed90ff5478ecp-6, 0x1.a106089abdd43p-10};
-    const double d = ((1 - 2 * y) - y) / 3; // both differences are exact
-    const auto subnormal = x < kLeastNormal;
-    const V normal = select(subnormal, x * 0x1p54, x);
-    const V k = small_integer(bits(normal) >> 52) - 1023;
-    const V m = from_bits((bits(normal) & kMantissa) | kOne);
-    const V estimate = to_integer((k - 1) * (1.0 / 3));
-    const V over = k - 3 * estimate; // 0, 1 or 2, but for another rounding mode
-    const V third = estimate + select(over < 0, V(-1), select(over > 2, V(1), V(0)));
-    const V rest = k - 3 * third;
-    const V t = leading(polynomial(m, kRoot) * select(rest == 0, V(1),
-                                                      select(rest == 1, V(0x1.428a2f98d728bp+0),
-                                                             V(0x1.965fea53d6e3dp+0))),
-                        kLeading23);
+    static constexpr double kLog[] = {
+        -0x1.6092a32a5d6f8p+1, 0x1.0e41ccb84bf2bp+3, -0x1.043649a39a1e8p+4, 0x1.92e00fe637ae3p+4,
+        -0x1.d749e7447706ap+4, 0x1.a019d0bd0bd94p+4, -0x1.15a85635777b5p+4, 0x1.16a555164bafbp+3,
+        -0x1.9e4656945f234p+1, 0x1.bacc152858136p-1, -0x1.41eb8c6d4ccdcp-3, 0x1.1d34671d337dap-6,
+        -0x1.d0efae7c714b6p-11};
+    const double d = ((1 - 2 * y) - y) / 3;          // both differences are exact
+    const V exponent = small_integer(bits(x) >> 52); // and 1023
+    // floor(exponent / 3), exact in every rounding mode: 21846 / 2^16 is a little above 1/3.
+    const V third = small_integer((bits(exponent * 21846 + 0x1p52) & kMantissa) >> 16);
+    const V rest = exponent - 3 * third;
+    const V m = from_bits((bits(x) & kMantissa) | kOne);
+    // The parabola through 1, ∛2 and ∛4.
+    const V root_of_rest = 1 + rest * (0x1.cf23503e16fbcp-3 + 0x1.14b8b2228926cp-5 * rest);
+    const V t = leading(polynomial(m, kRoot) * root_of_rest, kLeading23);
     const V quotient = m * power_of_2(rest) / (t * t);
     const V step = (quotient - t) / (t + t + quotient);
-    const V u = d * log(x);
+    const V u = d * ((exponent - (1023 + down)) * kLn2.high + polynomial(m, kLog));
     const V power = u * (0.5 * u - 1);
-    const V root = (t + t * (step + power + step * power)) *
-                   power_of_2(third - select(subnormal, V(18), V(0)));
-    return select(is_normal(x) | ((x > 0) & subnormal), root,
+    return (t + t * (step + power + step * power)) * power_of_2(third - (341 + down / 3));
+}
+
+template <class V> V near_cube_root(V x, double y)
+{
+    if (!any(!is_normal(x))) [[likely]]
+        return root_of_normal(x, y, V(0));
+    const auto subnormal = (x > 0) & (x < kLeastNormal);
+    const V root =
+        root_of_normal(select(subnormal, x * 0x1p54, x), y, select(subnormal, V(54), V(0)));
+    return select(is_normal(x) | subnormal, root,
                   select((x == 0) | (abs(x) == kInfinity), abs(x), V(kNan)));
 }
 
