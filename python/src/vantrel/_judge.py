@@ -81,7 +81,7 @@ def _answer(command: str, sheets: Sequence[Sheet], options: Dict[str, Any], form
 def _result(kind: Any, command: str, sheets: Sequence[Sheet], options: Dict[str, Any]) -> Any:
     names = {key: value for key, value in options.items() if value is not None}
     result = kind._of(functools.partial(_answer, command, sheets, names))
-    told = {f"{s.file}: {line}" if s.file else line for s in sheets for line in s._warnings}
+    told = {f"{s.file}:{line}" for s in sheets for line in s._warnings}
     for line in result.warnings:
         if line not in told:  # by read()
             warnings.warn(in_python(line), stacklevel=3)

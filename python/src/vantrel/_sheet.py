@@ -226,8 +226,8 @@ def _sheet(
         text = in_python(str(error))
         raise ValueError(f"{file}: {text}" if file else text) from None
     said = [in_python(line.strip()) for line in found["warnings"]]
-    for line in said:
-        warnings.warn(f"{file}: {line}" if file else line, stacklevel=level)
+    for line in found["warnings"]:
+        warnings.warn(in_python(f"{file}:{line}" if file else line.strip()), stacklevel=level)
     illuminant = found.get("lab_illuminant")
     return Sheet(
         spectra=_array(found["spectra"], -1, 31) if "spectra" in found else None,
