@@ -22,13 +22,14 @@ const [before, after] = page.split('@data@');
 
 // Compilers need not take literals beyond 65,536 bytes.
 const literals = (text) =>
-  text.match(/[^]{1,15000}/gu).map((piece) => `    R"__page(${piece})__page",\n`).join('');
+  text.match(/[^]{1,15000}/gu).map((piece) => `    R"__page(${piece})__page"sv,\n`).join('');
 
 writeFileSync(output, `// The page, as build.mjs made it.
 #include "write/page/page.h"
 
 namespace vantrel::sheets {
 namespace {
+using namespace std::string_view_literals; // which know their length without counting
 constexpr std::string_view before[] = {
 ${literals(before)}};
 constexpr std::string_view after[] = {
