@@ -53,6 +53,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t *data, std::size_t size
     const bool json = options.find("format") == std::string::npos;
     check(vantrel_report(&sheet, 1, sheet, options.c_str(), nullptr, nullptr), json);
     check(vantrel_compare(sheet, sheet, options.c_str(), nullptr, nullptr), json);
+    check(vantrel_run(&sheet, 1, sheet, options.c_str()), json);
     check(vantrel_predict(sheet, options.c_str()), json);
     check(vantrel_ink(sheet, options.c_str()), json);
     vantrel_close(sheet);

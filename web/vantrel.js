@@ -133,6 +133,9 @@ export async function load(create, wasmBinary) {
         list(sheets).length, secondSheet?.pointer ?? 0, JSON.stringify(options), tell, 0), options),
     compare: (aims, sheet, options = {}, tell = 0) =>
       answered(ask('compare', aims.pointer, sheet.pointer, JSON.stringify(options), tell, 0), options),
+    run: (sheets, aims, options = {}) =>
+      answered(ask('run', Uint32Array.from(list(sheets), (sheet) => sheet.pointer), list(sheets).length,
+        aims.pointer, JSON.stringify(options)), options),
     predict: (sheet, options = {}) =>
       answered(ask('predict', sheet.pointer, JSON.stringify(options)), options),
     ink: (sheet, options = {}) =>

@@ -367,6 +367,34 @@ std::string compare(const Measurement &reference, const Measurement &sample,
     return written(compare(reference, sample, request), format, tell);
 }
 
+std::string run(const std::vector<const Measurement *> &sheets, const Measurement &aims,
+                std::string_view options)
+{
+    Options given(options);
+    const RunRequest request{
+        .illuminant = given.illuminant(),
+        .status = given.status(),
+        .paper = given.text("paper"),
+        .order = given.texts("order"),
+        .tolerances = tolerances_of(given),
+    };
+    const std::vector<std::string> unread = given.texts("unread");
+    const std::string format = format_of(given);
+    given.finish();
+    RunJudge judge(aims, request);
+    for (const Measurement *sheet : sheets) {
+        try {
+            require_spectra(*sheet);
+            judge.add(*sheet);
+        } catch (const RequestError &error) {
+            judge.add_unread(error.message);
+        }
+    }
+    for (const std::string &reason : unread)
+        judge.add_unread(printable(reason));
+    return written(judge.result(), format);
+}
+
 std::string predict(const Measurement &sheet, std::string_view options)
 {
     Options given(options);

@@ -35,6 +35,8 @@ std::string report(const std::vector<const Measurement *> &sheets, const Measure
                    std::string_view options, const Tell &tell = {});
 std::string compare(const Measurement &reference, const Measurement &sample,
                     std::string_view options, const Tell &tell = {});
+std::string run(const std::vector<const Measurement *> &sheets, const Measurement &aims,
+                std::string_view options);
 std::string predict(const Measurement &sheet, std::string_view options);
 std::string ink(const Measurement &sheet, std::string_view options);
 

@@ -64,6 +64,15 @@ Tell teller(VantrelTell tell, void *user)
     return [=](const char *what, double share) { tell(user, what, share); };
 }
 
+std::vector<const Measurement *> measurements_of(const VantrelSheet *const *sheets,
+                                                 std::size_t count)
+{
+    std::vector<const Measurement *> out;
+    for (std::size_t i = 0; i < count; ++i)
+        out.push_back(&sheets[i]->measurement);
+    return out;
+}
+
 const Patch *patch_at(const VantrelSheet *sheet, std::size_t patch)
 {
     const std::vector<Patch> &patches = sheet->measurement.patches;
@@ -122,11 +131,9 @@ VantrelAnswer *vantrel_report(const VantrelSheet *const *sheets, size_t count,
                               VantrelTell tell, void *user)
 {
     return answer([&] {
-        std::vector<const Measurement *> measurements;
-        for (std::size_t i = 0; i < count; ++i)
-            measurements.push_back(&sheets[i]->measurement);
-        return report(measurements, second_sheet ? &second_sheet->measurement : nullptr,
-                      given(options), teller(tell, user));
+        return report(measurements_of(sheets, count),
+                      second_sheet ? &second_sheet->measurement : nullptr, given(options),
+                      teller(tell, user));
     });
 }
 
@@ -137,6 +144,13 @@ VantrelAnswer *vantrel_compare(const VantrelSheet *reference, const VantrelSheet
         return compare(reference->measurement, sample->measurement, given(options),
                        teller(tell, user));
     });
+}
+
+VantrelAnswer *vantrel_run(const VantrelSheet *const *sheets, size_t count,
+                           const VantrelSheet *aims, const char *options)
+{
+    return answer(
+        [&] { return run(measurements_of(sheets, count), aims->measurement, given(options)); });
 }
 
 VantrelAnswer *vantrel_predict(const VantrelSheet *sheet, const char *options)

@@ -77,6 +77,8 @@ VANTREL_SHEETS_API const char *vantrel_patch_id(const VantrelSheet *sheet, size_
  * - compare: pair (auto, name, id, device, order), force_pairs, repeats (mean, each),
  *   allow_missing, formula (a list), weights ({"cmc": [2, 1]}), second_illuminant, words (ab, hue),
  *   tolerance, tolerances (TOML text), tolerances_name (where it has none), substrate_corrected
+ * - run: order (a list), tolerances, tolerances_name, unread (a list of reasons: sheets that the
+ *   host could not open)
  * - predict: order (a list), ink ([["Magenta 100", 40], ["Cyan 100", 7]])
  * - ink: patch, against, order (a list) */
 VANTREL_SHEETS_API VantrelAnswer *vantrel_report(const VantrelSheet *const *sheets, size_t count,
@@ -85,6 +87,8 @@ VANTREL_SHEETS_API VantrelAnswer *vantrel_report(const VantrelSheet *const *shee
 VANTREL_SHEETS_API VantrelAnswer *vantrel_compare(const VantrelSheet *reference,
                                                   const VantrelSheet *sample, const char *options,
                                                   VantrelTell tell, void *user);
+VANTREL_SHEETS_API VantrelAnswer *vantrel_run(const VantrelSheet *const *sheets, size_t count,
+                                              const VantrelSheet *aims, const char *options);
 VANTREL_SHEETS_API VantrelAnswer *vantrel_predict(const VantrelSheet *sheet, const char *options);
 VANTREL_SHEETS_API VantrelAnswer *vantrel_ink(const VantrelSheet *sheet, const char *options);
 

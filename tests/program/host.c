@@ -67,7 +67,8 @@ int main(int count, char **words)
     answer =
         !strcmp(command, "compare")   ? vantrel_compare(sheets[0], sheets[1], options, NULL, NULL)
         : !strcmp(command, "predict") ? vantrel_predict(sheets[0], options)
-        : !strcmp(command, "ink")     ? vantrel_ink(sheets[0], options)
+        : !strcmp(command, "run") ? vantrel_run(given + 1, (size_t)files - 1, sheets[0], options)
+        : !strcmp(command, "ink") ? vantrel_ink(sheets[0], options)
                                   : vantrel_report(given, (size_t)files, NULL, options, NULL, NULL);
     end_unless_ok(answer);
     if (fwrite(vantrel_answer_text(answer), 1, vantrel_answer_size(answer), stdout) == 0)

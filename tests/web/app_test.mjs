@@ -47,6 +47,8 @@ for (const [button, command, files] of [
   ['Report', 'vantrel report press.txt', ['press.txt']],
   ['Compare', 'vantrel compare aims.txt press.txt --tolerances offset.toml',
     ['aims.txt', 'press.txt', 'offset.toml']],
+  ['Press run', 'vantrel run press.txt proof.csv --aims aims.txt --tolerances offset.toml',
+    ['aims.txt', 'press.txt', 'proof.csv', 'offset.toml']],
   ['Predict overprints', 'vantrel predict press.txt', ['press.txt']],
 ])
   test(`${button} is the page of ${command}`, async () => {

@@ -55,7 +55,7 @@ const format = h('select', { 'aria-label': texts.save }, Object.entries(texts.fo
   .map(([value, label]) => h('option', { value }, label)));
 const button = (label, onclick, disabled = false) =>
   h('button', { type: 'button', class: 'turn', disabled, onclick }, label);
-const buttons = ['report', 'compare', 'predict'].map((call) =>
+const buttons = ['report', 'compare', 'run', 'predict'].map((call) =>
   button(texts[call], () => judge(call), true));
 const save = button(texts.save, () => saveAs(), true);
 
@@ -91,9 +91,9 @@ function showFiles() {
   fill(reference, names, 0);
   fill(sample, names, 1);
   fill(tolerances, [['', texts.none], ...[...limits.keys()].map((name) => [name, name])], limits.size);
-  const [report, compare, predict] = buttons;
+  const [report, compare, run, predict] = buttons;
   report.disabled = predict.disabled = sheets.size === 0;
-  compare.disabled = sheets.size < 2;
+  compare.disabled = run.disabled = sheets.size < 2;
 }
 
 async function open(files) {
@@ -137,9 +137,12 @@ function request(call) {
   const options = { illuminant: illuminant.value, status: densities.value, paper: paper.value };
   if (call === 'report') return [[...sheets.keys()], options];
   if (call === 'predict') return [[Number(sample.value)], { ...options, ink: inkTints() }];
-  return [[Number(reference.value), Number(sample.value)], { ...options, pair: pair.value,
+  const aims = Number(reference.value);
+  const limited = { ...options, tolerances: limits.get(tolerances.value) ?? '',
+    tolerances_name: tolerances.value || 'tolerances' };
+  if (call === 'run') return [[aims, ...[...sheets.keys()].filter((key) => key !== aims)], limited];
+  return [[aims, Number(sample.value)], { ...limited, pair: pair.value,
     tolerance: tolerance.value === '' ? null : Number(tolerance.value),
-    tolerances: limits.get(tolerances.value) ?? '', tolerances_name: tolerances.value || 'tolerances',
     substrate_corrected: corrected.checked }];
 }
 

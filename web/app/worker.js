@@ -28,6 +28,7 @@ onmessage = async ({ data: { id, call, name, bytes, keys, options } }) => {
     },
     report: (vantrel, given) => vantrel.report(given, options, tell),
     compare: (vantrel, given) => vantrel.compare(...given, options, tell),
+    run: (vantrel, [aims, ...given]) => vantrel.run(given, aims, options),
     predict: (vantrel, given) => vantrel.predict(...given, options),
   };
   try {

@@ -32,5 +32,6 @@ export function readSpectra(spectra: Rows, options?: Reading & { names?: string[
 /** What the commands of the program answer: an object as docs/json.md tells, or a text by `format`. */
 export function report(sheets: Sheet | Sheet[], options?: Options & { secondSheet?: Sheet }, tell?: Tell): any;
 export function compare(aims: Sheet, sheet: Sheet, options?: Options, tell?: Tell): any;
+export function run(sheets: Sheet | Sheet[], aims: Sheet, options?: Options): any;
 export function predict(sheet: Sheet, options?: Options): any;
 export function ink(sheet: Sheet, options: Options & { patch: string }): any;

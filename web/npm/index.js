@@ -9,5 +9,5 @@ const bytes = inNode ? await (await import('node:fs/promises')).readFile(url)
   : await (await fetch(url)).arrayBuffer();
 const { wasm, ...files } = await load(create, bytes);
 
-export const { read, readSpectra, report, compare, predict, ink } = files;
+export const { read, readSpectra, report, compare, run, predict, ink } = files;
 export { constants };
