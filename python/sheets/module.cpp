@@ -73,6 +73,12 @@ std::string answer_of(std::string_view command, const std::vector<Measurement> &
 {
     if (command == "compare")
         return compare(sheets.at(0), sheets.at(1), options);
+    if (command == "run") {
+        std::vector<const Measurement *> of_run;
+        for (std::size_t i = 1; i < sheets.size(); ++i)
+            of_run.push_back(&sheets[i]);
+        return run(of_run, sheets.at(0), options);
+    }
     if (command == "predict")
         return predict(sheets.at(0), options);
     return report({&sheets.at(0)}, sheets.size() > 1 ? &sheets[1] : nullptr, options);

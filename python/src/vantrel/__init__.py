@@ -147,7 +147,8 @@ from ._constants import (
 from ._resample import resample
 from ._sheet import Origin, Sheet, Source, read, reads
 from ._results import Comparison, Predictions, Report
-from ._judge import compare, predict, report
+from ._run import Run
+from ._judge import compare, predict, report, run
 
 __version__ = ufuncs.version
 __all__ = [name for name in dir() if not name.startswith("_")]  # what help() lists

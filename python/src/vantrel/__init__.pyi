@@ -12,8 +12,9 @@ from numpy.typing import ArrayLike, NDArray
 
 from . import plot as plot
 from ._enums import IllumObs as IllumObs, Response as Response, Status as Status
-from ._judge import compare as compare, predict as predict, report as report
+from ._judge import compare as compare, predict as predict, report as report, run as run
 from ._results import Comparison as Comparison, Predictions as Predictions, Report as Report
+from ._run import Run as Run
 from ._sheet import Origin as Origin, Sheet as Sheet, Source as Source, read as read, reads as reads
 
 class _SupportsArray(Protocol):
@@ -90,7 +91,7 @@ ufuncs: Any
 den_weight: NDArray[np.int64]
 
 __all__ = [
-    "CIEDE2000", "Comparison", "IllumObs", "Origin", "Predictions", "Report", "Response",
+    "CIEDE2000", "Comparison", "IllumObs", "Origin", "Predictions", "Report", "Response", "Run",
     "Sheet", "Source", "Status", "adjust_for_paper_refls", "calc_labch",
     "calculate_ccr_densities", "calculate_special_density", "calculate_spectral_density",
     "calculate_spectralx_density", "calculate_tint_color", "choose_bp_wavelen",
@@ -118,7 +119,7 @@ __all__ = [
     "refl_to_din6172", "refl_to_dot_area", "refl_to_dot_gain", "refl_to_hue_gray",
     "refl_to_hunter_lab", "refl_to_pol_intercept", "refl_to_print_contrast",
     "refl_to_refl_density", "refl_to_rgb", "refl_to_trap", "refl_to_white_e313_98",
-    "refl_to_xyz", "refl_to_xyzs", "report", "resample", "saunderson",
+    "refl_to_xyz", "refl_to_xyzs", "report", "resample", "run", "saunderson",
     "set_achromatic_constants", "set_hexachrome_constants", "set_hifi_constants",
     "set_spectralx_constants", "settings", "ufuncs", "un_saunderson", "unpack_rgb",
     "verbal_color_difference", "xyz_to_cie_yxy", "xyz_to_cielab", "xyz_to_cielch",

@@ -1,4 +1,4 @@
-"""What the program's commands say of sheets: report, compare, predict."""
+"""What the program's commands say of sheets: report, compare, predict, run."""
 
 import functools
 import json
@@ -12,7 +12,8 @@ import numpy as np
 from ._arguments import INDICES
 from ._enums import IllumObs, Status
 from ._results import Comparison, Predictions, Report
-from ._sheet import Sheet, extension, in_python
+from ._run import Run
+from ._sheet import Sheet, extension, in_python, read
 
 Illuminant = Union[
     IllumObs,
@@ -82,7 +83,8 @@ def _result(kind: Any, command: str, sheets: Sequence[Sheet], options: Dict[str,
     names = {key: value for key, value in options.items() if value is not None}
     result = kind._of(functools.partial(_answer, command, sheets, names))
     told = {f"{s.file}:{line}" for s in sheets for line in s._warnings}
-    for line in result.warnings:
+    not_judged = [f"not judged: {reason}" for reason in getattr(result, "unread", ())]
+    for line in [*result.warnings, *not_judged]:
         if line not in told:  # by read()
             warnings.warn(in_python(line), stacklevel=3)
     return result
@@ -312,4 +314,63 @@ def predict(
         pairs: List[Tuple[str, float]] = [*(inks.items() if isinstance(inks, Mapping) else inks)]
         options["ink"] = [[name, percent] for name, percent in pairs]
     result: Predictions = _result(Predictions, "predict", [sheet], options)
+    return result
+
+
+def run(
+    sheets: Sequence[Union[Sheet, Path]],
+    aims: Sheet,
+    *,
+    tolerances: Optional[Path] = None,
+    illuminant: Optional[Illuminant] = None,
+    status: StatusName = "E",
+    paper: Optional[str] = None,
+    order: Optional[Sequence[str]] = None,
+) -> Run:
+    """What left its limits in a press run, what drifts, what stands apart, as `vantrel run`.
+
+    Parameters
+    ----------
+    sheets : list of Sheet or of paths
+        In the order of the run, unless all have a date. A file that cannot be read is named in
+        `unread`, and the others are judged.
+    aims : Sheet
+    tolerances : str or path, optional
+        A TOML file of limits by group of patches.
+    illuminant, status, paper, order
+        As of report().
+
+    Returns
+    -------
+    run : Run
+        What it finds odd becomes warnings.
+
+    Raises
+    ------
+    ValueError
+        Where no sheet can be judged.
+    OSError
+        Where there is no such file.
+
+    Examples
+    --------
+    >>> import dataclasses
+    >>> aims = vantrel.read("examples/two_ink_halftone.txt")
+    >>> run = vantrel.run([dataclasses.replace(aims, spectra=aims.spectra * 0.98)], aims)
+    >>> print(run.series[-1].title, np.round(run.series[-1].values, 2))
+    largest ΔE00 [0.46]
+    """
+    taken, unread = [], []
+    for sheet in sheets:
+        try:
+            taken.append(sheet if isinstance(sheet, Sheet) else read(sheet))
+        except ValueError as error:
+            unread.append(str(error))
+    options = {
+        **_usual(illuminant, status, paper),
+        "order": None if order is None else [*order],
+        **_tolerances(tolerances),
+        "unread": unread,
+    }
+    result: Run = _result(Run, "run", [aims, *taken], options)
     return result

@@ -10,7 +10,7 @@ Lab = Tuple[float, float, float]
 Refl = Optional[Tuple[float, ...]]
 
 
-def _frame(rows: Any) -> Any:
+def frame(rows: Any) -> Any:
     import pandas as pd
 
     return pd.DataFrame.from_records([*rows])
@@ -142,7 +142,7 @@ class Report(Result):
 
     def to_pandas(self) -> Any:
         """A DataFrame with a row for each patch."""
-        return _frame(
+        return frame(
             {
                 **_plain(p),
                 **p.device,
@@ -326,7 +326,7 @@ class Comparison(Result):
 
     def to_pandas(self) -> Any:
         """A DataFrame with a row for each pair."""
-        return _frame(
+        return frame(
             {
                 **_plain(p, "reference", "sample", "delta_e", "corrected"),
                 **p.delta_e,
@@ -429,7 +429,7 @@ class Predictions(Result):
 
     def to_pandas(self) -> Any:
         """A DataFrame with a row for each prediction and model."""
-        return _frame(
+        return frame(
             {
                 "inks": " + ".join(f"{ink.name} {ink.percent} %" for ink in prediction.inks),
                 "model": model,
