@@ -94,9 +94,10 @@ class Declared:
         for value, last, spectral in zip(args, self.last, self.spectral):
             kind = type(value)
             if kind is np.ndarray:
-                if value.dtype is not _DOUBLE or value.shape[-1:] != last:
+                shape = value.shape
+                if value.dtype is not _DOUBLE or shape != last and shape[-1:] != last:
                     return None
-                if spectral and not percent and value.size:
+                if spectral and not percent and 0 not in shape:
                     percent = value.item(0) > FRACTION or value.item(-1) > FRACTION
                 key.append(_HANDED_ON)
             elif kind is str or kind is int or value is None:
