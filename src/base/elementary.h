@@ -229,13 +229,14 @@ template <class V> V root_of_normal(V x, double y, V down)
 
 template <class V> V near_cube_root(V x, double y)
 {
-    if (!any(!is_normal(x))) [[likely]]
-        return root_of_normal(x, y, V(0));
-    const auto subnormal = (x > 0) & (x < kLeastNormal);
-    const V root =
-        root_of_normal(select(subnormal, x * 0x1p54, x), y, select(subnormal, V(54), V(0)));
-    return select(is_normal(x) | subnormal, root,
-                  select((x == 0) | (abs(x) == kInfinity), abs(x), V(kNan)));
+    if (any(!is_normal(x))) [[unlikely]] {
+        const auto subnormal = (x > 0) & (x < kLeastNormal);
+        const V root =
+            root_of_normal(select(subnormal, x * 0x1p54, x), y, select(subnormal, V(54), V(0)));
+        return select(is_normal(x) | subnormal, root,
+                      select((x == 0) | (abs(x) == kInfinity), abs(x), V(kNan)));
+    }
+    return root_of_normal(x, y, V(0));
 }
 
 // Angles: x = k pi/2 + r, r in two doubles, and the sine and the cosine of r (Ng, fdlibm 1993).

@@ -11,8 +11,8 @@ inline constexpr double kLinearLimit = 0.008856; ///< up to this ratio the cube 
 inline constexpr double kRootSlope = 7.787;
 inline constexpr double kLightnessSlope = 903.292; ///< 116 · 7.787
 
-/// t^0.3333333333, in line: an L*a*b* has three of them side by side.
-template <class V> V cube_root(V t) { return elementary::near_cube_root(t, 0.3333333333); }
+/// t^0.3333333333.
+template <class V> V cube_root(V t) { return near_cube_root(t, 0.3333333333); }
 
 /// The function f of CIE 15.
 template <class V> V lab_root(V t)
