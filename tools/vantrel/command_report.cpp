@@ -3,11 +3,10 @@
 #include "judge/report.h"
 #include "options.h"
 #include "progress.h"
+#include "system.h"
 
 #include <cmath>
-#include <filesystem>
 #include <memory>
-#include <system_error>
 
 namespace vantrel::program {
 namespace {
@@ -32,8 +31,7 @@ SecondPaper second_paper_of(const ReportOptions &options)
     for (std::size_t colon = text.rfind(':'); colon != std::string::npos && colon > 0;
          colon = text.rfind(':', colon - 1)) {
         const std::string path = text.substr(0, colon);
-        std::error_code error;
-        if (std::filesystem::is_regular_file(path, error))
+        if (is_regular_file(path))
             return {sheet_of(path, options, true), text.substr(colon + 1)};
     }
     return {std::nullopt, text};

@@ -7,15 +7,14 @@
 #include "output_file.h"
 #include "progress.h"
 #include "read/text.h"
+#include "system.h"
 
 #include <fmt/format.h>
 
-#include <csignal>
 #include <cstdio>
 #include <exception>
 #include <new>
 #include <sstream>
-#include <unistd.h>
 
 using namespace vantrel::program;
 
@@ -62,7 +61,7 @@ Outcome run(CLI::App &app, int count, char **words)
 void write(const Outcome &outcome)
 {
     OutputFile file(outcome.output);
-    const bool on_terminal = outcome.output.empty() && isatty(STDOUT_FILENO) != 0;
+    const bool on_terminal = outcome.output.empty() && is_terminal(Stream::output);
     outcome.write(
         {[&](std::string_view text) { file.write(text); }, on_terminal ? Tell() : progress_bar()});
     file.finish();
@@ -96,9 +95,8 @@ int exit_status(int count, char **words)
 
 int main(int count, char **words)
 {
-    for (const int signal : {SIGPIPE, SIGXFSZ}) // a lost reader, a limit: errors of writing
-        static_cast<void>(std::signal(signal, SIG_IGN));
     try {
+        prepare(words);
         return exit_status(count, words);
     } catch (const std::bad_alloc &) {
         static_cast<void>(std::fputs("vantrel: not enough memory\n", stderr));

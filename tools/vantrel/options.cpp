@@ -5,13 +5,13 @@
 #include "progress.h"
 #include "read/reader.h"
 #include "read/text.h"
+#include "system.h"
 
 #include <fmt/format.h>
 
 #include <cstdio>
 #include <cstdlib>
 #include <optional>
-#include <unistd.h>
 
 namespace vantrel::program {
 void add_common_options(CLI::App &command, Options &options)
@@ -125,7 +125,7 @@ bool shows_colour(const Options &options)
 {
     const char *terminal = std::getenv("TERM");
     const char *no_color = std::getenv("NO_COLOR");
-    return !options.no_color && options.output.empty() && isatty(STDOUT_FILENO) &&
+    return !options.no_color && options.output.empty() && is_terminal(Stream::output) &&
            !(no_color && *no_color) && !(terminal && std::string_view(terminal) == "dumb");
 }
 

@@ -1,11 +1,12 @@
 #include "progress.h"
 
+#include "system.h"
+
 #include <fmt/format.h>
 
 #include <chrono>
 #include <cstdio>
 #include <string>
-#include <unistd.h>
 
 namespace vantrel::program {
 namespace {
@@ -28,7 +29,7 @@ void print(const std::string &text)
 
 sheets::Tell progress_bar()
 {
-    if (isatty(STDERR_FILENO) == 0)
+    if (!is_terminal(Stream::error))
         return {};
     static const Clock::time_point begin = Clock::now();
     return [](const char *what, double share) {
