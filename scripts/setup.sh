@@ -2,7 +2,7 @@
 
 cd "$(dirname "${BASH_SOURCE[0]}")/.."
 
-build_packages=(cmake ninja-build g++ pkg-config
+build_packages=(cmake ninja-build g++ pkg-config python3
     libcli11-dev libeigen3-dev libfmt-dev nlohmann-json3-dev libpugixml-dev libtomlplusplus-dev)
 fuzz_packages=(clang libclang-rt-14-dev)
 page_packages=(npm)

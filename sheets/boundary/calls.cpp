@@ -359,6 +359,7 @@ std::string compare(const Measurement &reference, const Measurement &sample,
         .tolerance = tolerance_of(given),
         .tolerances = tolerances_of(given),
         .substrate_corrected = given.flag("substrate_corrected"),
+        .advice = given.flag("advice"),
         .paper = given.text("paper"),
         .tell = tell,
     };

@@ -76,7 +76,8 @@ VANTREL_SHEETS_API const char *vantrel_patch_id(const VantrelSheet *sheet, size_
  * - report: n_factor, order (a list), second_paper, second_illuminant
  * - compare: pair (auto, name, id, device, order), force_pairs, repeats (mean, each),
  *   allow_missing, formula (a list), weights ({"cmc": [2, 1]}), second_illuminant, words (ab, hue),
- *   tolerance, tolerances (TOML text), tolerances_name (where it has none), substrate_corrected
+ *   tolerance, tolerances (TOML text), tolerances_name (where it has none), substrate_corrected,
+ *   advice
  * - run: order (a list), tolerances, tolerances_name, unread (a list of reasons: sheets that the
  *   host could not open)
  * - predict: order (a list), ink ([["Magenta 100", 40], ["Cyan 100", 7]])

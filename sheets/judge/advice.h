@@ -23,8 +23,9 @@ struct Advice {
 
 // How far the model can be trusted.
 inline constexpr std::string_view kAdviceFrom =
-    "Film model. On measured tint ramps its change was within 0.02 or 11 % of the right one where "
-    "it came to ΔE00 2 of the aim, and off by up to 0.6 where it did not.";
+    "Film model: on measured ramps its change was within 0.02 of the right one where it came to "
+    "ΔE00 2 of the aim,";
+inline constexpr std::string_view kAdviceElse = "and off by up to 0.6 where it did not.";
 
 // "more ink", "less ink", "on its aim", or why ink does not bring it there.
 std::string_view words_of(const Advice &advice);
@@ -32,6 +33,7 @@ std::string_view words_of(const Advice &advice);
 struct SolidAdvice {
     std::string ink;
     Advice advice;
+    std::string patch{}; // the solid; empty for the mean of its zones
 };
 
 // The film of this ink on this paper that comes nearest to the aim, between half and twice as thick

@@ -2,6 +2,7 @@
 
 #include "judge/control.h"
 #include "judge/densitometer.h"
+#include "judge/inks.h"
 #include "judge/repeats.h"
 #include "judge/substrate.h"
 #include "read/text.h"
@@ -9,6 +10,7 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <cmath>
 #include <map>
 #include <tuple>
 #include <utility>
@@ -323,6 +325,80 @@ void warn_of_exchanged(Comparison &out)
         }
 }
 
+// The tone scale of each ink; of patches of one nominal value the first.
+std::vector<ToneStep> tones_of(const std::vector<ControlPatch> &controls)
+{
+    std::map<std::pair<std::string, double>, ToneStep> steps;
+    for (const ControlPatch &control : controls)
+        if (control.inks.size() == 1 && control.inks[0].second < 100 && control.gain) {
+            const auto &[ink, nominal] = control.inks[0];
+            steps.try_emplace({ink, nominal},
+                              ToneStep{ink, nominal,
+                                       control.aim_gain ? std::optional(nominal + *control.aim_gain)
+                                                        : std::nullopt,
+                                       nominal + *control.gain});
+        }
+    std::vector<ToneStep> out;
+    for (auto &[key, step] : steps)
+        out.push_back(std::move(step));
+    return out;
+}
+
+std::optional<double> neutral_density(const Sheet &sheet, const Side &side, int status)
+{
+    if (!side.refl || !sheet.paper.choice.exists())
+        return std::nullopt;
+    // The statuses of wavelengths have no visual filter.
+    const bool filters = status != SPECTRAL_STATUS && status != SPECTRALX_STATUS;
+    return Densitometer(sheet.paper.refl, filters ? status : E_STATUS)
+        .density(*side.refl, VISUAL_RESPONSE);
+}
+
+std::vector<GreyStep> greys_of(const std::vector<PairReport> &pairs,
+                               const std::vector<ControlPatch> &controls, const Sheet &references,
+                               const Sheet &samples, int status)
+{
+    std::map<std::pair<bool, double>, GreyStep> steps;
+    for (std::size_t i = 0; i < pairs.size(); ++i) {
+        const ControlPatch &control = controls[i];
+        const bool black = control.inks.size() == 1 && control.inks[0].first == "CMYK_K";
+        if (!black && !is_neutral(control))
+            continue;
+        const double nominal =
+            black ? control.inks[0].second
+                  : std::find_if(control.inks.begin(), control.inks.end(), [](const auto &ink) {
+                        return ink.first == "CMYK_C";
+                    })->second;
+        const CIELABCOORD &aim = control.aim, &lab = control.lab;
+        steps.try_emplace({black, nominal},
+                          GreyStep{black, nominal, control.name,
+                                   std::hypot(lab.a - aim.a, lab.b - aim.b), lab.L - aim.L,
+                                   neutral_density(references, pairs[i].reference, status),
+                                   neutral_density(samples, pairs[i].sample, status)});
+    }
+    std::vector<GreyStep> out;
+    for (auto &[key, step] : steps)
+        out.push_back(std::move(step));
+    return out;
+}
+
+std::vector<SolidAdvice> advice_of(const std::vector<PairReport> &pairs,
+                                   const std::vector<ControlPatch> &controls, const Sheet &samples,
+                                   const Terms &terms)
+{
+    require_paper(samples.paper.choice, samples.measurement.file, "--advice");
+    std::vector<SolidAdvice> out;
+    for (std::size_t i = 0; i < pairs.size(); ++i) {
+        const ControlPatch &control = controls[i];
+        if (control.inks.size() != 1 || control.inks[0].second != 100 || !pairs[i].sample.refl)
+            continue;
+        if (const auto advice = advise(*pairs[i].sample.refl, samples.paper.refl, control.aim,
+                                       terms.illuminant, terms.request.status))
+            out.push_back({ink_title(control.inks[0].first), *advice, control.name});
+    }
+    return out;
+}
+
 Coverage coverage_of(const Pairs &pairs, const Measurement &reference, const Measurement &sample,
                      bool allow_missing)
 {
@@ -372,6 +448,9 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
                    .tolerances = request.tolerances.name,
                    .limits = {},
                    .corrected = {},
+                   .tones = {},
+                   .greys = {},
+                   .advice = {},
                    .warnings = std::move(warnings),
                    .verdict = {}};
     for (const auto &[sheet, alone] :
@@ -389,6 +468,14 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
     warn_of_papers(out);
     const std::vector<ControlPatch> controls = control_patches(
         out.pairs, references.paper, samples.paper, request.status, reference.collection);
+    out.tones = tones_of(controls);
+    out.greys = greys_of(out.pairs, controls, references, samples, request.status);
+    if (request.advice)
+        out.advice = advice_of(out.pairs, controls, samples, terms);
+    if (request.advice && out.advice.empty())
+        out.warnings.push_back(
+            fmt::format("{}: no solid of one ink has a spectrum and an aim, so there is no advice",
+                        sample.file));
     out.statistics = all_statistics(out.pairs, &PairReport::delta_e);
     out.above = count_above(out.pairs, &PairReport::delta_e, request.tolerance);
     out.reference_means = means_of(out.pairs, &PairReport::reference);

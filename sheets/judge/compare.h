@@ -1,6 +1,7 @@
 // What `vantrel compare` says about a sample beside its reference.
 #pragma once
 
+#include "judge/advice.h"
 #include "judge/formulas.h"
 #include "judge/left_out.h"
 #include "judge/limits.h"
@@ -29,7 +30,8 @@ struct CompareRequest {
     std::optional<double> tolerance;
     Tolerances tolerances; // none where it has no limits
     bool substrate_corrected = false;
-    std::string paper; // of both sheets, as paper_of() takes it
+    bool advice = false; // for the solids of the sample
+    std::string paper;   // of both sheets, as paper_of() takes it
     Tell tell{};
 };
 
@@ -55,6 +57,22 @@ struct Means {
 struct PaperDifference {
     double de00 = 0;
     std::optional<double> metamerism; // missing where a side has no spectra
+};
+
+// Dot areas of a tint of one ink, or of its solid, beside those of its aim.
+struct ToneStep {
+    std::string ink; // device field
+    double nominal;
+    std::optional<double> aim, area; // in percent; missing where there is no density
+};
+
+// A patch of the scale of cyan, magenta and yellow, or of that of black.
+struct GreyStep {
+    bool black;
+    double nominal; // of cyan, or of black
+    std::string name;
+    double delta_ch, delta_l;                   // from the aim
+    std::optional<double> aim_density, density; // visual, over the paper
 };
 
 struct Unpaired {
@@ -97,6 +115,9 @@ struct Comparison {
     std::string tolerances; // their name
     std::vector<LimitResult> limits;
     std::optional<SubstrateCorrected> corrected;
+    std::vector<ToneStep> tones; // by ink and nominal value
+    std::vector<GreyStep> greys; // from light to dark, first of cyan, magenta and yellow
+    std::vector<SolidAdvice> advice;
     std::vector<std::string> warnings;
     std::optional<Verdict> verdict; // nothing where there is neither a tolerance nor a limit
 };

@@ -5,8 +5,46 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <array>
+#include <numeric>
+#include <utility>
 
 namespace vantrel::sheets {
+namespace {
+
+constexpr std::array<std::pair<std::string_view, std::string_view>, 4> kProcessInks = {{
+    {"CMYK_C", "Cyan"},
+    {"CMYK_M", "Magenta"},
+    {"CMYK_Y", "Yellow"},
+    {"CMYK_K", "Black"},
+}};
+
+// "40", "40 %"
+std::optional<double> percent_in(std::string_view name)
+{
+    if (name.ends_with('%'))
+        name.remove_suffix(1);
+    while (name.ends_with(' '))
+        name.remove_suffix(1);
+    const auto percent = number_in(name);
+    return percent && *percent >= 0 && *percent <= 100 ? percent : std::nullopt;
+}
+
+} // namespace
+
+std::string ink_title(const std::string &field)
+{
+    for (const auto &[name, title] : kProcessInks)
+        if (name == field)
+            return std::string(title);
+    return field;
+}
+
+bool is_process_ink(const std::string &title)
+{
+    return std::any_of(kProcessInks.begin(), kProcessInks.end(),
+                       [&](const auto &ink) { return ink.second == title; });
+}
 
 Inks::Inks(const Measurement &sheet, const std::vector<std::string> &order) : sheet(sheet)
 {
@@ -16,6 +54,11 @@ Inks::Inks(const Measurement &sheet, const std::vector<std::string> &order) : sh
                 numbers.emplace(field, fields.size());
                 fields.push_back(field);
             }
+    if (fields.empty() && names_are_tints()) {
+        ramp = true;
+        numbers.emplace("ink", 0);
+        fields.emplace_back("ink");
+    }
 
     std::vector<std::size_t> sequence;
     for (const std::string &name : order) {
@@ -42,8 +85,36 @@ Inks::Inks(const Measurement &sheet, const std::vector<std::string> &order) : sh
             solids[*ink] = &patch;
 }
 
+bool Inks::names_are_tints() const
+{
+    if (sheet.kind != Kind::reflectance || !sheet.named || sheet.patches.size() < 3)
+        return false;
+    std::map<double, double> light; // mean reflectance by percentage
+    for (const Patch &patch : sheet.patches) {
+        const auto percent = percent_in(patch.name);
+        if (!percent)
+            return false;
+        light[*percent] = std::accumulate(patch.refl.begin(), patch.refl.end(), 0.0) /
+                          static_cast<double>(patch.refl.size());
+    }
+    if (light.begin()->first != 0 || light.rbegin()->first != 100)
+        return false;
+    const double noise = 0.03 * (light.begin()->second - light.rbegin()->second);
+    double before = light.begin()->second;
+    for (const auto &[percent, mean] : light) {
+        if (mean > before + noise)
+            return false;
+        before = mean;
+    }
+    return noise > 0;
+}
+
 std::optional<Tints> Inks::tints_of(const Patch &patch) const
 {
+    if (ramp) {
+        const double percent = percent_in(patch.name).value_or(0);
+        return percent > 0 ? Tints{{0, percent}} : Tints{};
+    }
     if (fields.empty() || patch.device.empty())
         return std::nullopt;
     Tints tints;

@@ -25,14 +25,22 @@ struct Tint {
 };
 using Tints = std::vector<Tint>; // in the order of printing; empty for bare paper
 
+std::string ink_title(const std::string &field); // Magenta of CMYK_M; else the field itself
+bool is_process_ink(const std::string &title);   // cyan, magenta, yellow or black
+
 class Inks {
 public:
+    // Patches without device values that are named by percentages alone, from 0 to 100, and darken
+    // with them are the ramp of one ink.
+    //
     // Inks print in the order of the file's device fields, after those that `order` names by field
     // or by solid; throws RequestError.
     Inks(const Measurement &sheet, const std::vector<std::string> &order);
 
     // The device fields in the order of printing.
     const std::vector<std::string> &names() const { return fields; }
+
+    bool is_ramp() const { return ramp; }
 
     // Nothing where the patch has no device values, or they are no inks or not from 0 to 100.
     std::optional<Tints> tints_of(const Patch &patch) const;
@@ -49,7 +57,10 @@ public:
     std::optional<std::size_t> named(std::string_view name) const;
 
 private:
+    bool names_are_tints() const;
+
     const Measurement &sheet;
+    bool ramp = false; // by the names of the patches
     std::vector<std::string> fields;
     std::map<std::string, std::size_t> numbers; // of the fields, in the order of printing
     std::vector<const Patch *> solids;          // the first of each ink, null where there is none

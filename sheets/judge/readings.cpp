@@ -18,13 +18,6 @@
 namespace vantrel::sheets {
 namespace {
 
-constexpr std::array<std::pair<std::string_view, std::string_view>, 4> kProcessInks = {{
-    {"CMYK_C", "Cyan"},
-    {"CMYK_M", "Magenta"},
-    {"CMYK_Y", "Yellow"},
-    {"CMYK_K", "Black"},
-}};
-
 struct Row {
     Attribute attribute;
     std::string_view key, title;
@@ -308,20 +301,6 @@ void add_statistics(std::vector<ZoneReading> &readings, const AllPrinted &all,
 }
 
 } // namespace
-
-std::string ink_title(const std::string &field)
-{
-    for (const auto &[name, title] : kProcessInks)
-        if (name == field)
-            return std::string(title);
-    return field;
-}
-
-bool is_process_ink(const std::string &title)
-{
-    return std::any_of(kProcessInks.begin(), kProcessInks.end(),
-                       [&](const auto &ink) { return ink.second == title; });
-}
 
 std::string_view key_of(Attribute attribute) { return row_of(attribute).key; }
 

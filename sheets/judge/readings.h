@@ -2,6 +2,7 @@
 #pragma once
 
 #include "judge/compare.h"
+#include "judge/inks.h"
 #include "read/measurement.h"
 
 #include <map>
@@ -54,9 +55,6 @@ struct ZoneReading {
 
     friend bool operator==(const ZoneReading &, const ZoneReading &) = default;
 };
-
-std::string ink_title(const std::string &field); // Magenta of CMYK_M; else the field itself
-bool is_process_ink(const std::string &title);   // cyan, magenta, yellow or black
 
 struct SheetReadings {
     std::vector<ZoneReading> readings;

@@ -1,10 +1,13 @@
 #include "judge/report.h"
 
+#include "judge/compare.h"
 #include "judge/densitometer.h"
 #include "judge/names.h"
+#include "judge/tone_value.h"
 
 #include <fmt/format.h>
 
+#include <algorithm>
 #include <map>
 #include <utility>
 
@@ -18,9 +21,12 @@ double gain_of(double dot_area, double nominal)
 }
 
 void measure_tint(PatchReport &row, const Patch &patch, const Patch &solid, double nominal,
-                  const Densitometer &densitometer, double n_factor)
+                  const Conditions &conditions, const Densitometer &densitometer)
 {
-    row.dot_area = densitometer.dot_area(solid.refl, patch.refl, n_factor);
+    const ILLUM_OBS illuminant = conditions.illuminant;
+    row.sctv = spot_colour_tone_value(lab_of(conditions.paper, illuminant),
+                                      lab_of(solid.refl, illuminant), row.colour.lab);
+    row.dot_area = densitometer.dot_area(solid.refl, patch.refl, conditions.n_factor);
     if (row.dot_area)
         row.dot_gain = gain_of(*row.dot_area, nominal);
     if (nominal >= 75 && nominal <= 80)
@@ -28,9 +34,10 @@ void measure_tint(PatchReport &row, const Patch &patch, const Patch &solid, doub
 }
 
 // The attributes that need to know with which inks the patch was printed.
-void measure_inks(PatchReport &row, const Patch &patch, const Inks &inks,
-                  const Densitometer &densitometer, double n_factor)
+void measure_inks(PatchReport &row, const Patch &patch, const Conditions &conditions,
+                  const Densitometer &densitometer)
 {
+    const Inks &inks = conditions.inks;
     const auto tints = inks.tints_of(patch);
     if (!tints)
         return;
@@ -41,7 +48,7 @@ void measure_inks(PatchReport &row, const Patch &patch, const Inks &inks,
         }
     } else if (tints->size() == 1) {
         if (const Patch *solid = inks.solid((*tints)[0].ink))
-            measure_tint(row, patch, *solid, (*tints)[0].percent, densitometer, n_factor);
+            measure_tint(row, patch, *solid, (*tints)[0].percent, conditions, densitometer);
     } else if (tints->size() == 2 && (*tints)[0].percent == 100 && (*tints)[1].percent == 100) {
         const Patch *first = inks.solid((*tints)[0].ink);
         const Patch *second = inks.solid((*tints)[1].ink);
@@ -79,13 +86,14 @@ std::vector<ToneCurve> tone_curves(const Inks &inks, const std::vector<PatchRepo
 {
     std::vector<std::map<double, ToneValue>> sums(inks.names().size());
     for (const PatchReport &row : rows) {
-        if (!row.dot_area)
+        if (!row.dot_area || !row.sctv)
             continue;
         const Tint tint = inks.tints_of(*row.patch)->front(); // the only one
         ToneValue &sum = sums[tint.ink].try_emplace(tint.percent).first->second;
         sum.nominal = tint.percent;
         sum.dot_area += *row.dot_area;
         sum.dot_gain += *row.dot_gain;
+        sum.sctv += *row.sctv;
         ++sum.patches;
     }
     std::vector<ToneCurve> curves;
@@ -95,9 +103,11 @@ std::vector<ToneCurve> tone_curves(const Inks &inks, const std::vector<PatchRepo
         ToneCurve &curve = curves.emplace_back();
         curve.ink = inks.names()[ink];
         curve.solid = inks.solid(ink)->name;
+        curve.spot = !is_process_ink(ink_title(curve.ink));
         for (auto &[nominal, sum] : sums[ink]) {
             sum.dot_area /= static_cast<double>(sum.patches);
             sum.dot_gain /= static_cast<double>(sum.patches);
+            sum.sctv /= static_cast<double>(sum.patches);
             curve.values.push_back(sum);
         }
     }
@@ -124,7 +134,7 @@ PatchReport patch_report(const Patch &patch, const Conditions &conditions)
     row.response = reading.response;
     row.density = reading.density;
     if (paper.choice.exists())
-        measure_inks(row, patch, conditions.inks, densitometer, conditions.n_factor);
+        measure_inks(row, patch, conditions, densitometer);
     return row;
 }
 
@@ -155,6 +165,28 @@ PaperReport paper_report(const Paper &paper, ILLUM_OBS illuminant)
     return out;
 }
 
+namespace {
+
+// For the solids, by the mean of the patches of each, as compare() gives it.
+void add_advice(Report &report, const ReportRequest &request)
+{
+    CompareRequest beside;
+    beside.pairing.zones = true;
+    beside.metrics = {usual_metric(Formula::de2000)};
+    beside.illuminant = report.illuminant.illuminant;
+    beside.status = request.status;
+    beside.paper = request.paper;
+    beside.advice = true;
+    Comparison comparison = compare(*request.aims, *report.sheet, beside);
+    report.advice = std::move(comparison.advice);
+    for (std::string &warning : comparison.warnings)
+        if (std::find(report.warnings.begin(), report.warnings.end(), warning) ==
+            report.warnings.end())
+            report.warnings.push_back(std::move(warning));
+}
+
+} // namespace
+
 Report report_of(Measurement measurement, const ReportRequest &request)
 {
     const auto kept = std::make_shared<const Measurement>(std::move(measurement));
@@ -175,6 +207,7 @@ Report report_of(Measurement measurement, const ReportRequest &request)
                   .metamerism = std::move(metamerism),
                   .patches = {},
                   .tone_curves = {},
+                  .advice = {},
                   .warnings = std::move(warnings)};
     const Conditions conditions{sheet, inks, paper, illuminant, request.status, request.n_factor};
     const Work work{request.tell, "Measuring", sheet.patches.size()};
@@ -188,6 +221,11 @@ Report report_of(Measurement measurement, const ReportRequest &request)
         densities.push_back(patch.density);
     warn_of_paper(sheet.file, paper.choice, densities, report.warnings);
     report.tone_curves = tone_curves(inks, report.patches);
+    if (inks.is_ramp())
+        report.warnings.push_back(fmt::format(
+            "{}: the names of the patches are taken for the percentages of one ink", sheet.file));
+    if (request.aims)
+        add_advice(report, request);
     return report;
 }
 

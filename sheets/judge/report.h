@@ -1,6 +1,7 @@
 // What a sheet says: its patches, inks and paper.
 #pragma once
 
+#include "judge/advice.h"
 #include "judge/colour.h"
 #include "judge/inks.h"
 #include "judge/left_out.h"
@@ -26,6 +27,7 @@ struct ReportRequest {
     std::string second_paper;
     const Measurement *second_sheet = nullptr;
     std::optional<ILLUM_OBS> second_illuminant; // the usual one where it is empty
+    const Measurement *aims = nullptr;          // of the solids, for advice
     Tell tell{};
 };
 
@@ -39,6 +41,7 @@ struct PatchReport {
     std::optional<int> response;               // the one that reads this patch
     std::optional<double> density;             // in it, over the paper, absolute without one
     std::optional<double> dot_area, dot_gain;  // of a tint of one ink
+    std::optional<double> sctv;                // the same by ISO 20654
     std::optional<double> print_contrast;      // of a tint of 75 to 80 %
     std::optional<double> hue_error, grayness; // of a solid
     std::optional<double> trap;                // of an overprint of two solids
@@ -67,6 +70,7 @@ struct ToneValue {
     double nominal;
     double dot_area;
     double dot_gain;
+    double sctv;
     std::size_t patches;
 };
 
@@ -74,6 +78,7 @@ struct ToneValue {
 struct ToneCurve {
     std::string ink; // device field
     std::string solid;
+    bool spot; // its tone values are by ISO 20654, not by density
     std::vector<ToneValue> values;
 };
 
@@ -88,6 +93,7 @@ struct Report {
     std::vector<PatchReport> patches;
     LeftOut left_out;                   // by choose_for_page()
     std::vector<ToneCurve> tone_curves; // of the inks that have measured tints
+    std::vector<SolidAdvice> advice;    // where there are aims
     std::vector<std::string> warnings;
 };
 

@@ -181,8 +181,10 @@ void RunJudge::add(const Measurement &sheet)
         beside.status = request.status;
         beside.tolerances = request.tolerances;
         beside.paper = request.paper;
+        // Before the entry: GCC 12 destroys twice what an aggregate holds when a member throws.
+        SheetReadings readings = readings_of(aims, sheet, beside, request.order);
         Entry entry{.sheet = {.file = sheet.file, .created = sheet.origin.created},
-                    .readings = readings_of(aims, sheet, beside, request.order),
+                    .readings = std::move(readings),
                     .origin = sheet.origin,
                     .condition = sheet.source.condition};
         entry.sheet.coverage = entry.readings.coverage;
@@ -328,7 +330,7 @@ void RunJudge::add_advice(Run &run) const
     const SheetReadings &last = entries.back().readings;
     for (const auto &[ink, solid, aim] : last.solids)
         if (const auto advice = advise(solid, last.paper, aim, *illuminant, request.status))
-            run.advice.push_back({ink, *advice});
+            run.advice.push_back({ink, *advice, {}});
 }
 
 // Sheets of one run are of one job, read by one instrument in one way, and no two are one.

@@ -83,6 +83,24 @@ void add_means(Lines &lines, const std::string &file, const std::optional<Means>
                               means->repeats, fixed(means->spread)));
 }
 
+// Tone values of the inks, and the scales of greys.
+void add_scales(Lines &lines, const Comparison &comparison)
+{
+    if (!comparison.tones.empty())
+        lines.add(
+            fmt::format("\n{:<22}{:>8}{:>8}{:>8}", "Tone values", "nominal", "aim", "sample"));
+    for (const ToneStep &step : comparison.tones)
+        lines.add(fmt::format("{:<22}{:>8g}{:>8}{:>8}", cut(step.ink, 21), step.nominal,
+                              fixed(step.aim), fixed(step.area)));
+    if (!comparison.greys.empty())
+        lines.add(fmt::format("\n{:<22}{:>8}{:>8}{:>8}{:>8}{:>8}", "Grey scales", "nominal", "ΔCh",
+                              "ΔL*", "D aim", "D"));
+    for (const GreyStep &step : comparison.greys)
+        lines.add(fmt::format("{:<22}{:>8g}{:>8}{:>8}{:>8}{:>8}", step.black ? "K" : "CMY",
+                              step.nominal, fixed(step.delta_ch), fixed(step.delta_l),
+                              fixed(step.aim_density, 3), fixed(step.density, 3)));
+}
+
 void add_unpaired(Lines &lines, const std::string &file, const std::vector<Unpaired> &unpaired)
 {
     if (unpaired.empty())
@@ -236,6 +254,25 @@ Json statistics_json(const Comparison &comparison, const std::vector<Statistics>
     return out;
 }
 
+void add_scales(Json &head, const Comparison &comparison)
+{
+    Json tones = Json::array(), greys = Json::array();
+    for (const ToneStep &step : comparison.tones)
+        tones.push_back({{"ink", step.ink},
+                         {"nominal", step.nominal},
+                         {"reference", or_null(step.aim)},
+                         {"sample", or_null(step.area)}});
+    for (const GreyStep &step : comparison.greys)
+        greys.push_back({{"scale", step.black ? "K" : "CMY"},
+                         {"nominal", step.nominal},
+                         {"name", step.name},
+                         {"delta_ch", step.delta_ch},
+                         {"delta_l", step.delta_l},
+                         {"reference_density", or_null(step.aim_density)},
+                         {"density", or_null(step.density)}});
+    head.update({{"tone_values", tones}, {"greys", greys}});
+}
+
 Json corrected_json(const Comparison &comparison)
 {
     if (!comparison.corrected)
@@ -277,6 +314,8 @@ void write_table(const Comparison &comparison, const Sink &sink, const TableStyl
         lines.add(
             fmt::format("\nBetween the papers: ΔE00 {}{}", fixed(papers->de00),
                         papers->metamerism ? ", metamerism " + fixed(papers->metamerism) : ""));
+    add_scales(lines, comparison);
+    add_advice(lines, "Advice for the solids", comparison.advice);
     add_means(lines, comparison.reference, comparison.reference_means);
     add_means(lines, comparison.sample, comparison.sample_means);
     add_unpaired(lines, comparison.reference, comparison.only_reference);
@@ -329,6 +368,9 @@ void write_json(const Comparison &comparison, const Sink &sink)
          {{"reference", names_json(comparison.only_reference)},
           {"sample", names_json(comparison.only_sample)}}},
     };
+    add_scales(head, comparison);
+    if (!comparison.advice.empty())
+        add_advice(head, comparison.advice);
     add_left_out(head, comparison.left_out);
     write_with_array(
         head, "pairs", comparison.pairs.size(),

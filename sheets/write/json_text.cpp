@@ -23,7 +23,7 @@ void add_reading(Json &object, const DensityReading &reading, int status)
 Json patch_json(const PatchReport &patch, int status)
 {
     Json::object_t out;
-    out.reserve(18);
+    out.reserve(19);
     const auto add = [&out](const char *name, Json value) {
         out.emplace_back(name, std::move(value));
     };
@@ -42,6 +42,7 @@ Json patch_json(const PatchReport &patch, int status)
     add("density", or_null(patch.density));
     add("dot_area", or_null(patch.dot_area));
     add("dot_gain", or_null(patch.dot_gain));
+    add("sctv", or_null(patch.sctv));
     add("print_contrast", or_null(patch.print_contrast));
     add("hue_error", or_null(patch.hue_error));
     add("grayness", or_null(patch.grayness));
@@ -53,15 +54,18 @@ Json patch_json(const PatchReport &patch, int status)
 void add_advice(Json &object, const std::vector<SolidAdvice> &advice)
 {
     Json rows = Json::array();
-    for (const auto &[ink, one] : advice)
+    for (const auto &[ink, one, patch] : advice) {
         rows.push_back({{"ink", ink},
                         {"de00", one.de00},
                         {"density_change", one.density_change},
                         {"de00_after", one.de00_after},
                         {"words", words_of(one)}});
+        if (!patch.empty())
+            rows.back()["patch"] = patch;
+    }
     object["advice"] = rows;
     if (!advice.empty())
-        object["advice_from"] = kAdviceFrom;
+        object["advice_from"] = fmt::format("{} {}", kAdviceFrom, kAdviceElse);
 }
 
 void add_left_out(Json &object, const LeftOut &left_out)

@@ -136,7 +136,8 @@ void add_tone_values(Lines &lines, const Report &report)
         std::map<double, std::vector<const ToneValue *>> rows;
         for (std::size_t ink = first; ink < end; ++ink) {
             inks += fmt::format("{:>16}", cut(curves[ink].ink, 14));
-            head += fmt::format("{:>9}{:>7}", "area", "gain");
+            head += fmt::format("{:>9}{:>7}", curves[ink].spot ? "SCTV" : "area",
+                                curves[ink].spot ? "area" : "gain");
             for (const ToneValue &value : curves[ink].values) {
                 auto &row = rows[value.nominal];
                 row.resize(end - first);
@@ -147,10 +148,14 @@ void add_tone_values(Lines &lines, const Report &report)
         lines.add(head);
         for (const auto &[nominal, values] : rows) {
             std::string line = fmt::format("{:>11g}", nominal);
-            for (const ToneValue *value : values)
-                line += value ? fmt::format("{:>9}{:>7}", fixed(value->dot_area),
-                                            fixed(value->dot_gain))
-                              : fmt::format("{:>16}", "");
+            for (std::size_t i = 0; i < values.size(); ++i) {
+                const ToneValue *value = values[i];
+                const bool spot = curves[first + i].spot;
+                line += value
+                            ? fmt::format("{:>9}{:>7}", fixed(spot ? value->sctv : value->dot_area),
+                                          fixed(spot ? value->dot_area : value->dot_gain))
+                            : fmt::format("{:>16}", "");
+            }
             lines.add(line);
         }
     }
@@ -171,6 +176,7 @@ void write_table(const Report &report, Lines &lines, bool colour)
     add_block(lines, report, "Overprints", width, {{"trap", &PatchReport::trap}});
     add_block(lines, report, "Shadows", width, {{"contrast", &PatchReport::print_contrast}});
     add_tone_values(lines, report);
+    add_advice(lines, "Advice for the solids", report.advice);
     if (report.inks.size() > 1)
         lines.add(fmt::format("\nInks print in the order {}", fmt::join(report.inks, ", ")));
 }
@@ -208,8 +214,12 @@ Json tone_values_json(const Report &report)
             values.push_back({{"nominal", value.nominal},
                               {"dot_area", value.dot_area},
                               {"dot_gain", value.dot_gain},
+                              {"sctv", value.sctv},
                               {"patches", value.patches}});
-        out.push_back({{"ink", curve.ink}, {"solid", curve.solid}, {"values", values}});
+        out.push_back({{"ink", curve.ink},
+                       {"solid", curve.solid},
+                       {"tone_value", curve.spot ? "sctv" : "dot_area"},
+                       {"values", values}});
     }
     return out;
 }
@@ -240,6 +250,8 @@ void write_sheet(const Report &report, const Sink &sink)
         {"paper", paper_json(report)},
         {"tone_values", tone_values_json(report)},
     };
+    if (!report.advice.empty())
+        add_advice(head, report.advice);
     add_left_out(head, report.left_out);
     write_with_array(
         head, "patches", report.patches.size(),
@@ -290,6 +302,7 @@ Flat flat_of(const Report &report)
     flat.number("density", "DENSITY", [&patches](std::size_t i) { return patches[i].density; });
     flat.number("dot_area", "DOT_AREA", [&patches](std::size_t i) { return patches[i].dot_area; });
     flat.number("dot_gain", "DOT_GAIN", [&patches](std::size_t i) { return patches[i].dot_gain; });
+    flat.number("sctv", "SCTV", [&patches](std::size_t i) { return patches[i].sctv; });
     flat.number("print_contrast", "PRINT_CONTRAST",
                 [&patches](std::size_t i) { return patches[i].print_contrast; });
     flat.number("hue_error", "HUE_ERROR",

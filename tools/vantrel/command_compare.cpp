@@ -28,6 +28,7 @@ struct CompareOptions : Options {
     std::optional<double> tolerance;
     std::string tolerances; // a file
     bool substrate_corrected = false;
+    bool advice = false;
     bool all = false;
 };
 
@@ -90,6 +91,7 @@ Outcome run(const CompareOptions &options)
         .tolerance = options.tolerance,
         .tolerances = tolerances_of(options.tolerances),
         .substrate_corrected = options.substrate_corrected,
+        .advice = options.advice,
         .paper = options.paper,
         .tell = progress_bar(),
     };
@@ -183,6 +185,8 @@ Command add_compare(CLI::App &app)
                         "TOML file of limits by group of patches; examples/ has three");
     command->add_flag("--substrate-corrected", options->substrate_corrected,
                       "Judge too by aims that are moved to the sample's paper (ISO 13655)");
+    command->add_flag("--advice", options->advice,
+                      "Tell the density change that brings each solid nearest to its aim");
     command->add_flag("--all", options->all, "List every pair in the table, not the worst ten");
     command->footer(kFooter);
     return {command, [options] { return run(*options); }};

@@ -17,6 +17,7 @@ struct ReportOptions : Options {
     double n_factor = 1;
     std::string second_paper;      // none where it is empty
     std::string second_illuminant; // its default follows the first
+    std::string advice;            // file of the aims; none where it is empty
 };
 
 // NAME, or FILE:NAME where there is such a file.
@@ -42,6 +43,9 @@ Outcome run(const ReportOptions &options)
     if (!(options.n_factor > 0) || !std::isfinite(options.n_factor))
         throw RequestError{"--n-factor takes a number above 0"};
     const SecondPaper second = second_paper_of(options);
+    const std::optional<Measurement> aims =
+        options.advice.empty() ? std::nullopt
+                               : std::optional(sheet_of(options.advice, options, true));
     const ReportRequest request{
         .illuminant = optional_illuminant(options.illuminant),
         .status = status_of(options.status),
@@ -51,6 +55,7 @@ Outcome run(const ReportOptions &options)
         .second_paper = second.name,
         .second_sheet = second.sheet ? &*second.sheet : nullptr,
         .second_illuminant = optional_illuminant(options.second_illuminant),
+        .aims = aims ? &*aims : nullptr,
         .tell = progress_bar(),
     };
     std::vector<Report> sheets;
@@ -98,6 +103,9 @@ Command add_report(CLI::App &app)
     command->add_option("--second-illuminant", options->second_illuminant,
                         "Illuminant of that metamerism beside --illuminant (default: A_2DEG or "
                         "A_10DEG, beside these D65_2DEG or D65_10DEG)");
+    command->add_option("--advice", options->advice,
+                        "Measurement file of aims: tell the density change that brings each solid "
+                        "nearest to its aim");
     command->footer(kFooter);
     return {command, [options] { return run(*options); }};
 }

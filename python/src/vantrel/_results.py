@@ -34,9 +34,9 @@ def _refl(refl: Refl) -> Dict[int, float]:
 class PatchReport:
     """A patch of a report; what makes no sense for it is None.
 
-    `response` reads it, `density` is in that, over the paper; `dot_area` and `dot_gain` are those of
-    tints of one ink, `print_contrast` of those from 75 to 80 %, `hue_error` and `grayness` of solids,
-    `trap` of overprints of two solids, all in percent. `rgb` is the sRGB colour as "#rrggbb".
+    `response` reads it, `density` is in that, over the paper; `dot_area`, `dot_gain` and `sctv` (ISO
+    20654) are those of tints of one ink, `print_contrast` of those from 75 to 80 %, `hue_error` and
+    `grayness` of solids, `trap` of overprints of two solids, all in percent. `rgb` is the sRGB colour as "#rrggbb".
     """
 
     id: str
@@ -51,6 +51,7 @@ class PatchReport:
     density: Optional[float]
     dot_area: Optional[float]
     dot_gain: Optional[float]
+    sctv: Optional[float]
     print_contrast: Optional[float]
     hue_error: Optional[float]
     grayness: Optional[float]
@@ -91,15 +92,20 @@ class ToneValue:
     nominal: float
     dot_area: float
     dot_gain: float
+    sctv: float
     patches: int
 
 
 @dataclass(frozen=True)
 class ToneCurve:
-    """The tone values of an ink, a device field, over its solid, a patch."""
+    """The tone values of an ink, a device field, over its solid, a patch.
+
+    `tone_value` names the one that the program shows: "dot_area", or "sctv" of spot inks.
+    """
 
     ink: str
     solid: str
+    tone_value: str
     values: Tuple[ToneValue, ...]
 
 
@@ -289,6 +295,29 @@ class Means:
     spread: float
 
 
+@dataclass(frozen=True)
+class ToneStep:
+    """The dot areas of a tint of `ink`, in percent: of the aim and of the sample."""
+
+    ink: str
+    nominal: float
+    reference: Optional[float]
+    sample: Optional[float]
+
+
+@dataclass(frozen=True)
+class GreyStep:
+    """A patch of the `scale` "CMY" or "K": how far from its aim, and its visual densities."""
+
+    scale: str
+    nominal: float
+    name: str
+    delta_ch: float
+    delta_l: float
+    reference_density: Optional[float]
+    density: Optional[float]
+
+
 @dataclass(frozen=True, repr=False)
 class Comparison(Result):
     """What `vantrel compare` says of a sheet beside its aims.
@@ -320,6 +349,8 @@ class Comparison(Result):
     corrected: Optional[Corrected]
     statistics: Dict[str, Statistics]
     means: Dict[str, Optional[Means]]
+    tone_values: Tuple[ToneStep, ...]
+    greys: Tuple[GreyStep, ...]
     worst: Tuple[int, ...]
     unpaired: Dict[str, Tuple[str, ...]]
     pairs: Tuple[Pair, ...]

@@ -94,7 +94,8 @@ export function weightsPlot(curves) {
 // curves: [{ name, colour, points: [{ nominal, area, gain }, …] }, …]; what: 'area' or 'gain'
 export function tonePlot(curves, what) {
   const points = curves.flatMap((curve, z) =>
-    curve.points.map((point) => ({ ...point, z, name: curve.name, colour: curve.colour })));
+    curve.points.map((point) => ({ ...point, z, name: curve.name, colour: curve.colour,
+      dashed: curve.dashed })));
   const top = what === 'area' ? 100 : 10;
   const way = { x: 'nominal', y: what, z: 'z' };
   return (width) => ({
@@ -106,12 +107,32 @@ export function tonePlot(curves, what) {
     marks: [
       what === 'area'
         ? Plot.line([[0, 0], [100, 100]], { strokeDasharray: '3 3', strokeOpacity: 0.6 }) : null,
-      edged(points, way),
+      edged(points.filter((point) => !point.dashed), way, false),
+      edged(points.filter((point) => point.dashed), way, true),
       Plot.dot(points, { ...way, r: 3, fill: self('colour'), stroke: 'currentColor',
         strokeOpacity: 0.6 }),
       Plot.tip(points, Plot.pointer({ ...way, title: (point) =>
         `${point.name} ${point.nominal} %\nArea ${point.area.toFixed(2)} %, ` +
         `gain ${point.gain.toFixed(2)}` })),
+    ],
+  });
+}
+
+// curves: [{ name, colour, dashed, points: [{ nominal, value }, …] }, …]
+export function scalePlot(curves, label) {
+  const points = curves.flatMap((curve, z) => curve.points.map((point) => ({ ...point, z,
+    name: curve.name, colour: curve.colour, dashed: curve.dashed })));
+  const way = { x: 'nominal', y: 'value', z: 'z' };
+  return (width) => ({
+    height: Math.min(340, Math.max(240, width * 0.6)),
+    x: { label: 'Nominal tone value (%)', domain: [0, 100], ticks: 5 },
+    y: { label, grid: true, nice: true },
+    marks: [
+      Plot.ruleY([0]),
+      edged(points.filter((point) => !point.dashed), way, false),
+      edged(points.filter((point) => point.dashed), way, true),
+      Plot.tip(points, Plot.pointer({ ...way, title: (point) =>
+        `${point.name} ${point.nominal} %\n${point.value.toFixed(3)}` })),
     ],
   });
 }

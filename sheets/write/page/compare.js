@@ -1,8 +1,9 @@
 // vantrel compare: the verdict, and the pairs that it rests on.
 
-import { histogramPlot, mostPoints, picture, planePlot } from './charts.js';
-import { chosenPaper, colourOf, count, figures, fixed, h, leftOut, named, smallTable, spread, swatch,
-  warnings } from './dom.js';
+import { histogramPlot, legend, mostPoints, picture, planePlot, scalePlot, tonePlot }
+  from './charts.js';
+import { advice, chosenPaper, colourOf, count, figures, fixed, h, inkColours, leftOut, named,
+  smallTable, spread, swatch, warnings } from './dom.js';
 import { spectraPicture, swatches } from './report.js';
 import { searchTable } from './table.js';
 
@@ -47,6 +48,52 @@ export const limitsTable = (caption, limits) => (limits?.length ? smallTable(cap
   { label: 'Largest at', text: (limit) => [named(limit.max_patch ?? ''),
     limit.max_patch && limit.note ? '; ' : '', limit.note ?? ''] },
 ], limits) : null);
+
+// The tone curves of both sheets over each other.
+function tonePicture(steps) {
+  const known = steps.filter((step) => step.reference !== null);
+  if (!known.length) return null;
+  const curves = [...new Set(known.map(({ ink }) => ink))].flatMap((ink) =>
+    ['reference', 'sample'].map((side) => ({ name: `${ink}, ${side}`, dashed: side === 'reference',
+      colour: inkColours[ink] ?? '#777777', points: [{ nominal: 0, area: 0, gain: 0 },
+        ...known.filter((step) => step.ink === ink).map((step) => ({ nominal: step.nominal,
+          area: step[side], gain: step[side] - step.nominal })),
+        { nominal: 100, area: 100, gain: 0 }] })));
+  const far = known.reduce((a, b) =>
+    (Math.abs(b.sample - b.reference) > Math.abs(a.sample - a.reference) ? b : a));
+  return picture('Tone values', tonePlot(curves, 'area'), () => 'Dot area of the sample, broken of ' +
+    `the reference; farthest apart at ${far.ink} ${far.nominal} %, ` +
+    `${fixed(far.sample)} for ${fixed(far.reference)}.`, legend(curves)).element;
+}
+
+// The scales of cyan, magenta and yellow, and of black: how far from grey, and how dark.
+function greyPictures(greys) {
+  if (!greys.length) return null;
+  const curve = (scale, name, field, dashed, colour) => ({ name: `${scale}, ${name}`, dashed, colour,
+    points: greys.filter((step) => step.scale === scale && step[field] !== null)
+      .map((step) => ({ nominal: step.nominal, value: step[field] })) });
+  const both = (...rows) => [['CMY', '#8a5a44'], ['K', '#555555']].flatMap(([scale, colour]) =>
+    rows.map(([name, field, dashed]) => curve(scale, name, field, dashed, colour)))
+    .filter(({ points }) => points.length);
+  const differences = both(['ΔCh', 'delta_ch', false], ['ΔL*', 'delta_l', true]);
+  const densities = both(['sample', 'density', false], ['reference', 'reference_density', true]);
+  const farthest = Math.max(...greys.map((step) => step.delta_ch));
+  return [
+    picture('Grey scales', scalePlot(differences, 'Δ'), () =>
+      `From the aims: ΔCh up to ${fixed(farthest)}, ΔL* broken.`, legend(differences)).element,
+    densities.length ? picture('Neutral density', scalePlot(densities, 'Visual density'), () =>
+      'Over the paper, along the scales; the reference is broken.', legend(densities)).element
+      : null,
+    smallTable('Grey scales', [
+      { label: 'Patch', text: ({ scale, name }) => [`${scale} `, named(name)] },
+      { label: 'Nominal %', number: true, text: ({ nominal }) => String(nominal) },
+      { label: 'ΔCh', number: true, text: (step) => fixed(step.delta_ch) },
+      { label: 'ΔL*', number: true, text: (step) => fixed(step.delta_l) },
+      { label: 'D aim', number: true, text: (step) => fixed(step.reference_density, 3) },
+      { label: 'D', number: true, text: (step) => fixed(step.density, 3) },
+    ], greys),
+  ];
+}
 
 function unpaired(result) {
   const side = (title, names) => names.length
@@ -149,7 +196,9 @@ export function comparePage(result) {
       { label: 'Reference L*a*b*', number: true, text: (pair) => labText(pair.reference.lab) },
       { label: 'Sample L*a*b*', number: true, text: (pair) => labText(pair.sample.lab) },
     ], worst)),
+    advice('Advice for the solids', result),
     h('div', { class: 'pictures' }, histogram.element, plane.element,
+      tonePicture(result.tone_values), greyPictures(result.greys),
       pairs.some((pair) => pair.sample.refl) ? spectra.element : null,
       swatches(pairs.map((pair) => ({ name: pair.name, colour: bothColours(pair) })),
         'The reference upper left, the sample lower right, as a screen can show them.')),

@@ -54,6 +54,22 @@ export function smallTable(caption, columns, rows) {
       h('tr', {}, columns.map((column) => cell('td', column, column.text(row))))))));
 }
 
+// The density change that brings each solid nearest to its aim, nothing where there is none.
+export const advice = (title, result) => (result.advice?.length ? [
+  smallTable(title, [
+    { label: 'Ink', text: ({ ink, patch }) => named(patch ?? ink) },
+    { label: 'ΔE00', number: true, text: ({ de00 }) => fixed(de00) },
+    { label: 'Density change', number: true, text: ({ density_change: change }) =>
+      (change > 0 ? '+' : '') + fixed(change, 3) },
+    { label: 'ΔE00 after', number: true, text: ({ de00_after: after }) => fixed(after) },
+    { label: '', text: (row) => row.words },
+  ], result.advice),
+  h('p', { class: 'note' }, result.advice_from),
+] : null);
+
+export const inkColours = { Cyan: '#009ee0', Magenta: '#e5007d', Yellow: '#d9c400', Black: '#555555',
+  CMYK_C: '#009ee0', CMYK_M: '#e5007d', CMYK_Y: '#d9c400', CMYK_K: '#555555' };
+
 // Which patch stands for the paper, and why.
 export const chosenPaper = (name, reason) =>
   [name === null ? 'no paper' : named(name), ` (${reason})`];

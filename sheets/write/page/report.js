@@ -2,8 +2,8 @@
 
 import { histogramPlot, legend, mostPoints, picture, planePlot, spectraPlot, tonePlot }
   from './charts.js';
-import { chosenPaper, colourOf, count, figures, fixed, h, leftOut, named, smallTable, spread, swatch, triple,
-  warnings } from './dom.js';
+import { advice, chosenPaper, colourOf, count, figures, fixed, h, leftOut, named, smallTable, spread,
+  swatch, triple, warnings } from './dom.js';
 import { searchTable } from './table.js';
 
 const mostSwatches = 2000;
@@ -39,11 +39,13 @@ function solidName(ink, patch) {
 }
 
 // One curve an ink, from paper to solid.
-const toneCurves = (sheet, solids) => sheet.tone_values.map(({ ink, solid, values }) =>
-  ({ name: solidName(ink, solid), colour: solids.has(ink) ? colourOf(solids.get(ink)) : 'gray', points: [
+const toneCurves = (sheet, solids) => sheet.tone_values.map(({ ink, solid, tone_value: how, values }) =>
+  ({ name: solidName(ink, solid) + (how === 'sctv' ? ', SCTV' : ''), colour: solids.has(ink) ? colourOf(solids.get(ink)) : 'gray', points: [
     { nominal: 0, area: 0, gain: 0 },
     ...values.map((value) =>
-      ({ nominal: value.nominal, area: value.dot_area, gain: value.dot_gain })),
+      ({ nominal: value.nominal, sctv: value.sctv, ...(how === 'sctv'
+        ? { area: value.sctv, gain: value.sctv - value.nominal }
+        : { area: value.dot_area, gain: value.dot_gain }) })),
     { nominal: 100, area: 100, gain: 0 }] }));
 
 function keyFigures(sheet, solids) {
@@ -100,6 +102,7 @@ const toneTable = (curves) => h('details', {}, h('summary', {}, 'Numbers'),
     { label: 'Nominal %', number: true, text: ([, point]) => String(point.nominal) },
     { label: 'Area %', number: true, text: ([, point]) => fixed(point.area) },
     { label: 'Gain', number: true, text: ([, point]) => fixed(point.gain) },
+    { label: 'SCTV %', number: true, text: ([, point]) => fixed(point.sctv) },
   ], curves.flatMap((curve) => curve.points.slice(1, -1).map((point) => [curve, point]))));
 
 // The spectra, to which chosen patches are added, and what follows the choice.
@@ -177,6 +180,7 @@ function columnsOf(sheet) {
     number('D', 'density', 3, 'Density over the paper'),
     number('Area', 'dot_area', 2, 'Dot area, percent'),
     number('Gain', 'dot_gain', 2, 'Dot gain, percentage points'),
+    number('SCTV', 'sctv', 2, 'Spot colour tone value (ISO 20654), percent'),
     number('Contrast', 'print_contrast', 2, 'Print contrast, percent'),
     number('Hue err.', 'hue_error', 2, 'Hue error, percent'),
     number('Grayness', 'grayness', 2, 'Grayness, percent'),
@@ -232,6 +236,7 @@ function sheetSection(sheet, id, heading) {
       leftOut(sheet.patches.length, sheet)),
     keyFigures(sheet, solids),
     warnings(sheet.warnings),
+    advice('Advice for the solids', sheet),
     swatches(sheet.patches.map((patch) => ({ name: patch.name, colour: colourOf(patch) })),
       'In the order of the file, as a screen can show them.'),
     h('div', { class: 'pictures' }, source.bands ? spectra.element : null,

@@ -2,10 +2,9 @@
 
 import { picture, seriesPlot, zonesPlot } from './charts.js';
 import { limitsTable } from './compare.js';
-import { count, fixed, h, named, smallTable, warnings } from './dom.js';
+import { advice, count, fixed, h, inkColours, named, smallTable, warnings } from './dom.js';
 import { searchTable } from './table.js';
 
-const inkColours = { Cyan: '#009ee0', Magenta: '#e5007d', Yellow: '#d9c400', Black: '#555555' };
 const colourOf = (series) => inkColours[series.subject] ?? '#777777';
 const charted = ['density', 'tone_value', 'solid', 'delta_ch', 'delta_l', 'paper', 'mean_de00'];
 
@@ -70,18 +69,6 @@ const statistics = (result) => smallTable('Readings over the sheets', [
   { label: 'Left at', number: true, text: (series) => series.first_outside ?? '' },
   { label: 'Will leave at', number: true, text: (series) => series.leaves_at ?? '' },
 ], result.series);
-
-export const advice = (title, result) => (result.advice?.length ? [
-  smallTable(title, [
-    { label: 'Ink', text: ({ ink }) => named(ink) },
-    { label: 'ΔE00', number: true, text: ({ de00 }) => fixed(de00) },
-    { label: 'Density change', number: true, text: ({ density_change: change }) =>
-      (change > 0 ? '+' : '') + fixed(change, 3) },
-    { label: 'ΔE00 after', number: true, text: ({ de00_after: after }) => fixed(after) },
-    { label: '', text: (row) => row.words },
-  ], result.advice),
-  h('p', { class: 'note' }, result.advice_from),
-] : null);
 
 export function runPage(result) {
   const about = [count(result.sheets.length, 'sheet'), result.job, result.instrument,

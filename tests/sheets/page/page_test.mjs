@@ -44,6 +44,16 @@ for (const name of readdirSync(folder)) {
   }
 }
 
+test('a click on a sheet of a run shows its zones, of which one is lost', async () => {
+  const page = await open('python3 make_run.py run; vantrel run run/sheet_*.txt --aims run/aims.txt');
+  const profile = page.locator('figure', { hasText: 'Ink-zone profile' });
+  assert.equal(await profile.locator('[aria-label=bar] rect').count(), 4 * 6);
+  await page.locator('.sheets button').nth(7).click();
+  assert.match(await profile.innerText(), /sheet 8, run\/sheet_08\.txt/);
+  assert.equal(await profile.locator('[aria-label=bar] rect').count(), 4 * 5);
+  await page.close();
+});
+
 test('rows are sorted, searched, paged, and all printed', async () => {
   // 120 patches in the order of 1, 38, 75, …, 120: no two of the same darkness.
   const page = await open(`(echo name,tint,ink,$(seq -s, 400 10 700); i=0; while [ $i -lt 121 ]; do
