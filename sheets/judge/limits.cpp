@@ -54,6 +54,15 @@ Deviation deviation(const std::optional<double> &aim, const std::optional<double
     return aim && value ? Deviation(std::abs(*value - *aim)) : std::nullopt;
 }
 
+// CIE 15, of a* and b* as they are: LabToDH() takes them with two decimals, which among close
+// colours is all the difference.
+double hue_difference(const CIELABCOORD &aim, const CIELABCOORD &sample)
+{
+    const double a = sample.a - aim.a, b = sample.b - aim.b;
+    const double chroma = std::hypot(sample.a, sample.b) - std::hypot(aim.a, aim.b);
+    return std::sqrt(std::max(0.0, a * a + b * b - chroma * chroma));
+}
+
 Deviation deviation_of(const Tolerance &limit, const ControlPatch &patch)
 {
     switch (limit.quantity) {
@@ -61,11 +70,8 @@ Deviation deviation_of(const Tolerance &limit, const ControlPatch &patch)
         return limit.metric(patch.aim, patch.lab);
     case Quantity::lightness:
         return std::abs(patch.lab.L - patch.aim.L);
-    case Quantity::hue: {
-        double delta_h = 0;
-        LabToDH(&patch.aim, &patch.lab, &delta_h);
-        return std::abs(delta_h);
-    }
+    case Quantity::hue:
+        return hue_difference(patch.aim, patch.lab);
     case Quantity::neutral_chroma:
         return std::hypot(patch.lab.a - patch.aim.a, patch.lab.b - patch.aim.b);
     case Quantity::density:

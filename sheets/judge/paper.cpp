@@ -12,6 +12,7 @@ namespace vantrel::sheets {
 namespace {
 
 constexpr double kChromaOfPaper = 12; // C*: more than white stock for print has
+constexpr double kLighter = 2;        // L*: more than paper differs from itself
 constexpr double kSpreadOfPaper = 1;  // ΔE00: more than places of one sheet differ
 constexpr double kBelowPaper = -0.02; // densities
 
@@ -96,20 +97,35 @@ Paper no_paper(const std::string &reason)
     return out;
 }
 
-void warn_of_lightest(const Measurement &sheet, const Paper &paper, ILLUM_OBS illuminant,
-                      std::vector<std::string> &warnings)
+bool contains(const Places &places, std::size_t place)
 {
-    const double chroma = lch_of(lab_of(paper, illuminant)).C;
-    std::string doubt;
-    if (std::any_of(sheet.patches.begin(), sheet.patches.end(),
-                    [](const Patch &patch) { return !patch.device.empty(); }))
-        doubt = "no patch is without ink";
-    if (chroma > kChromaOfPaper)
-        doubt += fmt::format("{}its C* is {:.1f}", doubt.empty() ? "" : ", and ", chroma);
-    if (!doubt.empty())
-        warnings.push_back(fmt::format(
-            "{}: {} stands for the paper as the lightest patch, but {}; --paper chooses",
-            sheet.file, in_quotes(paper.choice.name), doubt));
+    return std::find(places.begin(), places.end(), place) != places.end();
+}
+
+// What speaks against the paper at these places; `bare` are those of the patches without ink.
+void warn_of_choice(const Measurement &sheet, const Paper &paper, const Places &places,
+                    const Places &bare, std::string_view how, ILLUM_OBS illuminant,
+                    std::vector<std::string> &warnings)
+{
+    std::vector<std::string> doubts;
+    const bool has_device = std::any_of(sheet.patches.begin(), sheet.patches.end(),
+                                        [](const Patch &patch) { return !patch.device.empty(); });
+    if (bare.empty() && has_device)
+        doubts.emplace_back("no patch is without ink");
+    else if (!bare.empty() && !contains(bare, places.front()))
+        doubts.push_back(fmt::format("{} is without ink", in_quotes(sheet.patches[bare[0]].name)));
+    const CIELABCOORD lab = lab_of(paper, illuminant);
+    if (const double chroma = lch_of(lab).C; chroma > kChromaOfPaper)
+        doubts.push_back(fmt::format("its C* is {:.1f}", chroma));
+    const std::size_t lightest = lightest_of(sheet, illuminant);
+    const double lightness = lab_of(sheet, sheet.patches[lightest], illuminant).L;
+    if (lightness > lab.L + kLighter && !contains(places, lightest) && !contains(bare, lightest))
+        doubts.push_back(fmt::format("{} has an L* of {:.1f} to its {:.1f}",
+                                     in_quotes(sheet.patches[lightest].name), lightness, lab.L));
+    if (!doubts.empty())
+        warnings.push_back(fmt::format("{}: {} stands for the paper {}, but {}; --paper chooses",
+                                       sheet.file, in_quotes(paper.choice.name), how,
+                                       fmt::join(doubts, ", and ")));
 }
 
 } // namespace
@@ -124,21 +140,23 @@ Paper paper_of(const Measurement &sheet, std::string_view name, ILLUM_OBS illumi
 {
     if (name == "none")
         return no_paper("as asked for");
-    if (!name.empty())
-        return paper_at(sheet, places_named(sheet, name), "by name", illuminant, warnings);
-    if (sheet.kind == Kind::transmission)
+    if (name.empty() && sheet.kind == Kind::transmission)
         return no_paper("transmission");
     const auto white = white_of_rgb(sheet);
     const Places bare =
         places_where(sheet, [&](const Patch &patch) { return is_bare(patch, white); });
-    if (!bare.empty())
-        return paper_at(sheet, bare, "without ink", illuminant, warnings);
-    if (sheet.collection)
+    if (name.empty() && bare.empty() && sheet.collection)
         return no_paper("a collection of colours");
-    Paper out =
-        paper_at(sheet, {lightest_of(sheet, illuminant)}, "the lightest", illuminant, warnings);
-    warn_of_lightest(sheet, out, illuminant, warnings);
-    return out;
+    const auto chosen = [&](const Places &places, const char *reason, const char *how) {
+        Paper out = paper_at(sheet, places, reason, illuminant, warnings);
+        warn_of_choice(sheet, out, places, bare, how, illuminant, warnings);
+        return out;
+    };
+    if (!name.empty())
+        return chosen(places_named(sheet, name), "by name", "by name");
+    if (!bare.empty())
+        return chosen(bare, "without ink", "without ink");
+    return chosen({lightest_of(sheet, illuminant)}, "the lightest", "as the lightest patch");
 }
 
 void require_paper(const PaperChoice &paper, const std::string &file, std::string_view what)

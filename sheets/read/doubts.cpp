@@ -9,6 +9,7 @@
 #include <charconv>
 #include <cstdint>
 #include <cstring>
+#include <map>
 #include <optional>
 #include <string_view>
 #include <system_error>
@@ -145,6 +146,28 @@ void doubt_ids(const std::vector<Patch> &patches, std::vector<Doubt> &out)
                          counted, patches.size(), in_quotes(before->id), in_quotes(after->id))});
 }
 
+// An id that stands for several patches of other names, or a name for several device values: a slip
+// where they are few, the way of the file where they are many.
+void doubt_names(const std::vector<Patch> &patches, std::vector<Doubt> &out)
+{
+    std::map<std::string_view, const Patch *> ids, names; // the first of each
+    std::vector<Doubt> slips;
+    for (const Patch &patch : patches) {
+        const Patch &same_id = *ids.emplace(patch.id, &patch).first->second;
+        const Patch &same_name = *names.emplace(patch.name, &patch).first->second;
+        if (same_id.name != patch.name)
+            slips.push_back(
+                {patch.line, fmt::format("the id {} stands for {} and {}", in_quotes(patch.id),
+                                         in_quotes(same_id.name), in_quotes(patch.name))});
+        else if (same_name.device != patch.device)
+            slips.push_back({patch.line, fmt::format("the name {} stands twice, for other device "
+                                                     "values",
+                                                     in_quotes(patch.name))});
+    }
+    if (!slips.empty() && 10 * slips.size() <= patches.size())
+        out.push_back({slips[0].line, slips[0].text + and_more(slips.size())});
+}
+
 // No instrument reads two patches alike to the last digit of every band.
 void doubt_copies(const std::vector<Patch> &patches, std::vector<Doubt> &out)
 {
@@ -249,6 +272,7 @@ std::vector<Doubt> doubts_about(const std::vector<Patch> &patches)
     doubt_signs(patches, out);
     doubt_spikes(patches, out);
     doubt_ids(patches, out);
+    doubt_names(patches, out);
     doubt_copies(patches, out);
     doubt_inks(patches, out);
     return out;

@@ -204,6 +204,14 @@ void Flat::exact(std::string name, std::string cgats,
                        }});
 }
 
+void Flat::warnings(const std::vector<std::string> &texts)
+{
+    if (!texts.empty())
+        text("warnings", "WARNINGS", [&texts](std::size_t i) {
+            return i == 0 ? fmt::format("{}", fmt::join(texts, "; ")) : "";
+        });
+}
+
 void Flat::colour(const std::string &prefix, const std::function<const Colour *(std::size_t)> &get)
 {
     text(prefix + "rgb", "", [get](std::size_t i) { return get(i) ? hex(get(i)->rgb) : ""; });

@@ -40,6 +40,8 @@ struct Flat {
                 std::function<std::optional<double>(std::size_t)> get);
     void exact(std::string name, std::string cgats,
                std::function<std::optional<double>(std::size_t)> get);
+    // All in the first row; no column where there are none.
+    void warnings(const std::vector<std::string> &texts);
     // Preview and L*a*b*; a null pointer makes empty cells.
     void colour(const std::string &prefix, const std::function<const Colour *(std::size_t)> &get);
     void spectrum(const std::function<const Spectrum &(std::size_t)> &get);

@@ -174,6 +174,7 @@ Flat spectra(const PatchStudy &study)
     flat.number("brightness", "BRIGHTNESS", of_first(study.as_paper.brightness));
     flat.number("whiteness", "WHITENESS", of_first(study.as_paper.whiteness));
     flat.spectrum([patch](std::size_t i) -> const Spectrum & { return *patch(i).refl; });
+    flat.warnings(study.warnings);
     return flat;
 }
 

@@ -297,6 +297,7 @@ std::vector<Flat> flat_of(const Predictions &predictions)
         return out;
     });
     flat.spectrum([estimate](std::size_t i) -> const Spectrum & { return estimate(i).refl; });
+    flat.warnings(predictions.warnings);
     return {flat};
 }
 

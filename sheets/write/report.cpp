@@ -312,6 +312,7 @@ Flat flat_of(const Report &report)
     flat.text("paper", "PAPER", [&report](std::size_t) { return said(report.paper.choice); });
     if (patches.front().refl)
         flat.spectrum([&patches](std::size_t i) -> const Spectrum & { return *patches[i].refl; });
+    flat.warnings(report.warnings);
     return flat;
 }
 
