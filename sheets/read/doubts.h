@@ -15,8 +15,8 @@ struct Doubt {
 };
 
 // Of reflectances in percent: bands that read the same everywhere or stand out of those beside
-// them, reflectances below zero, gaps in the count of ids, ids and names of several patches, spectra that stand twice, and solids
-// that read as another ink than the device values say.
+// them, reflectances below zero, gaps in the count of ids, ids and names of several patches,
+// spectra that stand twice, and solids that read as another ink than the device values say.
 std::vector<Doubt> doubts_about(const std::vector<Patch> &patches);
 
 } // namespace vantrel::sheets
