@@ -195,6 +195,7 @@ def compare(
     tolerance: Optional[float] = None,
     tolerances: Optional[Path] = None,
     substrate_corrected: bool = False,
+    advice: bool = False,
 ) -> Comparison:
     """How a sheet differs from its aims, patch by patch, as `vantrel compare`.
 
@@ -228,6 +229,8 @@ def compare(
         A TOML file of limits by group of patches.
     substrate_corrected : bool
         Whether the sheet is judged too by aims that are moved to its paper (ISO 13655).
+    advice : bool
+        Whether the comparison says which change of its density brings a solid nearest to its aim.
 
     Returns
     -------
@@ -263,6 +266,7 @@ def compare(
         "tolerance": tolerance,
         **_tolerances(tolerances),
         "substrate_corrected": substrate_corrected,
+        "advice": advice or None,
     }
     conditions = [s.source.condition if s.source else "" for s in (aims, sheet)]
     sheets = [aims, sheet]

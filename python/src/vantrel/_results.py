@@ -318,6 +318,18 @@ class GreyStep:
     density: Optional[float]
 
 
+@dataclass(frozen=True)
+class Advice:
+    """What to change at the press for a solid: its density, and ΔE00 before and after."""
+
+    ink: str
+    de00: float
+    density_change: float
+    de00_after: float
+    words: str
+    patch: Optional[str] = None
+
+
 @dataclass(frozen=True, repr=False)
 class Comparison(Result):
     """What `vantrel compare` says of a sheet beside its aims.
@@ -354,6 +366,8 @@ class Comparison(Result):
     worst: Tuple[int, ...]
     unpaired: Dict[str, Tuple[str, ...]]
     pairs: Tuple[Pair, ...]
+    advice: Optional[Tuple[Advice, ...]] = None
+    advice_from: Optional[str] = None
 
     def to_pandas(self) -> Any:
         """A DataFrame with a row for each pair."""

@@ -4,18 +4,8 @@ from dataclasses import dataclass
 from typing import Any, Dict, Optional, Tuple
 
 from ._result import Result
-from ._results import Judged, Limit, frame
+from ._results import Advice, Judged, Limit, frame
 
-
-@dataclass(frozen=True)
-class Advice:
-    """What to change at the press for a solid: its density, and ΔE00 before and after."""
-
-    ink: str
-    de00: float
-    density_change: float
-    de00_after: float
-    words: str
 
 @dataclass(frozen=True)
 class RunLimit(Limit):
