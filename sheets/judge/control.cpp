@@ -40,13 +40,29 @@ ControlPatch control_patch(const PairReport &pair, const Paper &reference_paper,
     return out;
 }
 
-// Negative where a tint prints too light.
-std::optional<double> gain_of(const Side &solid, const Side &tint, double nominal,
-                              const Paper &paper, int status)
+using Pairs = std::vector<const PairReport *>;
+
+// The mean of the spectra of one side; nothing where one has none.
+std::optional<Spectrum> mean_of(const Pairs &pairs, Side PairReport::*side)
 {
-    if (!solid.refl || !tint.refl || !paper.choice.exists())
+    Spectrum mean{};
+    for (const PairReport *pair : pairs) {
+        const std::optional<Spectrum> &refl = (pair->*side).refl;
+        if (!refl)
+            return std::nullopt;
+        for (int band = 0; band < VANTREL_BANDS; ++band)
+            mean[band] += (*refl)[band] / static_cast<double>(pairs.size());
+    }
+    return mean;
+}
+
+// Negative where a tint prints too light.
+std::optional<double> gain_of(const std::optional<Spectrum> &solid, const Side &tint,
+                              double nominal, const Paper &paper, int status)
+{
+    if (!solid || !tint.refl || !paper.choice.exists())
         return std::nullopt;
-    const auto area = Densitometer(paper.refl, status).dot_area(*solid.refl, *tint.refl, 1);
+    const auto area = Densitometer(paper.refl, status).dot_area(*solid, *tint.refl, 1);
     return area ? std::optional(*area - nominal) : std::nullopt;
 }
 
@@ -57,23 +73,28 @@ std::vector<ControlPatch> control_patches(const std::vector<PairReport> &pairs,
                                           int status, bool collection)
 {
     std::vector<ControlPatch> out;
-    std::map<std::string, const PairReport *> solids; // the first of each ink
+    std::map<std::string, Pairs> solids; // of each ink
     for (const PairReport &pair : pairs) {
         out.push_back(control_patch(pair, reference_paper, collection));
         if (is_solid(out.back()))
-            solids.try_emplace(out.back().inks[0].first, &pair);
+            solids[out.back().inks[0].first].push_back(&pair);
     }
+    struct Solid {
+        std::optional<Spectrum> aim, sample;
+    };
+    std::map<std::string, Solid> means;
+    for (const auto &[ink, all] : solids)
+        means[ink] = {mean_of(all, &PairReport::reference), mean_of(all, &PairReport::sample)};
     for (std::size_t i = 0; i < pairs.size(); ++i) {
         if (!is_tint(out[i]))
             continue;
         const auto &[ink, nominal] = out[i].inks[0];
-        const auto solid = solids.find(ink);
-        if (solid == solids.end())
+        const auto solid = means.find(ink);
+        if (solid == means.end())
             continue;
         out[i].aim_gain =
-            gain_of(solid->second->reference, pairs[i].reference, nominal, reference_paper, status);
-        out[i].gain =
-            gain_of(solid->second->sample, pairs[i].sample, nominal, sample_paper, status);
+            gain_of(solid->second.aim, pairs[i].reference, nominal, reference_paper, status);
+        out[i].gain = gain_of(solid->second.sample, pairs[i].sample, nominal, sample_paper, status);
     }
     return out;
 }

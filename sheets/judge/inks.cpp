@@ -79,10 +79,13 @@ Inks::Inks(const Measurement &sheet, const std::vector<std::string> &order) : sh
         fields[i] = in_file[sequence[i]];
         numbers[fields[i]] = i;
     }
-    solids.resize(fields.size());
-    for (const Patch &patch : sheet.patches)
-        if (const auto ink = ink_of_solid(patch); ink && !solids[*ink])
-            solids[*ink] = &patch;
+    std::vector<std::vector<std::size_t>> places(fields.size()); // of the solids of each ink
+    for (std::size_t i = 0; i < sheet.patches.size(); ++i)
+        if (const auto ink = ink_of_solid(sheet.patches[i]))
+            places[*ink].push_back(i);
+    for (const std::vector<std::size_t> &some : places)
+        solids.push_back(some.empty() ? std::nullopt
+                                      : std::optional(mean_of(sheet, some, D50_2DEG)));
 }
 
 bool Inks::names_are_tints() const

@@ -1,6 +1,7 @@
 // Which inks a patch was printed with, as its device values tell.
 #pragma once
 
+#include "judge/repeats.h"
 #include "read/measurement.h"
 
 #include <cstddef>
@@ -47,7 +48,16 @@ public:
 
     // The first patch of this combination, null where there is none.
     const Patch *measured(const Tints &tints) const;
-    const Patch *solid(std::size_t ink) const { return solids[ink]; }
+
+    // The mean of the ink's solids, under the name of the first; null where there is none.
+    const Patch *solid(std::size_t ink) const
+    {
+        return solids[ink] ? &solids[ink]->patch : nullptr;
+    }
+    std::size_t count_of_solids(std::size_t ink) const
+    {
+        return solids[ink] ? solids[ink]->count : 0;
+    }
 
     // The ink of which a patch is a solid; nothing where it is none.
     std::optional<std::size_t> ink_of_solid(const Patch &patch) const;
@@ -63,7 +73,7 @@ private:
     bool ramp = false; // by the names of the patches
     std::vector<std::string> fields;
     std::map<std::string, std::size_t> numbers; // of the fields, in the order of printing
-    std::vector<const Patch *> solids;          // the first of each ink, null where there is none
+    std::vector<std::optional<Repeats>> solids; // of each ink
 };
 
 } // namespace vantrel::sheets

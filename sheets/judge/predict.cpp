@@ -115,7 +115,9 @@ private:
 const Patch &solid_named(const Measurement &sheet, const Inks &inks, std::string_view name)
 {
     if (const Patch *patch = find_patch(sheet, name)) {
-        if (inks.tints_of(*patch) && !inks.ink_of_solid(*patch))
+        if (const auto ink = inks.ink_of_solid(*patch))
+            return *inks.solid(*ink);
+        if (inks.tints_of(*patch))
             throw RequestError{
                 fmt::format("{}: {} is no solid of one ink", sheet.file, in_quotes(name))};
         return *patch;

@@ -103,6 +103,8 @@ std::vector<ToneCurve> tone_curves(const Inks &inks, const std::vector<PatchRepo
         ToneCurve &curve = curves.emplace_back();
         curve.ink = inks.names()[ink];
         curve.solid = inks.solid(ink)->name;
+        if (const std::size_t count = inks.count_of_solids(ink); count > 1)
+            curve.solid += fmt::format(" (mean of {})", count);
         curve.spot = !is_process_ink(ink_title(curve.ink));
         for (auto &[nominal, sum] : sums[ink]) {
             sum.dot_area /= static_cast<double>(sum.patches);
