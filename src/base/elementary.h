@@ -200,17 +200,20 @@ template <class V> V exp10(V x)
 // x^y = ∛x x^-d, d = 1/3 - y: the cube root by a step of Halley's from 23 bits on, and
 // x^-d = 1 - u + u²/2, u = d ln x, for which ten decimals of the logarithm are enough.
 
+/// log m by the powers of m, 1 to 2. Not in the function: the linker would join the tables of all
+/// builds of a template, those for newer processors included.
+constexpr double kLogOfMantissa[] = {
+    -0x1.6092a32a5d6f8p+1, 0x1.0e41ccb84bf2bp+3, -0x1.043649a39a1e8p+4, 0x1.92e00fe637ae3p+4,
+    -0x1.d749e7447706ap+4, 0x1.a019d0bd0bd94p+4, -0x1.15a85635777b5p+4, 0x1.16a555164bafbp+3,
+    -0x1.9e4656945f234p+1, 0x1.bacc152858136p-1, -0x1.41eb8c6d4ccdcp-3, 0x1.1d34671d337dap-6,
+    -0x1.d0efae7c714b6p-11};
+
 /// For a normal x, which stands for x 2^-down.
 template <class V> V root_of_normal(V x, double y, V down)
 {
     static constexpr double kRoot[] = {
         0x1.b42648613923ap-2,  0x1.0e47e0f53ce4fp+0, -0x1.c77345675bc91p-1, 0x1.4a3f9857830ap-1,
         -0x1.4b882010c8d23p-2, 0x1.abd8ea5835697p-4, -0x1.3ed90ff5478ecp-6, 0x1.a106089abdd43p-10};
-    static constexpr double kLog[] = {
-        -0x1.6092a32a5d6f8p+1, 0x1.0e41ccb84bf2bp+3, -0x1.043649a39a1e8p+4, 0x1.92e00fe637ae3p+4,
-        -0x1.d749e7447706ap+4, 0x1.a019d0bd0bd94p+4, -0x1.15a85635777b5p+4, 0x1.16a555164bafbp+3,
-        -0x1.9e4656945f234p+1, 0x1.bacc152858136p-1, -0x1.41eb8c6d4ccdcp-3, 0x1.1d34671d337dap-6,
-        -0x1.d0efae7c714b6p-11};
     const double d = ((1 - 2 * y) - y) / 3;          // both differences are exact
     const V exponent = small_integer(bits(x) >> 52); // and 1023
     // floor(exponent / 3), exact in every rounding mode: 21846 / 2^16 is a little above 1/3.
@@ -222,7 +225,7 @@ template <class V> V root_of_normal(V x, double y, V down)
     const V t = leading(polynomial(m, kRoot) * root_of_rest, kLeading23);
     const V quotient = m * power_of_2(rest) / (t * t);
     const V step = (quotient - t) / (t + t + quotient);
-    const V u = d * ((exponent - (1023 + down)) * kLn2.high + polynomial(m, kLog));
+    const V u = d * ((exponent - (1023 + down)) * kLn2.high + polynomial(m, kLogOfMantissa));
     const V power = u * (0.5 * u - 1);
     return (t + t * (step + power + step * power)) * power_of_2(third - (341 + down / 3));
 }
