@@ -211,8 +211,9 @@ def test_results_are_those_of_the_program(call, command, sheet, darker, tmp_path
 
     run = printed("json")
     assert (result.json, str(result)) == (run.stdout, printed("table").stdout)
-    told = [f"vantrel: {w.message}".replace("force_pairs= ", "--force-pairs ") for w in caught]
-    assert sorted(told) == sorted(run.stderr.splitlines())
+    told = sorted(f"vantrel: {w.message}" for w in caught)
+    complained = run.stderr.replace("--force-pairs ", "force_pairs= ").replace("--paper ", "paper= ")
+    assert told == sorted(complained.splitlines())
     for ending, form in (".html", "html"), (".csv", "csv"), (".txt", "cgats"), (".json", "json"):
         result.write("result" + ending)
         assert Path("result" + ending).read_bytes() == printed(form).stdout.encode()
