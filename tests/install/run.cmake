@@ -44,7 +44,8 @@ endfunction()
 file(REMOVE_RECURSE ${WORK}/prefix ${WORK}/staged ${WORK}/C ${WORK}/CXX)
 set(prefix ${WORK}/prefix)
 if(VARIANT STREQUAL "subproject")
-  set(use -D VANTREL_SOURCE=${SOURCE})
+  # The library is compiled anew for each language: without optimisation, the numbers are the same.
+  set(use -D VANTREL_SOURCE=${SOURCE} -D CMAKE_BUILD_TYPE=Debug)
 else()
   string(COMPARE EQUAL ${VARIANT} shared shared)
   configure(${WORK}/library ${SOURCE} -D BUILD_SHARED_LIBS=${shared}
