@@ -1,25 +1,16 @@
 // Hands arbitrary bytes to the C interface of measurement files: a line of options, then a file.
 // Stops where a call neither refuses them in printable text nor answers with JSON.
 #include "read/text.h"
+#include "require.h"
 
 #include <nlohmann/json.hpp>
 #include <vantrel_sheets.h>
 
 #include <cstdint>
-#include <cstdio>
-#include <cstdlib>
 #include <string>
 #include <string_view>
 
 namespace {
-
-void require(bool holds, const char *fault)
-{
-    if (holds)
-        return;
-    std::fprintf(stderr, "FAULT: %s\n", fault);
-    std::abort();
-}
 
 void check(VantrelAnswer *answer, bool json)
 {

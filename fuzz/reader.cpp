@@ -2,24 +2,15 @@
 // in one printable line nor hands on a sheet that can be measured and printed.
 #include "read/reader.h"
 #include "read/text.h"
+#include "require.h"
 
 #include <algorithm>
 #include <cmath>
 #include <cstdint>
-#include <cstdio>
-#include <cstdlib>
 
 using namespace vantrel::sheets;
 
 namespace {
-
-void require(bool holds, const char *fault)
-{
-    if (holds)
-        return;
-    std::fprintf(stderr, "FAULT: %s\n", fault);
-    std::abort();
-}
 
 bool finite(double value) { return std::isfinite(value); }
 bool is_printable(const std::string &text) { return printable(text) == text; }
