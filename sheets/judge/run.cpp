@@ -248,13 +248,13 @@ void RunJudge::judge(RunSeries &series) const
     Series values;
     for (const auto &sheet : series.sheets)
         values.push_back(sheet ? std::optional(sheet->value) : std::nullopt);
-    series.trend = trend_of(values).value();
-    series.outliers = outliers_about(values, series.trend, apart_by(series.measurand.attribute));
+    series.outliers = outliers_about_slope(values, apart_by(series.measurand.attribute));
+    series.trend = trend_of(values, series.outliers).value();
     series.odd_zones = odd_zones(series);
     if (!series.limits)
         return;
     series.first_outside = first_outside(values, *series.limits);
-    if (!series.first_outside && series.trend.drift)
+    if (series.trend.drift)
         series.leaves_at = leaves_at(*series.trend.drift, *series.limits, values.size(), kAhead);
 }
 
@@ -323,6 +323,26 @@ void RunJudge::add_limits(Run &run) const
     run.verdict = run.unread.empty() && run.gaps.empty() ? Verdict::passed : Verdict::incomplete;
     for (const RunSheet &sheet : run.sheets)
         run.verdict = worse(*run.verdict, sheet.verdict.value_or(Verdict::incomplete));
+}
+
+// Of how few sheets no more can be said.
+void RunJudge::warn_of_few(Run &run) const
+{
+    const std::size_t sheets = entries.size();
+    if (sheets < kFewestOfOutliers)
+        run.warnings.push_back(fmt::format(
+            "{} sheet{}: {}that a sheet stands apart is told of {} or more", sheets,
+            sheets == 1 ? "" : "s",
+            sheets < kFewestOfDrift ? fmt::format("a slope is told of {} or more, ", kFewestOfDrift)
+                                    : "",
+            kFewestOfOutliers));
+    std::size_t zones = 0;
+    for (const RunSheet &sheet : run.sheets)
+        zones = std::max(zones, sheet.zones.size());
+    if (zones > 1 && zones < kFewestOfOutliers)
+        run.warnings.push_back(
+            fmt::format("{} zones: that a zone prints unlike the others is told of {} or more",
+                        zones, kFewestOfOutliers));
 }
 
 void RunJudge::add_advice(Run &run) const
@@ -411,6 +431,7 @@ Run RunJudge::result()
     find_gaps(run);
     add_limits(run);
     add_advice(run);
+    warn_of_few(run);
     compare_origins(run);
     add_warnings(run);
     return run;

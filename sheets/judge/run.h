@@ -102,6 +102,7 @@ private:
     void add_limits(Run &run) const;
     void judge(RunSeries &series) const;
     void add_advice(Run &run) const;
+    void warn_of_few(Run &run) const;
     void compare_origins(Run &run) const;
     void add_warnings(Run &run) const;
 

@@ -20,37 +20,54 @@ double student(std::size_t freedom)
                                       : 1.95996 + 2.37227 / static_cast<double>(freedom);
 }
 
+struct Sums {
+    double n = 0, mean_x = 0, mean_y = 0; // x are the sheets
+    double sxx = 0, sxy = 0, syy = 0;     // about the means
+};
+
+Sums sums_of(const Series &series)
+{
+    Sums out;
+    for (std::size_t x = 0; x < series.size(); ++x)
+        if (series[x]) {
+            out.n += 1;
+            out.mean_x += static_cast<double>(x);
+            out.mean_y += *series[x];
+        }
+    out.mean_x /= out.n;
+    out.mean_y /= out.n;
+    for (std::size_t x = 0; x < series.size(); ++x)
+        if (series[x]) {
+            const double dx = static_cast<double>(x) - out.mean_x, dy = *series[x] - out.mean_y;
+            out.sxx += dx * dx;
+            out.sxy += dx * dy;
+            out.syy += dy * dy;
+        }
+    return out;
+}
+
 } // namespace
 
-std::optional<Trend> trend_of(const Series &series)
+std::optional<Trend> trend_of(const Series &series, const std::vector<std::size_t> &apart)
 {
-    double n = 0, sum_x = 0, sum_y = 0;
-    for (std::size_t x = 0; x < series.size(); ++x)
-        if (series[x]) {
-            n += 1;
-            sum_x += static_cast<double>(x);
-            sum_y += *series[x];
-        }
-    if (n == 0)
+    const Sums all = sums_of(series);
+    if (all.n == 0)
         return std::nullopt;
-    const double mean_x = sum_x / n, mean_y = sum_y / n;
-    double sxx = 0, sxy = 0, syy = 0;
-    for (std::size_t x = 0; x < series.size(); ++x)
-        if (series[x]) {
-            const double dx = static_cast<double>(x) - mean_x, dy = *series[x] - mean_y;
-            sxx += dx * dx;
-            sxy += dx * dy;
-            syy += dy * dy;
-        }
-    Trend out{.count = static_cast<std::size_t>(n), .mean = mean_y, .deviation = {}, .drift = {}};
+    Trend out{
+        .count = static_cast<std::size_t>(all.n), .mean = all.mean_y, .deviation = {}, .drift = {}};
     if (out.count >= 2)
-        out.deviation = std::sqrt(syy / (n - 1));
-    if (out.count >= 3) {
-        const double slope = sxy / sxx;
+        out.deviation = std::sqrt(all.syy / (all.n - 1));
+    Series near = series;
+    for (const std::size_t sheet : apart)
+        near[sheet].reset();
+    const Sums kept = sums_of(near);
+    if (kept.n >= static_cast<double>(kFewestOfDrift)) {
+        const double slope = kept.sxy / kept.sxx, freedom = kept.n - 2;
         const double residual =
-            std::fmax(syy - slope * sxy, 0) / (n - 2); // variance about the line
-        out.drift = {slope, student(out.count - 2) * std::sqrt(residual / sxx),
-                     mean_y - slope * mean_x};
+            std::fmax(kept.syy - slope * kept.sxy, 0) / freedom; // variance about the line
+        out.drift = {slope,
+                     student(static_cast<std::size_t>(freedom)) * std::sqrt(residual / kept.sxx),
+                     kept.mean_y - slope * kept.mean_x};
     }
     return out;
 }
@@ -70,31 +87,41 @@ double median_of(const Series &series)
 
 std::vector<std::size_t> outliers_of(const Series &series, double least)
 {
-    constexpr std::size_t fewest = 5;
-    constexpr double farthest = 8;
     const double median = median_of(series);
     Series distances;
-    for (const auto &value : series)
+    double count = 0, sum = 0;
+    for (const auto &value : series) {
         distances.push_back(value ? std::optional(std::fabs(*value - median)) : std::nullopt);
+        count += value ? 1 : 0;
+        sum += distances.back().value_or(0);
+    }
     const double mad = median_of(distances);
+    const double farthest = mad > 0 ? 8 * mad / 0.6745 : 3.5 * 1.2533 * (sum / count);
     std::vector<std::size_t> out;
-    const auto readings = std::count_if(series.begin(), series.end(),
-                                        [](const auto &value) { return value.has_value(); });
-    if (static_cast<std::size_t>(readings) < fewest || !(mad > 0))
-        return out;
     for (std::size_t i = 0; i < series.size(); ++i)
-        if (distances[i] && *distances[i] >= least && 0.6745 * *distances[i] > farthest * mad)
+        if (count >= static_cast<double>(kFewestOfOutliers) && distances[i] &&
+            *distances[i] >= least && *distances[i] > farthest)
             out.push_back(i);
     return out;
 }
 
-std::vector<std::size_t> outliers_about(const Series &series, const Trend &trend, double least)
+double median_slope(const Series &series)
 {
+    Series slopes;
+    for (std::size_t j = 0; j < series.size(); ++j)
+        for (std::size_t i = 0; i < j; ++i)
+            if (series[i] && series[j])
+                slopes.emplace_back((*series[j] - *series[i]) / static_cast<double>(j - i));
+    return median_of(slopes);
+}
+
+std::vector<std::size_t> outliers_about_slope(const Series &series, double least)
+{
+    const double slope = median_slope(series);
     Series distances = series;
-    if (trend.drift && trend.drift->significant())
-        for (std::size_t i = 0; i < distances.size(); ++i)
-            if (distances[i])
-                *distances[i] -= trend.drift->at(static_cast<double>(i));
+    for (std::size_t i = 0; i < distances.size(); ++i)
+        if (distances[i])
+            *distances[i] -= slope * static_cast<double>(i);
     return outliers_of(distances, least);
 }
 

@@ -27,20 +27,28 @@ struct Trend {
     std::optional<Drift> drift;      // from three readings on
 };
 
-// Nothing where the series has no reading. NIST/SEMATECH e-Handbook of Statistical Methods, 1.3.5.1
-// and 4.1.4; intervals by Student's t.
-std::optional<Trend> trend_of(const Series &series);
+// Mean and deviation of all readings; the drift of those that are not `apart`. Nothing where the
+// series has no reading. NIST/SEMATECH e-Handbook of Statistical Methods, 1.3.5.1 and 4.1.4;
+// intervals by Student's t.
+std::optional<Trend> trend_of(const Series &series, const std::vector<std::size_t> &apart = {});
 
 // Of the readings there are; nothing is 0.
 double median_of(const Series &series);
 
+constexpr std::size_t kFewestOfDrift = 3, kFewestOfOutliers = 5; // readings
+
 // Readings whose modified z-score, 0.6745 (x - median) / MAD, is beyond 8 (Iglewicz and Hoaglin,
 // How to Detect and Handle Outliers, 1993, take 3.5 for a single series; of a run dozens are looked
-// at). Nothing of fewer than five, or where half of them are equal.
+// at), and that are `least` from the median. Where most readings are equal, and the MAD is 0, by
+// their x - median over 1.2533 mean absolute deviations beyond 3.5. Nothing of fewer than five.
 std::vector<std::size_t> outliers_of(const Series &series, double least);
 
-// The same of the distances from the drift where it is significant.
-std::vector<std::size_t> outliers_about(const Series &series, const Trend &trend, double least);
+// The median of the slopes between all pairs of readings, which up to 29 % of wrong ones leave as
+// it is (Theil 1950, Sen 1968); 0 of fewer than two.
+double median_slope(const Series &series);
+
+// The outliers about the line of the median slope.
+std::vector<std::size_t> outliers_about_slope(const Series &series, double least);
 
 // What a reading may be; a missing limit does not bound it.
 struct Limits {

@@ -38,15 +38,28 @@ std::string limits_of(const RunSeries &series)
                : "up to " + shown(series, limits.high);
 }
 
-// "rises 0.012 ± 0.003 a sheet"; empty where it does neither.
+// "6, 9"
+std::string numbers_of(const std::vector<std::size_t> &sheets)
+{
+    std::string out;
+    for (const std::size_t sheet : sheets)
+        out += fmt::format("{}{}", out.empty() ? "" : ", ", sheet + 1);
+    return out;
+}
+
+// "rises 0.012 ± 0.003 a sheet without sheet 6"; empty where it does neither.
 std::string drift_of(const RunSeries &series)
 {
     const auto &drift = series.trend.drift;
     if (!drift || !drift->significant())
         return "";
-    return fmt::format("{} {} ± {} a sheet", drift->slope > 0 ? "rises" : "falls",
+    const auto &apart = series.outliers;
+    return fmt::format("{} {} ± {} a sheet{}", drift->slope > 0 ? "rises" : "falls",
                        slope_shown(series, std::fabs(drift->slope)),
-                       slope_shown(series, drift->uncertainty));
+                       slope_shown(series, drift->uncertainty),
+                       apart.empty() ? ""
+                                     : fmt::format(" without sheet{} {}",
+                                                   apart.size() > 1 ? "s" : "", numbers_of(apart)));
 }
 
 std::string sheet_of(const Run &run, std::size_t sheet)
@@ -57,22 +70,24 @@ std::string sheet_of(const Run &run, std::size_t sheet)
 // What the series says of the press, in words; empty where it says nothing.
 std::string finding_of(const Run &run, const RunSeries &series)
 {
-    const std::string title = series.measurand.title(), drift = drift_of(series);
+    const auto &limits = series.limits;
+    const std::string title = series.measurand.title();
+    std::string drift = drift_of(series);
+    if (series.leaves_at)
+        drift +=
+            fmt::format("; it leaves {} at sheet {}",
+                        shown(series, series.trend.drift->slope > 0 ? limits->high : limits->low),
+                        *series.leaves_at + 1);
     if (series.first_outside) {
         const std::size_t sheet = *series.first_outside;
-        return fmt::format(
-            "{} {} {} with {} at {}{}{}", title, series.limits->low ? "left" : "exceeded",
-            series.limits->low ? limits_of(series) : shown(series, series.limits->high),
-            shown(series, series.sheets[sheet]->value), sheet_of(run, sheet),
-            drift.empty() ? "" : "; it ", drift);
+        return fmt::format("{} {} {} with {} at {}{}{}", title, limits->low ? "left" : "exceeded",
+                           limits->low ? limits_of(series) : shown(series, limits->high),
+                           shown(series, series.sheets[sheet]->value), sheet_of(run, sheet),
+                           drift.empty() ? "" : "; it ", drift);
     }
-    if (series.leaves_at)
-        return fmt::format(
-            "{} {}; it leaves {} at sheet {}", title, drift,
-            shown(series, series.trend.drift->slope > 0 ? series.limits->high : series.limits->low),
-            *series.leaves_at + 1);
-    const bool unlimited = series.measurand.attribute == Attribute::density && !series.limits;
-    return unlimited && !drift.empty() ? fmt::format("{} {}", title, drift) : "";
+    const bool unlimited = series.measurand.attribute == Attribute::density && !limits;
+    return (series.leaves_at || unlimited) && !drift.empty() ? fmt::format("{} {}", title, drift)
+                                                             : "";
 }
 
 // "Solids ΔE00, largest: above 3.5 from sheet 8 (sheet_08.txt) on, at most 3.61 at M100"; empty

@@ -44,6 +44,30 @@ TEST(Trend, SheetsWithoutTheReadingLeaveGaps)
     EXPECT_FALSE(trend_of({1, 2})->drift);
 }
 
+TEST(Trend, OutlierAndDriftOfOneInkDoNotHideEachOther)
+{
+    const Series scatter = {0.001, -0.002, 0.002, 0, -0.001, 0.001, -0.002, 0.002, -0.001, 0};
+    for (const double slope : {0.009, -0.006, 0.0})
+        for (const std::size_t sheet : {0U, 4U, 8U})
+            for (const double apart : {-0.15, 0.15}) {
+                Series series = scatter;
+                for (std::size_t i = 0; i < series.size(); ++i)
+                    *series[i] += 1.4 + slope * static_cast<double>(i);
+                *series[sheet] += apart;
+                EXPECT_EQ(outliers_about_slope(series, 0.02), std::vector<std::size_t>{sheet});
+                const Trend trend = trend_of(series, {sheet}).value();
+                EXPECT_NEAR(trend.drift->slope, slope, 3e-4);
+                EXPECT_EQ(trend.drift->significant(), slope != 0);
+                EXPECT_EQ(trend.count, 10U);
+                EXPECT_GT(trend.deviation.value(), 0.04);
+            }
+    // Where most readings are equal one is told from a few that repeat.
+    EXPECT_EQ(outliers_of({1.5, 1.5, {}, 1.5, 1.53, 1.5}, 0.02), std::vector<std::size_t>{4});
+    EXPECT_TRUE(outliers_of({1.5, 1.53, 1.5, 1.53, 1.5}, 0.02).empty());
+    EXPECT_TRUE(outliers_of({1.5, 1.5, 1.5, 1.9}, 0.02).empty());
+    EXPECT_TRUE(outliers_of({1.5, 1.5, 1.5, 1.5, 1.51}, 0.02).empty());
+}
+
 // A press that mixes by area at n = 2, with a dot gain of its own.
 struct Press {
     static double area(double percent) { return std::pow(percent / 100, 0.7); }
