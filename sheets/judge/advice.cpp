@@ -3,6 +3,8 @@
 #include "judge/colour.h"
 #include "judge/densitometer.h"
 
+#include <fmt/format.h>
+
 #include <cmath>
 
 namespace vantrel::sheets {
@@ -39,6 +41,8 @@ template <typename Function> double minimum(Function f, double low, double high)
 }
 
 } // namespace
+
+std::string advice_from() { return fmt::format("{} {}", kAdviceFrom, kAdviceElse); }
 
 std::string_view words_of(const Advice &advice)
 {

@@ -21,11 +21,13 @@ struct Advice {
     static constexpr double kReached = 2; // ΔE00
 };
 
-// How far the model can be trusted.
+// How far the model can be trusted, in two lines.
 inline constexpr std::string_view kAdviceFrom =
     "Film model: on measured ramps its change was within 0.02 of the right one where it came to "
     "ΔE00 2 of the aim,";
 inline constexpr std::string_view kAdviceElse = "and off by up to 0.6 where it did not.";
+
+std::string advice_from(); // both
 
 // "more ink", "less ink", "on its aim", or why ink does not bring it there.
 std::string_view words_of(const Advice &advice);

@@ -143,12 +143,13 @@ std::size_t count_above(const std::vector<PairReport> &pairs, Differences differ
         }));
 }
 
-// By the pairs above the tolerance, by the limits, and by what found no partner.
+// By the pairs above the tolerance, by the limits, and by what found no partner, which makes it
+// incomplete where there is neither.
 std::optional<Verdict> verdict_of(const CompareRequest &request, const Coverage &coverage,
                                   std::size_t above, const std::vector<LimitResult> &limits)
 {
     if (!request.tolerance && request.tolerances.limits.empty())
-        return std::nullopt;
+        return coverage.complete() ? std::nullopt : std::optional(Verdict::incomplete);
     return worse(above > 0             ? Verdict::failed
                  : coverage.complete() ? Verdict::passed
                                        : Verdict::incomplete,
@@ -325,63 +326,6 @@ void warn_of_exchanged(Comparison &out)
         }
 }
 
-// The tone scale of each ink; of patches of one nominal value the first.
-std::vector<ToneStep> tones_of(const std::vector<ControlPatch> &controls)
-{
-    std::map<std::pair<std::string, double>, ToneStep> steps;
-    for (const ControlPatch &control : controls)
-        if (control.inks.size() == 1 && control.inks[0].second < 100 && control.gain) {
-            const auto &[ink, nominal] = control.inks[0];
-            steps.try_emplace({ink, nominal},
-                              ToneStep{ink, nominal,
-                                       control.aim_gain ? std::optional(nominal + *control.aim_gain)
-                                                        : std::nullopt,
-                                       nominal + *control.gain});
-        }
-    std::vector<ToneStep> out;
-    for (auto &[key, step] : steps)
-        out.push_back(std::move(step));
-    return out;
-}
-
-std::optional<double> neutral_density(const Sheet &sheet, const Side &side, int status)
-{
-    if (!side.refl || !sheet.paper.choice.exists())
-        return std::nullopt;
-    // The statuses of wavelengths have no visual filter.
-    const bool filters = status != SPECTRAL_STATUS && status != SPECTRALX_STATUS;
-    return Densitometer(sheet.paper.refl, filters ? status : E_STATUS)
-        .density(*side.refl, VISUAL_RESPONSE);
-}
-
-std::vector<GreyStep> greys_of(const std::vector<PairReport> &pairs,
-                               const std::vector<ControlPatch> &controls, const Sheet &references,
-                               const Sheet &samples, int status)
-{
-    std::map<std::pair<bool, double>, GreyStep> steps;
-    for (std::size_t i = 0; i < pairs.size(); ++i) {
-        const ControlPatch &control = controls[i];
-        const bool black = control.inks.size() == 1 && control.inks[0].first == "CMYK_K";
-        if (!black && !is_neutral(control))
-            continue;
-        const double nominal =
-            black ? control.inks[0].second
-                  : std::find_if(control.inks.begin(), control.inks.end(), [](const auto &ink) {
-                        return ink.first == "CMYK_C";
-                    })->second;
-        const CIELABCOORD &aim = control.aim, &lab = control.lab;
-        steps.try_emplace({black, nominal},
-                          GreyStep{black, nominal, control.name,
-                                   std::hypot(lab.a - aim.a, lab.b - aim.b), lab.L - aim.L,
-                                   neutral_density(references, pairs[i].reference, status),
-                                   neutral_density(samples, pairs[i].sample, status)});
-    }
-    std::vector<GreyStep> out;
-    for (auto &[key, step] : steps)
-        out.push_back(std::move(step));
-    return out;
-}
-
 std::vector<SolidAdvice> advice_of(const std::vector<PairReport> &pairs,
                                    const std::vector<ControlPatch> &controls, const Sheet &samples,
                                    const Terms &terms)
@@ -466,10 +410,11 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
         work.done(out.pairs.size());
     }
     warn_of_papers(out);
-    const std::vector<ControlPatch> controls = control_patches(
-        out.pairs, references.paper, samples.paper, request.status, reference.collection);
+    const std::vector<ControlPatch> controls =
+        control_patches(out.pairs, references.paper, samples.paper, illuminant.illuminant,
+                        request.status, reference.collection);
     out.tones = tones_of(controls);
-    out.greys = greys_of(out.pairs, controls, references, samples, request.status);
+    out.greys = greys_of(out.pairs, controls, references.paper, samples.paper, request.status);
     if (request.advice)
         out.advice = advice_of(out.pairs, controls, samples, terms);
     if (request.advice && out.advice.empty())

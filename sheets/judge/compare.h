@@ -8,6 +8,7 @@
 #include "judge/pair_report.h"
 #include "judge/pairs.h"
 #include "judge/paper.h"
+#include "judge/scales.h"
 #include "judge/stated.h"
 #include "judge/statistics.h"
 #include "read/measurement.h"
@@ -59,22 +60,6 @@ struct PaperDifference {
     std::optional<double> metamerism; // missing where a side has no spectra
 };
 
-// Dot areas of a tint of one ink, or of its solid, beside those of its aim.
-struct ToneStep {
-    std::string ink; // device field
-    double nominal;
-    std::optional<double> aim, area; // in percent; missing where there is no density
-};
-
-// A patch of the scale of cyan, magenta and yellow, or of that of black.
-struct GreyStep {
-    bool black;
-    double nominal; // of cyan, or of black
-    std::string name;
-    double delta_ch, delta_l;                   // from the aim
-    std::optional<double> aim_density, density; // visual, over the paper
-};
-
 struct Unpaired {
     std::string id, name;
 };
@@ -115,11 +100,13 @@ struct Comparison {
     std::string tolerances; // their name
     std::vector<LimitResult> limits;
     std::optional<SubstrateCorrected> corrected;
-    std::vector<ToneStep> tones; // by ink and nominal value
-    std::vector<GreyStep> greys; // from light to dark, first of cyan, magenta and yellow
+    std::vector<ToneStep> tones;
+    std::vector<GreyStep> greys;
     std::vector<SolidAdvice> advice;
     std::vector<std::string> warnings;
-    std::optional<Verdict> verdict; // nothing where there is neither a tolerance nor a limit
+    // Of neither a tolerance nor a limit nothing, or incomplete where patches or aims lack a
+    // partner.
+    std::optional<Verdict> verdict;
 };
 
 // Throws RequestError.

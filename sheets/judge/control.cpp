@@ -1,6 +1,8 @@
 #include "judge/control.h"
 
 #include "judge/densitometer.h"
+#include "judge/inks.h"
+#include "judge/tone_value.h"
 
 #include <algorithm>
 #include <map>
@@ -56,6 +58,13 @@ std::optional<Spectrum> mean_of(const Pairs &pairs, Side PairReport::*side)
     return mean;
 }
 
+// Of the mean spectrum, or of one of the patches where there are no spectra.
+CIELABCOORD solid_lab(const std::optional<Spectrum> &mean, const Pairs &pairs,
+                      Side PairReport::*side, ILLUM_OBS illuminant)
+{
+    return mean ? lab_of(*mean, illuminant) : (pairs.front()->*side).colour.lab;
+}
+
 // Negative where a tint prints too light.
 std::optional<double> gain_of(const std::optional<Spectrum> &solid, const Side &tint,
                               double nominal, const Paper &paper, int status)
@@ -70,7 +79,7 @@ std::optional<double> gain_of(const std::optional<Spectrum> &solid, const Side &
 
 std::vector<ControlPatch> control_patches(const std::vector<PairReport> &pairs,
                                           const Paper &reference_paper, const Paper &sample_paper,
-                                          int status, bool collection)
+                                          ILLUM_OBS illuminant, int status, bool collection)
 {
     std::vector<ControlPatch> out;
     std::map<std::string, Pairs> solids; // of each ink
@@ -81,20 +90,34 @@ std::vector<ControlPatch> control_patches(const std::vector<PairReport> &pairs,
     }
     struct Solid {
         std::optional<Spectrum> aim, sample;
+        CIELABCOORD aim_lab, lab;
     };
     std::map<std::string, Solid> means;
-    for (const auto &[ink, all] : solids)
-        means[ink] = {mean_of(all, &PairReport::reference), mean_of(all, &PairReport::sample)};
+    for (const auto &[ink, all] : solids) {
+        const auto aim = mean_of(all, &PairReport::reference),
+                   sample = mean_of(all, &PairReport::sample);
+        means[ink] = {aim, sample, solid_lab(aim, all, &PairReport::reference, illuminant),
+                      solid_lab(sample, all, &PairReport::sample, illuminant)};
+    }
     for (std::size_t i = 0; i < pairs.size(); ++i) {
-        if (!is_tint(out[i]))
+        ControlPatch &tint = out[i];
+        if (!is_tint(tint))
             continue;
-        const auto &[ink, nominal] = out[i].inks[0];
-        const auto solid = means.find(ink);
-        if (solid == means.end())
+        const auto &[ink, nominal] = tint.inks[0];
+        const auto found = means.find(ink);
+        if (found == means.end())
             continue;
-        out[i].aim_gain =
-            gain_of(solid->second.aim, pairs[i].reference, nominal, reference_paper, status);
-        out[i].gain = gain_of(solid->second.sample, pairs[i].sample, nominal, sample_paper, status);
+        const Solid &solid = found->second;
+        tint.aim_gain = gain_of(solid.aim, pairs[i].reference, nominal, reference_paper, status);
+        tint.gain = gain_of(solid.sample, pairs[i].sample, nominal, sample_paper, status);
+        if (is_process_ink(ink_title(ink)))
+            continue;
+        if (reference_paper.choice.exists())
+            tint.aim_sctv = spot_colour_tone_value(lab_of(reference_paper, illuminant),
+                                                   solid.aim_lab, tint.aim);
+        if (sample_paper.choice.exists())
+            tint.sctv =
+                spot_colour_tone_value(lab_of(sample_paper, illuminant), solid.lab, tint.lab);
     }
     return out;
 }

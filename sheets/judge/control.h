@@ -9,10 +9,10 @@
 
 namespace vantrel::sheets {
 
-// Gains of tints are against the mean solid of the same ink on the same side, over that side's
-// paper. Of a collection of colours all are spot colours.
+// Gains and tone values of tints are against the mean solid of the same ink on the same side, over
+// that side's paper. Of a collection of colours all are spot colours.
 std::vector<ControlPatch> control_patches(const std::vector<PairReport> &pairs,
                                           const Paper &reference_paper, const Paper &sample_paper,
-                                          int status, bool collection);
+                                          ILLUM_OBS illuminant, int status, bool collection);
 
 } // namespace vantrel::sheets

@@ -63,6 +63,14 @@ double hue_difference(const CIELABCOORD &aim, const CIELABCOORD &sample)
     return std::sqrt(std::max(0.0, a * a + b * b - chroma * chroma));
 }
 
+// Of spot inks by their tone values of ISO 20654.
+Deviation gain_deviation(const Tolerance &limit, const ControlPatch &patch)
+{
+    if (!patch.sctv)
+        return deviation(limit.aim ? limit.aim : patch.aim_gain, patch.gain);
+    return deviation(limit.aim ? patch.inks[0].second + *limit.aim : patch.aim_sctv, patch.sctv);
+}
+
 Deviation deviation_of(const Tolerance &limit, const ControlPatch &patch)
 {
     switch (limit.quantity) {
@@ -77,7 +85,7 @@ Deviation deviation_of(const Tolerance &limit, const ControlPatch &patch)
     case Quantity::density:
         return deviation(limit.aim ? limit.aim : patch.aim_density, patch.density);
     case Quantity::gain:
-        return deviation(limit.aim ? limit.aim : patch.aim_gain, patch.gain);
+        return gain_deviation(limit, patch);
     case Quantity::spread:
         break;
     }
@@ -175,6 +183,10 @@ LimitResult judge(const Tolerance &limit, const std::vector<ControlPatch> &patch
     out.judged = values.size();
     if (of_spread && !against_aims)
         out.note = "of the gains themselves: the reference has none";
+    if (limit.quantity == Quantity::gain &&
+        std::any_of(patches.begin(), patches.end(),
+                    [&](auto &p) { return p.sctv && concerns(limit, p); }))
+        out.note = "spot colours by SCTV (ISO 20654)";
     if (values.empty()) {
         out.note = of_spread     ? "no nominal value of which two inks have a gain"
                    : all.empty() ? "no such patch"

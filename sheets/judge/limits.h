@@ -20,7 +20,8 @@ struct ControlPatch {
     CIELABCOORD aim{}, lab{};
     // Missing where they make no sense, or one of the two sides has no spectra.
     std::optional<double> aim_density, density; // over the paper
-    std::optional<double> aim_gain, gain;       // of a tint
+    std::optional<double> aim_gain, gain;       // of a tint, by density
+    std::optional<double> aim_sctv, sctv;       // of a tint of a spot ink (ISO 20654)
 };
 
 // Of cyan, magenta and yellow, with an aim of hardly any chroma.

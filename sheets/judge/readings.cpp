@@ -194,7 +194,8 @@ private:
                     return densitometer.dot_area(*find(solid, zone), refl, 1);
                 });
         } else {
-            add({Attribute::tone_value, ink, nominal, true}, printed, sctv_aim(solid, printed),
+            add({Attribute::tone_value, ink, nominal, true}, printed,
+                printed.control ? printed.control->aim_sctv : std::nullopt,
                 [&](const Spectrum &refl, int zone) {
                     return spot_colour_tone_value(lab_of(paper, illuminant),
                                                   lab_of(*find(solid, zone), illuminant),
@@ -214,15 +215,6 @@ private:
         const bool quarters =
             find({{tint.ink, 25}}, 0) && find({{tint.ink, 50}}, 0) && find({{tint.ink, 75}}, 0);
         return !quarters || std::fmod(tint.percent, 25) == 0;
-    }
-
-    std::optional<double> sctv_aim(const Tints &solid, const Printed &tint) const
-    {
-        const auto bare = all.find({}), full = all.find(solid);
-        if (bare == all.end() || !bare->second.control || !full->second.control || !tint.control)
-            return std::nullopt;
-        return spot_colour_tone_value(bare->second.control->aim, full->second.control->aim,
-                                      tint.control->aim);
     }
 
     void add_trap(const Tints &tints, const Printed &printed)
@@ -343,8 +335,8 @@ SheetReadings readings_of(const Measurement &aims, Measurement measured, Compare
     std::vector<std::string> told; // by compare() too
     const Paper paper = paper_of(sheet, request.paper, comparison.illuminant, told),
                 aim_paper = paper_of(aims, request.paper, comparison.illuminant, told);
-    const std::vector<ControlPatch> controls =
-        control_patches(comparison.pairs, aim_paper, paper, request.status, aims.collection);
+    const std::vector<ControlPatch> controls = control_patches(
+        comparison.pairs, aim_paper, paper, comparison.illuminant, request.status, aims.collection);
     const Inks inks(sheet, order);
     const AllPrinted all =
         printed_on(zoned, inks, comparison, controls, Densitometer(paper.refl, request.status));

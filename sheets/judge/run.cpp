@@ -1,12 +1,15 @@
 #include "judge/run.h"
 
+#include "judge/dates.h"
+#include "read/text.h"
+
 #include <fmt/format.h>
 #include <fmt/ranges.h>
 
 #include <algorithm>
 #include <array>
-#include <cctype>
 #include <cmath>
+#include <numeric>
 #include <set>
 #include <utility>
 
@@ -43,10 +46,9 @@ std::optional<Attribute> attribute_of(const Tolerance &limit)
                                        : std::nullopt;
 }
 
-// Gains are by density.
 bool is_about(const Tolerance &limit, const Measurand &measurand)
 {
-    return attribute_of(limit) == measurand.attribute && !measurand.sctv &&
+    return attribute_of(limit) == measurand.attribute &&
            (limit.ink.empty() || ink_title(limit.ink) == measurand.subject) &&
            (limit.group != Group::spots || !is_process_ink(measurand.subject)) &&
            (!limit.nominal || *limit.nominal == measurand.nominal);
@@ -102,29 +104,6 @@ OverZones over_zones(const ZoneReading &reading)
     }
     if (!values.empty())
         out.deviation = trend_of(values)->deviation;
-    return out;
-}
-
-// Year, month, day, hour, minute and second of "2026-03-02 08:07:00" or "2026-03-02T08:07"; nothing
-// of other ways to write a date.
-std::optional<std::array<int, 6>> date_in(const std::string &created)
-{
-    std::array<int, 6> out{};
-    std::size_t part = 0;
-    bool digits = false;
-    if (created.size() < 10 || created[4] != '-' || created[7] != '-')
-        return std::nullopt;
-    for (const char c : created) {
-        if (std::isdigit(static_cast<unsigned char>(c))) {
-            out[part] = (out[part] * 10 + (c - '0')) % 10000;
-            digits = true;
-        } else if (digits) {
-            ++part;
-            digits = false;
-        }
-        if (c == '.' || c == '+' || part == out.size())
-            break; // parts of a second, the time zone
-    }
     return out;
 }
 
@@ -206,16 +185,58 @@ void RunJudge::add_unread(const std::string &reason) { unread.push_back(reason);
 
 void RunJudge::sort_by_date(Run &run)
 {
-    run.by_date = std::all_of(entries.begin(), entries.end(), [](const Entry &entry) {
-        return date_in(entry.sheet.created).has_value();
-    });
-    if (run.by_date)
-        std::stable_sort(entries.begin(), entries.end(), [](const Entry &a, const Entry &b) {
-            return date_in(a.sheet.created) < date_in(b.sheet.created);
+    std::vector<std::array<std::optional<Date>, 2>> dates;
+    std::vector<std::string> undated;
+    bool known = true, of_one_kind = true;
+    std::string ambiguous;
+    for (const Entry &entry : entries) {
+        const std::string &created = entry.sheet.created;
+        dates.push_back(dates_in(created));
+        if (created.empty())
+            undated.push_back(entry.sheet.file);
+        else if (!dates.back()[0])
+            run.warnings.push_back(fmt::format("{}: {} is no date that is known", entry.sheet.file,
+                                               in_quotes(created)));
+        else if (ambiguous.empty() && dates.back()[0]->seconds != dates.back()[1]->seconds)
+            ambiguous = fmt::format("{} of {}", in_quotes(created), entry.sheet.file);
+        known = known && dates.back()[0];
+        of_one_kind = of_one_kind && known && dates.back()[0]->kind == dates[0][0]->kind;
+    }
+    if (entries.size() == 1)
+        return;
+    std::array<std::vector<std::size_t>, 2> orders;
+    for (std::size_t way = 0; known && way < orders.size(); ++way) {
+        orders[way].resize(entries.size());
+        std::iota(orders[way].begin(), orders[way].end(), 0U);
+        std::stable_sort(orders[way].begin(), orders[way].end(), [&](std::size_t a, std::size_t b) {
+            return dates[a][way]->seconds < dates[b][way]->seconds;
         });
-    else if (entries.size() > 1)
-        run.warnings.emplace_back(
-            "not every sheet tells when it was made; the sheets stand as they were named");
+    }
+    run.by_date = of_one_kind && orders[0] == orders[1];
+    if (!undated.empty())
+        run.warnings.push_back("without a date: " + listed(undated));
+    if (!run.by_date) {
+        run.warnings.push_back(fmt::format(
+            "the sheets stand as they were named: {}",
+            !known         ? "not each has a date that is known"
+            : !of_one_kind ? "not all dates have a time of day, or not all a time zone"
+                           : ambiguous + " does not tell whether day or month comes first"));
+        return;
+    }
+    std::vector<Entry> sorted;
+    std::vector<std::string> same;
+    for (const std::size_t place : orders[0]) {
+        const auto same_date = [&](std::size_t other) {
+            return other != place && dates[other][0]->seconds == dates[place][0]->seconds;
+        };
+        if (std::any_of(orders[0].begin(), orders[0].end(), same_date))
+            same.push_back(entries[place].sheet.file);
+        sorted.push_back(std::move(entries[place]));
+    }
+    entries = std::move(sorted);
+    if (!same.empty())
+        run.warnings.push_back(
+            fmt::format("of one date, and as they were named: {}", listed(same)));
 }
 
 // By attribute, then as the sheets first have them.
@@ -318,11 +339,16 @@ void RunJudge::add_limits(Run &run) const
         run.limits.push_back(std::move(worst));
         run.limit_places.push_back(places);
     }
-    if (run.limits.empty())
-        return;
-    run.verdict = run.unread.empty() && run.gaps.empty() ? Verdict::passed : Verdict::incomplete;
+    if (!run.limits.empty())
+        run.verdict = Verdict::passed;
+    const auto take = [&run](const std::optional<Verdict> &verdict) {
+        if (verdict)
+            run.verdict = worse(run.verdict.value_or(*verdict), *verdict);
+    };
+    if (!run.unread.empty() || !run.gaps.empty())
+        take(Verdict::incomplete);
     for (const RunSheet &sheet : run.sheets)
-        run.verdict = worse(*run.verdict, sheet.verdict.value_or(Verdict::incomplete));
+        take(sheet.verdict);
 }
 
 // Of how few sheets no more can be said.

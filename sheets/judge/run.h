@@ -33,7 +33,7 @@ struct RunSheet {
     std::string file;
     std::string created; // as the file says; empty where it does not
     Coverage coverage{};
-    std::optional<Verdict> verdict{}; // nothing without limits
+    std::optional<Verdict> verdict{}; // of compare()
     std::vector<int> zones{};
 };
 
@@ -73,7 +73,7 @@ struct Run {
     std::vector<std::string> gaps;   // what single sheets lack
     std::vector<std::string> warnings;
     // Failed where a sheet failed; or else incomplete where one could not be read or judged whole,
-    // or lacks what others have; nothing without limits.
+    // or lacks what others have. Without limits nothing, or incomplete.
     std::optional<Verdict> verdict;
 };
 

@@ -5,6 +5,7 @@
 #include "write/json_text.h"
 #include "write/limits.h"
 #include "write/result.h"
+#include "write/scales.h"
 #include "write/table_text.h"
 
 #include <fmt/format.h>
@@ -83,24 +84,6 @@ void add_means(Lines &lines, const std::string &file, const std::optional<Means>
                               means->repeats, fixed(means->spread)));
 }
 
-// Tone values of the inks, and the scales of greys.
-void add_scales(Lines &lines, const Comparison &comparison)
-{
-    if (!comparison.tones.empty())
-        lines.add(
-            fmt::format("\n{:<22}{:>8}{:>8}{:>8}", "Tone values", "nominal", "aim", "sample"));
-    for (const ToneStep &step : comparison.tones)
-        lines.add(fmt::format("{:<22}{:>8g}{:>8}{:>8}", cut(step.ink, 21), step.nominal,
-                              fixed(step.aim), fixed(step.area)));
-    if (!comparison.greys.empty())
-        lines.add(fmt::format("\n{:<22}{:>8}{:>8}{:>8}{:>8}{:>8}", "Grey scales", "nominal", "ΔCh",
-                              "ΔL*", "D aim", "D"));
-    for (const GreyStep &step : comparison.greys)
-        lines.add(fmt::format("{:<22}{:>8g}{:>8}{:>8}{:>8}{:>8}", step.black ? "K" : "CMY",
-                              step.nominal, fixed(step.delta_ch), fixed(step.delta_l),
-                              fixed(step.aim_density, 3), fixed(step.density, 3)));
-}
-
 void add_unpaired(Lines &lines, const std::string &file, const std::vector<Unpaired> &unpaired)
 {
     if (unpaired.empty())
@@ -131,6 +114,8 @@ std::string sentence_of(const std::optional<Verdict> &verdict, const Comparison 
                                       *comparison.tolerance)
                         : fmt::format("no {} is above {:g}", title, *comparison.tolerance);
     }
+    if (!comparison.tolerance && limits.empty())
+        reasons = "no tolerance given";
     if (!limits.empty())
         reasons += (reasons.empty() ? "" : "; ") + counts_of(limits);
     return fmt::format("{}: {}; {}", word, reasons, told(comparison.coverage));
@@ -254,25 +239,6 @@ Json statistics_json(const Comparison &comparison, const std::vector<Statistics>
     return out;
 }
 
-void add_scales(Json &head, const Comparison &comparison)
-{
-    Json tones = Json::array(), greys = Json::array();
-    for (const ToneStep &step : comparison.tones)
-        tones.push_back({{"ink", step.ink},
-                         {"nominal", step.nominal},
-                         {"reference", or_null(step.aim)},
-                         {"sample", or_null(step.area)}});
-    for (const GreyStep &step : comparison.greys)
-        greys.push_back({{"scale", step.black ? "K" : "CMY"},
-                         {"nominal", step.nominal},
-                         {"name", step.name},
-                         {"delta_ch", step.delta_ch},
-                         {"delta_l", step.delta_l},
-                         {"reference_density", or_null(step.aim_density)},
-                         {"density", or_null(step.density)}});
-    head.update({{"tone_values", tones}, {"greys", greys}});
-}
-
 Json corrected_json(const Comparison &comparison)
 {
     if (!comparison.corrected)
@@ -314,7 +280,8 @@ void write_table(const Comparison &comparison, const Sink &sink, const TableStyl
         lines.add(
             fmt::format("\nBetween the papers: ΔE00 {}{}", fixed(papers->de00),
                         papers->metamerism ? ", metamerism " + fixed(papers->metamerism) : ""));
-    add_scales(lines, comparison);
+    add_tones(lines, comparison.tones);
+    add_greys(lines, comparison.greys);
     add_advice(lines, "Advice for the solids", comparison.advice);
     add_means(lines, comparison.reference, comparison.reference_means);
     add_means(lines, comparison.sample, comparison.sample_means);
@@ -368,7 +335,8 @@ void write_json(const Comparison &comparison, const Sink &sink)
          {{"reference", names_json(comparison.only_reference)},
           {"sample", names_json(comparison.only_sample)}}},
     };
-    add_scales(head, comparison);
+    head["tone_values"] = tones_json(comparison.tones);
+    head["greys"] = greys_json(comparison.greys);
     if (!comparison.advice.empty())
         add_advice(head, comparison.advice);
     add_left_out(head, comparison.left_out);
@@ -419,6 +387,8 @@ Flat flat_of_statements(const Comparison &comparison)
     rows.push_back({"Verdict", word_of(comparison.verdict), sentence_of(comparison)});
     if (const std::string sentence = corrected_sentence_of(comparison); !sentence.empty())
         rows.push_back({"Verdict", word_of(comparison.corrected->verdict), sentence});
+    if (!comparison.advice.empty())
+        rows.push_back({"Advice", "", advice_from()});
     for (const std::string &warning : comparison.warnings)
         rows.push_back({"Warning", "", warning});
     return flat_of(std::move(rows),
@@ -488,6 +458,12 @@ std::vector<Flat> flat_of(const Comparison &comparison)
     std::vector<Flat> tables = {flat};
     if (!comparison.only_sample.empty() || !comparison.only_reference.empty())
         tables.push_back(flat_of_unpaired(comparison));
+    if (!comparison.tones.empty())
+        tables.push_back(flat_of(comparison.tones));
+    if (!comparison.greys.empty())
+        tables.push_back(flat_of(comparison.greys));
+    if (!comparison.advice.empty())
+        tables.push_back(flat_of(comparison.advice, "Advice for the solids"));
     if (!comparison.limits.empty())
         tables.push_back(flat_of(comparison.limits, "reference", limits_title(comparison)));
     if (comparison.corrected && !comparison.corrected->limits.empty())

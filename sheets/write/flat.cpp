@@ -204,12 +204,24 @@ void Flat::exact(std::string name, std::string cgats,
                        }});
 }
 
-void Flat::warnings(const std::vector<std::string> &texts)
+void Flat::warnings(std::vector<std::string> texts)
 {
     if (!texts.empty())
-        text("warnings", "WARNINGS", [&texts](std::size_t i) {
+        text("warnings", "WARNINGS", [texts = std::move(texts)](std::size_t i) {
             return i == 0 ? fmt::format("{}", fmt::join(texts, "; ")) : "";
         });
+}
+
+void Flat::advice(const std::string &note, const std::function<const Advice *(std::size_t)> &get)
+{
+    for (const auto &[name, value] : {std::pair{"dE00_aim", &Advice::de00},
+                                      {"density_change", &Advice::density_change},
+                                      {"dE00_after", &Advice::de00_after}})
+        number(name, upper(name), [get, value = value](std::size_t i) {
+            return get(i) ? std::optional(get(i)->*value) : std::nullopt;
+        });
+    text(note, upper(note),
+         [get](std::size_t i) { return std::string(get(i) ? words_of(*get(i)) : ""); });
 }
 
 void Flat::colour(const std::string &prefix, const std::function<const Colour *(std::size_t)> &get)
@@ -248,6 +260,18 @@ void Flat::device(const std::vector<std::string> &names,
             const auto own = row->values.find(name);
             return own == row->values.end() ? std::nullopt : std::optional(own->second);
         });
+}
+
+Flat flat_of(const std::vector<SolidAdvice> &advice, const std::string &description)
+{
+    Flat flat;
+    flat.description = description;
+    flat.rows = advice.size();
+    flat.text("name", "SOLID", [&advice](std::size_t i) {
+        return "Advice for " + (advice[i].patch.empty() ? advice[i].ink : advice[i].patch);
+    });
+    flat.advice("note", [&advice](std::size_t i) { return &advice[i].advice; });
+    return flat;
 }
 
 void write_csv(const std::vector<Flat> &tables, const Sink &sink)

@@ -1,6 +1,7 @@
 // A result as plain rows under named columns: what CSV and CGATS text are written from.
 #pragma once
 
+#include "judge/advice.h"
 #include "judge/colour.h"
 #include "write/sink.h"
 
@@ -41,7 +42,9 @@ struct Flat {
     void exact(std::string name, std::string cgats,
                std::function<std::optional<double>(std::size_t)> get);
     // All in the first row; no column where there are none.
-    void warnings(const std::vector<std::string> &texts);
+    void warnings(std::vector<std::string> texts);
+    // A null pointer makes empty cells; its words stand under `note`.
+    void advice(const std::string &note, const std::function<const Advice *(std::size_t)> &get);
     // Preview and L*a*b*; a null pointer makes empty cells.
     void colour(const std::string &prefix, const std::function<const Colour *(std::size_t)> &get);
     void spectrum(const std::function<const Spectrum &(std::size_t)> &get);
@@ -50,6 +53,9 @@ struct Flat {
     void device(const std::vector<std::string> &names,
                 const std::function<const Device &(std::size_t)> &get);
 };
+
+// The advice has to live as long as the columns.
+Flat flat_of(const std::vector<SolidAdvice> &advice, const std::string &description);
 
 // RFC 4180. Tables of different columns share one header, with a column for every name. Text that a
 // spreadsheet would take for a formula gets an apostrophe in front.

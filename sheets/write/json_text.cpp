@@ -65,7 +65,7 @@ void add_advice(Json &object, const std::vector<SolidAdvice> &advice)
     }
     object["advice"] = rows;
     if (!advice.empty())
-        object["advice_from"] = fmt::format("{} {}", kAdviceFrom, kAdviceElse);
+        object["advice_from"] = advice_from();
 }
 
 void add_left_out(Json &object, const LeftOut &left_out)

@@ -25,7 +25,8 @@ int decimals_of(const LimitResult &result)
     return result.limit.quantity == Quantity::density ? 3 : 2;
 }
 
-void add_limits(Lines &lines, const std::string &title, const std::vector<LimitResult> &limits)
+void add_limits(Lines &lines, const std::string &title, const std::vector<LimitResult> &limits,
+                const std::vector<std::string> &places)
 {
     if (limits.empty())
         return;
@@ -37,11 +38,13 @@ void add_limits(Lines &lines, const std::string &title, const std::vector<LimitR
     lines.add(fmt::format("\n{}\n{:<{}}{:<{}}{:<8}{:>10}{:>9}{:>8}{:>8}  {:<11}{}", title,
                           "Patches", patches + 2, "", quantity + 2, "", "judged", "measured",
                           "limit", "margin", "verdict", "largest at"));
-    for (const LimitResult &result : limits) {
+    for (std::size_t i = 0; i < limits.size(); ++i) {
+        const LimitResult &result = limits[i];
         const int decimals = decimals_of(result);
         std::string said = cut(result.worst, 20);
-        if (!result.note.empty())
-            said += (said.empty() ? "" : "; ") + result.note;
+        for (const std::string &more : {places.empty() ? "" : places[i], result.note})
+            if (!more.empty())
+                said += (said.empty() ? "" : "; ") + more;
         lines.add(fmt::format("{:<{}}{:<{}}{:<8}{:>10}{:>9}{:>8}{:>8}  {:<11}{}",
                               cut(patches_of(result.limit), kWidestInText), patches + 2,
                               title_of(result.limit), quantity + 2,

@@ -14,7 +14,9 @@ namespace vantrel::sheets {
 
 int decimals_of(const LimitResult &result); // densities have three
 
-void add_limits(Lines &lines, const std::string &title, const std::vector<LimitResult> &limits);
+// `places` tell where each was judged; none where it is plain.
+void add_limits(Lines &lines, const std::string &title, const std::vector<LimitResult> &limits,
+                const std::vector<std::string> &places = {});
 
 // "2 of 7 limits failed, 1 could not be judged"
 std::string counts_of(const std::vector<LimitResult> &limits);

@@ -312,7 +312,23 @@ Flat flat_of(const Report &report)
     flat.text("paper", "PAPER", [&report](std::size_t) { return said(report.paper.choice); });
     if (patches.front().refl)
         flat.spectrum([&patches](std::size_t i) -> const Spectrum & { return *patches[i].refl; });
-    flat.warnings(report.warnings);
+    if (report.advice.empty()) {
+        flat.warnings(report.warnings);
+        return flat;
+    }
+    std::map<std::size_t, const Advice *> advice; // by patch, the first of its name
+    for (const SolidAdvice &solid : report.advice)
+        for (std::size_t i = 0; i < patches.size(); ++i)
+            if (patches[i].patch->name == solid.patch &&
+                advice.try_emplace(i, &solid.advice).second)
+                break;
+    flat.advice("advice", [advice = std::move(advice)](std::size_t i) {
+        const auto found = advice.find(i);
+        return found == advice.end() ? nullptr : found->second;
+    });
+    std::vector<std::string> warnings = report.warnings;
+    warnings.push_back(advice_from());
+    flat.warnings(std::move(warnings));
     return flat;
 }
 

@@ -8,6 +8,7 @@
 #include "write/table_text.h"
 
 #include <fmt/format.h>
+#include <fmt/ranges.h>
 
 #include <algorithm>
 #include <cmath>
@@ -173,6 +174,8 @@ std::string head_of(const Run &run)
                                   run.sheets.size() == 1 ? "sheet" : "sheets", run.aims);
     if (run.by_date)
         out += fmt::format(", {} to {}", run.sheets.front().created, run.sheets.back().created);
+    else if (run.sheets.size() > 1)
+        out += ", as they were named";
     out += fmt::format("\n{}, {}", said(run.illuminant), status_name(run.status));
     for (const auto &[what, text] : {std::pair{"job", &run.job},
                                      {"instrument", &run.instrument},
@@ -204,9 +207,10 @@ std::string coverage_of(const Run &run)
 // "failed: 2 of 5 limits failed on 9 sheets; 1 sheet could not be judged; 1 gap; judged …"
 std::string sentence_of(const Run &run)
 {
-    std::string out = run.verdict ? fmt::format("{}: {} on {}", word_of(run), counts_of(run.limits),
-                                                counted(run.sheets.size(), "sheet"))
-                                  : "none, no limits are set";
+    std::string out = run.limits.empty()
+                          ? word_of(run) + (run.verdict ? ": " : ", ") + "no limits are set"
+                          : fmt::format("{}: {} on {}", word_of(run), counts_of(run.limits),
+                                        counted(run.sheets.size(), "sheet"));
     if (!run.unread.empty())
         out += fmt::format("; {} could not be judged", counted(run.unread.size(), "sheet"));
     if (!run.gaps.empty())
@@ -303,12 +307,45 @@ Json sheet_json(const RunSheet &sheet)
 // Verdict, findings and warnings as rows.
 Flat flat_of_statements(const Run &run)
 {
-    std::vector<Statement> rows = {{"Verdict", word_of(run), sentence_of(run)}};
+    std::vector<Statement> rows = {{"Verdict", word_of(run), sentence_of(run)},
+                                   {"Job", "", run.job},
+                                   {"Instrument", "", run.instrument},
+                                   {"Condition", "", run.condition}};
     for (const std::string &finding : findings_of(run))
         rows.push_back({"Finding", "", finding});
+    if (!run.advice.empty())
+        rows.push_back({"Advice", "", advice_from()});
     for (const std::string &warning : run.warnings)
         rows.push_back({"Warning", "", warning});
+    if (std::any_of(run.sheets.begin(), run.sheets.end(),
+                    [](const RunSheet &sheet) { return !sheet.zones.empty(); }))
+        rows.push_back({"Warning", "",
+                        "the readings of single zones are left out here: --format json "
+                        "and html have them"});
     return flat_of(std::move(rows), "Verdict, findings and warnings");
+}
+
+// "1, 2, 3"
+std::string joined(const std::vector<int> &zones)
+{
+    return fmt::format("{}", fmt::join(zones, ", "));
+}
+
+Flat flat_of_sheets(const Run &run)
+{
+    const std::vector<RunSheet> &sheets = run.sheets;
+    Flat flat;
+    flat.description = "Sheets";
+    flat.rows = sheets.size();
+    flat.text("name", "FILE", [&sheets](std::size_t i) { return sheets[i].file; });
+    flat.exact("sheet", "SHEET", [](std::size_t i) { return static_cast<double>(i + 1); });
+    flat.text("created", "CREATED", [&sheets](std::size_t i) { return sheets[i].created; });
+    flat.text("zones", "ZONES", [&sheets](std::size_t i) { return joined(sheets[i].zones); });
+    flat.text("verdict", "VERDICT", [&sheets](std::size_t i) {
+        return sheets[i].verdict ? std::string(name_of(*sheets[i].verdict)) : "";
+    });
+    flat.text("note", "NOTE", [&sheets](std::size_t i) { return told(sheets[i].coverage); });
+    return flat;
 }
 
 } // namespace
@@ -321,7 +358,10 @@ void write_table(const Run &run, const Sink &sink, const TableStyle &)
     for (const std::string &finding : findings_of(run))
         lines.add("- " + finding);
     add_series(lines, run);
-    add_limits(lines, limits_title(run), run.limits);
+    std::vector<std::string> sheets;
+    for (const LimitPlaces &places : run.limit_places)
+        sheets.push_back(fmt::format("sheet {}", places.worst + 1));
+    add_limits(lines, limits_title(run), run.limits, sheets);
     add_advice(lines, "Solids of the last sheet", run.advice);
 }
 
@@ -401,15 +441,30 @@ std::vector<Flat> flat_of(const Run &run)
     number("slope_uncertainty", drift(&Drift::uncertainty));
     sheet("first_outside", &RunSeries::first_outside);
     sheet("leaves_at", &RunSeries::leaves_at);
+    flat.text("outliers", "OUTLIERS",
+              [&all](std::size_t i) { return numbers_of(all[i].outliers); });
     for (std::size_t k = 0; k < run.sheets.size(); ++k)
         flat.number(fmt::format("{} {}", k + 1, run.sheets[k].file), fmt::format("SHEET_{}", k + 1),
                     [&all, k](std::size_t i) -> std::optional<double> {
                         const auto &one = all[i].sheets[k];
                         return one ? std::optional(one->value) : std::nullopt;
                     });
-    std::vector<Flat> tables = {flat};
-    if (!run.limits.empty())
+    for (std::size_t k = 0; k < run.sheets.size(); ++k)
+        flat.number(fmt::format("{} zones SD", k + 1), fmt::format("ZONES_SD_{}", k + 1),
+                    [&all, k](std::size_t i) {
+                        const auto &one = all[i].sheets[k];
+                        return one ? one->deviation : std::nullopt;
+                    });
+    std::vector<Flat> tables = {flat, flat_of_sheets(run)};
+    if (!run.advice.empty())
+        tables.push_back(flat_of(run.advice, "Solids of the last sheet"));
+    if (!run.limits.empty()) {
         tables.push_back(flat_of(run.limits, "aims", limits_title(run)));
+        const std::vector<LimitPlaces> &places = run.limit_places;
+        tables.back().exact("sheet", "SHEET", [&places](std::size_t i) {
+            return static_cast<double>(places[i].worst + 1);
+        });
+    }
     tables.push_back(flat_of_statements(run));
     return tables;
 }

@@ -52,7 +52,8 @@ constexpr const char *kFooter =
     "1968); the slope is without it.\n\n"
     "--tolerances judges each sheet as compare does, on the mean of its zones. A sheet that cannot "
     "be read,\none whose patches or aims find no partner, and one that lacks a zone or a reading "
-    "that others have make\nthe verdict incomplete. Exit status 1: failed or incomplete.\n\n"
+    "that others have make\nthe verdict incomplete, with limits or without. Exit status 1: failed "
+    "or incomplete.\n\n"
     "Example:\n  vantrel run run_*.txt --aims aims.txt --tolerances run.toml";
 
 } // namespace

@@ -297,17 +297,19 @@ class Means:
 
 @dataclass(frozen=True)
 class ToneStep:
-    """The dot areas of a tint of `ink`, in percent: of the aim and of the sample."""
+    """The dot areas of a tint of `ink`, in percent, of aim and sample; of spot inks by ISO 20654 too."""
 
     ink: str
     nominal: float
     reference: Optional[float]
     sample: Optional[float]
+    reference_sctv: Optional[float]
+    sample_sctv: Optional[float]
 
 
 @dataclass(frozen=True)
 class GreyStep:
-    """A patch of the `scale` "CMY" or "K": how far from its aim, and its visual densities."""
+    """A patch of the `scale` "CMY" (equal parts), "CMY grey" or "K" beside its aim; visual densities."""
 
     scale: str
     nominal: float
@@ -334,7 +336,7 @@ class Advice:
 class Comparison(Result):
     """What `vantrel compare` says of a sheet beside its aims.
 
-    `verdict` is "passed", "failed" or "incomplete", None without a tolerance or limits; `says` is
+    `verdict` is "passed", "failed" or "incomplete", or None where no tolerance is given; `says` is
     the same in a sentence.
     """
 

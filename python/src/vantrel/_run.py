@@ -17,7 +17,7 @@ class RunLimit(Limit):
 
 @dataclass(frozen=True)
 class RunSheet:
-    """A sheet of a run; `verdict` is None without limits."""
+    """A sheet of a run; `verdict` is None where no limits are set."""
 
     file: str
     created: str

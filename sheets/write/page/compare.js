@@ -45,13 +45,25 @@ export const limitsTable = (caption, limits) => (limits?.length ? smallTable(cap
   { label: 'Limit', number: true, text: (limit) => fixed(limit.limit, digits(limit)) },
   { label: 'Margin', number: true, text: (limit) => fixed(limit.margin, digits(limit)) },
   { label: 'Verdict', text: (limit) => limit.verdict },
-  { label: 'Largest at', text: (limit) => [named(limit.max_patch ?? ''),
-    limit.max_patch && limit.note ? '; ' : '', limit.note ?? ''] },
+  { label: 'Largest at', text: ({ max_patch: patch, sheet, note }) => [patch,
+    sheet && `sheet ${sheet}`, note].filter(Boolean).flatMap((text, i) => [i ? '; ' : '', named(text)]) },
 ], limits) : null);
+
+// Both tone values of spot inks: by density, and by ISO 20654.
+function spotTable(steps) {
+  const spots = steps.filter((step) => step.sample_sctv !== null);
+  return spots.length ? smallTable('Tone values of spot inks', [
+    { label: 'Ink', text: ({ ink }) => named(ink) },
+    { label: 'Nominal %', number: true, text: ({ nominal }) => String(nominal) },
+    ...[['SCTV aim', 'reference_sctv'], ['SCTV', 'sample_sctv'], ['Dot area aim', 'reference'],
+      ['Dot area', 'sample']].map(([label, field]) =>
+      ({ label, number: true, text: (step) => fixed(step[field]) })),
+  ], spots) : null;
+}
 
 // The tone curves of both sheets over each other.
 function tonePicture(steps) {
-  const known = steps.filter((step) => step.reference !== null);
+  const known = steps.filter((step) => step.reference !== null && step.sample !== null);
   if (!known.length) return null;
   const curves = [...new Set(known.map(({ ink }) => ink))].flatMap((ink) =>
     ['reference', 'sample'].map((side) => ({ name: `${ink}, ${side}`, dashed: side === 'reference',
@@ -72,7 +84,7 @@ function greyPictures(greys) {
   const curve = (scale, name, field, dashed, colour) => ({ name: `${scale}, ${name}`, dashed, colour,
     points: greys.filter((step) => step.scale === scale && step[field] !== null)
       .map((step) => ({ nominal: step.nominal, value: step[field] })) });
-  const both = (...rows) => [['CMY', '#8a5a44'], ['K', '#555555']].flatMap(([scale, colour]) =>
+  const both = (...rows) => [['CMY', '#8a5a44'], ['CMY grey', '#8a8a2a'], ['K', '#555555']].flatMap(([scale, colour]) =>
     rows.map(([name, field, dashed]) => curve(scale, name, field, dashed, colour)))
     .filter(({ points }) => points.length);
   const differences = both(['ΔCh', 'delta_ch', false], ['ΔL*', 'delta_l', true]);
@@ -198,7 +210,7 @@ export function comparePage(result) {
     ], worst)),
     advice('Advice for the solids', result),
     h('div', { class: 'pictures' }, histogram.element, plane.element,
-      tonePicture(result.tone_values), greyPictures(result.greys),
+      tonePicture(result.tone_values), spotTable(result.tone_values), greyPictures(result.greys),
       pairs.some((pair) => pair.sample.refl) ? spectra.element : null,
       swatches(pairs.map((pair) => ({ name: pair.name, colour: bothColours(pair) })),
         'The reference upper left, the sample lower right, as a screen can show them.')),
