@@ -41,6 +41,16 @@ async function press(page, name) {
     [...document.querySelectorAll('.plot')].every((plot) => plot.querySelector('svg')));
 }
 
+// Roles of the accessibility tree whose nodes have no name.
+async function nameless(page) {
+  const devtools = await page.context().newCDPSession(page);
+  const { nodes } = await devtools.send('Accessibility.getFullAXTree');
+  const named = nodes.filter(({ ignored, role }) =>
+    !ignored && /button|box|link|slider|progress|image|table|region|dialog|tab$/i.test(role.value));
+  assert.ok(named.length > 15, `${named.length} controls`);
+  return named.filter(({ name }) => !name?.value).map(({ role, properties }) => [role.value, properties]);
+}
+
 const said = (page, within) => page.evaluate(textOfPage, within);
 
 for (const [button, command, files] of [
@@ -55,6 +65,7 @@ for (const [button, command, files] of [
     const [ours, theirs] = [await openApp(wide, files), await open(command)];
     await press(ours, button);
     assert.equal(await said(ours, '#result > *'), await said(theirs, '#page > :not(footer)'));
+    assert.deepEqual(await nameless(ours), []);
     assert.deepEqual([...ours.complaints, ...theirs.complaints], []);
     await ours.close();
     await theirs.close();
@@ -88,7 +99,7 @@ test('a table pasted by the keyboard, inks to predict, a result saved', async ()
   const waiting = page.waitForEvent('download');
   await page.getByLabel('Save as').first().selectOption('CSV');
   await page.getByRole('button', { name: 'Save as' }).click();
-  assert.match(readFileSync(await (await waiting).path(), 'utf8'), /^file,.*nm700\r?\nPasted table 1,/);
+  assert.match(readFileSync(await (await waiting).path(), 'utf8'), /^file,.*nm700,warnings\r?\nPasted table 1,/);
   assert.deepEqual(page.complaints, []);
   await page.close();
 });

@@ -35,7 +35,7 @@ test('every file is reported as by the program', () => {
     program('report', 'conditions.cxf', '--condition', 'M0', '--scale', 'fraction'));
 });
 
-test('a comparison, predictions and one ink', () => {
+test('a comparison, a press run, predictions and one ink', () => {
   assert.deepEqual(
     vantrel.compare(opened('aims.txt'), opened('press.txt'), { formula: ['cmc', 'de94', 'de2000'],
       weights: { cmc: [1.5, 1.2] }, pair: 'id', words: 'hue', tolerance: 5.5, second_illuminant: 'F7_2DEG' }),
@@ -43,6 +43,12 @@ test('a comparison, predictions and one ink', () => {
       'cmc=1.5,1.2', '--pair', 'id', '--words', 'hue', '--tolerance', '5.5', '--second-illuminant',
       'F7_2DEG'));
   const sheet = opened('press.txt');
+  const limits = join(data, '../../../examples/offset.toml');
+  assert.deepEqual(
+    vantrel.run([sheet, opened('proof.csv')], opened('aims.txt'), { status: 'T_STATUS', paper: 'Paper',
+      tolerances: readFileSync(limits, 'utf8'), tolerances_name: limits }),
+    program('run', 'press.txt', 'proof.csv', '--aims', 'aims.txt', '--status', 'T_STATUS', '--paper', 'Paper',
+      '--tolerances', limits));
   assert.deepEqual(rounded(vantrel.predict(sheet)), rounded(program('predict', 'press.txt')));
   assert.deepEqual(vantrel.ink(sheet, { patch: 'Grau', against: 'B4', illuminant: 'C_2DEG' }),
     program('ink', 'press.txt', '--patch', 'Grau', '--against', 'B4', '--illuminant', 'C_2DEG'));

@@ -12,7 +12,11 @@ const [module, output] = process.argv.slice(2).map((path) => resolve(path));
 const read = (path) => readFileSync(join(root, path), 'utf8');
 const header = read('include/vantrel.h');
 
-const exported = new Set(read('src/exports.txt').split('\n'));
+// Symbols by function; that of Saunderson(), which has C++ linkage, is _Z10Saundersonddd.
+const symbols = new Map(read('src/exports.txt').split('\n').map((symbol) => {
+  const [, length, rest] = /^_Z(\d+)(.*)/.exec(symbol) ?? [];
+  return [length ? rest.slice(0, Number(length)) : symbol, symbol];
+}));
 const sizes = new Map([...read('tests/library/functions.cpp')
   .matchAll(/\{"(\w+)", call\(\1\),\s*"([^"]*)"\}/g)].map(([, name, sizes]) => [name, sizes.split(' ')]));
 
@@ -23,7 +27,7 @@ const camel = (name) => name.replace(/^(XYZ|CIELCh|CIELCH|CIELab|CIEYxy|CCR|[A-Z
 
 const text = (comment) => comment.replace(/^\s*\*? ?/gm, '').replace(/\\([*])/g, '$1')
   .replace(/\*\//g, '').trim();
-const reasonIn = (comment) => /@return 1; 0 ((?:.|\n)*?)(\.\s|\.$|$)/.exec(comment)?.[1]
+const reasonIn = (comment) => /@return (?:1; 0|true; false) ((?:.|\n)*?)(\.\s|\.$|$)/.exec(comment)?.[1]
   .replace(/\s+/g, ' ') ?? 'refused';
 
 const TYPES = { CIELABCOORD: 'double', CIELCHCOORD: 'double', DENSITYSTRUCT: 'double',
@@ -33,12 +37,12 @@ const VALUES = { k: 'Illuminant', s: 'Status', r: 'Response', d: 'Numbers', i: '
 const functions = [];
 for (const [, comment, returns, name, list] of header.matchAll(
   /\/\*\*((?:(?!\*\/)[^])*)\*\/\s*VANTREL_API (\w+) (\w+)\(([^)]*)\);/g)) {
-  if (!exported.has(name) || !sizes.has(name)) continue;
+  if (!symbols.has(name) || !sizes.has(name)) continue;
   const declared = list === 'void' ? [] : list.split(',').map((one) => one.trim());
   const tokens = sizes.get(name).filter(Boolean);
   if (tokens.length !== declared.length) throw new Error(`${name}: ${list} against ${tokens}`);
   const args = declared.map((declaration, i) => {
-    const [, type, star, own] = /^(?:const )?(\w+(?: int)?)\s*(\*?)\s*(\w+)$/.exec(declaration);
+    const [, type, star, own] = /^(?:const )?(\w+(?: int)?)\s*([*&]?)\s*(\w+)$/.exec(declaration);
     const [, out, core, mark] = /^(>?)(\w+)([?!]?)/.exec(tokens[i]);
     if (!star) return { name: own, kind: 'number', value: VALUES[core] };
     const kind = out ? 'output' : type === 'POLWEIGHTSTRUCT' ? 'weights' : 'array';
@@ -46,7 +50,7 @@ for (const [, comment, returns, name, list] of header.matchAll(
       ...(mark === '?' && !out ? { nullable: true } : {}) };
   });
   functions.push({ name, js: camel(name), args, comment: text(comment),
-    succeeds: returns === 'int' && /@return 1;/.test(comment), reason: reasonIn(text(comment)) });
+    succeeds: /@return (1|true);/.test(comment), reason: reasonIn(text(comment)) });
 }
 
 const constants = Object.fromEntries([...header.matchAll(/^    ([A-Z]\w+) = (-?\d+),?/gm)]
@@ -55,7 +59,7 @@ const constants = Object.fromEntries([...header.matchAll(/^    ([A-Z]\w+) = (-?\
 // Where argument k of row i stands, or its number.
 const passed = ({ kind }, k) => (kind === 'number' ? `at[${k}].values ? at[${k}].values[i] : at[${k}].begin`
   : `at[${k}].begin + i * at[${k}].step`);
-const rowOf = ({ name, js, args, succeeds, reason }) => `  { name: '_${name}', js: '${js}', succeeds: ${
+const rowOf = ({ name, js, args, succeeds, reason }) => `  { name: '${name}', symbol: '_${symbols.get(name)}', js: '${js}', succeeds: ${
   succeeds}, reason: ${JSON.stringify(reason)},\n    args: ${
   JSON.stringify(args.map(({ value, ...rest }) => rest))},\n    call: (f, at, i) => f(${args.map(passed).join(', ')}) },`;
 
@@ -95,8 +99,7 @@ ${functions.map(declarationOf).join('\n')}`);
 const { version } = /project\(Vantrel VERSION (?<version>[\d.]+)/.exec(read('CMakeLists.txt')).groups;
 write('package.json', `${JSON.stringify({
   ...JSON.parse(readFileSync(join(here, 'package.json'), 'utf8')), version }, null, 2)}\n`);
-copyFileSync(join(here, 'rows.js'), join(output, 'rows.js'));
-copyFileSync(join(here, 'README.md'), join(output, 'README.md'));
+for (const name of ['rows.js', 'peaks.js', 'README.md']) copyFileSync(join(here, name), join(output, name));
 copyFileSync(join(here, '../vantrel.js'), join(output, 'vantrel.js'));
 for (const name of ['module.mjs', 'module.wasm']) copyFileSync(join(module, name), join(output, name));
 for (const name of ['LICENSE', 'THIRD-PARTY.txt']) copyFileSync(join(root, name), join(output, name));

@@ -35,3 +35,13 @@ export function compare(aims: Sheet, sheet: Sheet, options?: Options, tell?: Tel
 export function run(sheets: Sheet | Sheet[], aims: Sheet, options?: Options): any;
 export function predict(sheet: Sheet, options?: Options): any;
 export function ink(sheet: Sheet, options: Options & { patch: string }): any;
+
+/** An absorption peak; band b lies at 400 + 10 b nm. */
+export interface Peak { density: number; band: number }
+/** The absorption peaks of one spectrum in order of wavelength, by a window of five bands. */
+export function findMaxDensityPoints(refl: Rows): Peak[];
+/** Which of the peaks of one spectrum borders its brightest stretch, on the side nearer to its crest. */
+export function chooseBPWavelen(refl: Rows, points: { band: number }[]): number;
+/** The density of one spectrum in a window of any width, whose middle weight is that of band `centre`: 5
+ * where the windowed sum is 0 or less, 0 where the window reaches outside the spectrum. */
+export function calculateSpecialDensity(refl: Rows, centre: number, weights: Rows): number;

@@ -54,7 +54,7 @@ export function functionsOf(wasm, table, constants) {
     return Float64Array.from(heap.subarray(begin, begin + rows * count));
   }
 
-  function run({ name, js, args, call, succeeds, reason }, given) {
+  function run({ symbol, js, args, call, succeeds, reason }, given) {
     const inputs = args.filter(({ kind }) => kind !== 'output');
     if (given.length > inputs.length)
       throw new TypeError(`${js}() takes ${inputs.length} arguments, not ${given.length}`);
@@ -77,10 +77,12 @@ export function functionsOf(wasm, table, constants) {
         step: own === 1 ? 0 : count * SIZES[type], weights: kind === 'weights' };
     });
     reserve(size);
-    args.forEach(({ kind }, i) => {
+    args.forEach(({ kind, type, count }, i) => {
       const one = at[i];
       if (kind !== 'output' && !one.data) return;
       one.begin += arena;
+      if (kind === 'output' && type === 'int')
+        wasm.HEAP32.fill(-1, one.begin / 4, one.begin / 4 + rows * count); // what is not written
       if (one.data) wasm[HEAPS[one.type]].set(one.data, one.begin / SIZES[one.type]);
       if (one.weights) {
         const curves = [0, 1, 2, 3].map((curve) => one.begin + curve * 31 * 8);
@@ -93,7 +95,7 @@ export function functionsOf(wasm, table, constants) {
       .filter(([{ kind }]) => kind === 'output');
     const returned = new Float64Array(outputs.length ? 0 : rows);
     for (let i = 0; i < rows; ++i) {
-      const result = call(wasm[name], at, i);
+      const result = call(wasm[symbol], at, i);
       if (!outputs.length) returned[i] = result;
       else if (succeeds && !result)
         throw new RangeError(`${js}()${rows === 1 ? '' : `, row ${i}`}: ${reason}`);
