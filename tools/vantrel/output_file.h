@@ -1,4 +1,4 @@
-// Text out.
+// Text out. What is of the system is in output_file_posix.cpp and system_windows.cpp.
 #pragma once
 
 #include <string>
@@ -35,7 +35,9 @@ private:
     void open_beside(const std::string &target);
     void forget_temporary();
     void flush();
+    std::size_t put(std::string_view text); // how much of it was written
 
+    static constexpr std::size_t kBlock = 1u << 16;
     std::string path;
     std::string buffer;
     int file = -1;

@@ -30,7 +30,6 @@ namespace vantrel::program {
 namespace {
 
 constexpr std::size_t kLargestFile = 512u << 20;
-constexpr std::size_t kBlock = 1u << 16;
 constexpr int kStandardOutput = 1;
 
 using State = BY_HANDLE_FILE_INFORMATION;
@@ -162,7 +161,7 @@ std::string read_file(const std::string &path)
     if (before)
         files_read.push_back(*before);
     std::string text;
-    char block[kBlock];
+    char block[1 << 16];
     while (const std::size_t got = std::fread(block, 1, sizeof block, file.get())) {
         text.append(block, got);
         if (text.size() > kLargestFile)
@@ -185,25 +184,13 @@ OutputFile::~OutputFile()
     forget_temporary();
 }
 
-void OutputFile::write(std::string_view text)
+std::size_t OutputFile::put(std::string_view text)
 {
-    buffer += text;
-    if (buffer.size() >= kBlock)
-        flush();
-}
-
-void OutputFile::flush()
-{
-    if (file < 0)
-        open();
-    for (std::string_view rest = buffer; !rest.empty();) {
-        const int written =
-            _write(file, rest.data(), static_cast<unsigned>(std::min(rest.size(), kBlock)));
-        if (written <= 0)
-            throw OutputError{std::strerror(errno)};
-        rest.remove_prefix(static_cast<std::size_t>(written));
-    }
-    buffer.clear();
+    const int written =
+        _write(file, text.data(), static_cast<unsigned>(std::min(text.size(), kBlock)));
+    if (written <= 0)
+        throw OutputError{std::strerror(errno)};
+    return static_cast<std::size_t>(written);
 }
 
 void OutputFile::finish()

@@ -1,0 +1,178 @@
+#include "output_file.h"
+
+#include "file.h"
+#include "read/measurement.h"
+#include "read/text.h"
+
+#include <fmt/format.h>
+
+#include <cerrno>
+#include <climits>
+#include <csignal>
+#include <cstdlib>
+#include <cstring>
+#include <fcntl.h>
+#include <memory>
+#include <sys/stat.h>
+#include <unistd.h>
+
+namespace vantrel::program {
+namespace {
+
+OutputError error_now() { return {std::strerror(errno)}; }
+
+constexpr int kEnding[] = {SIGHUP, SIGINT, SIGQUIT, SIGTERM};
+
+char doomed[PATH_MAX] = ""; // the temporary file that goes when a signal ends the program
+
+extern "C" void remove_and_end(int signal)
+{
+    if (doomed[0])
+        static_cast<void>(unlink(doomed));
+    static_cast<void>(raise(signal)); // as if there were no handler, by SA_RESETHAND
+}
+
+// Makes the temporary file and has signals remove it, without a moment between.
+int make_temporary(std::string &name)
+{
+    sigset_t ending, before;
+    sigemptyset(&ending);
+    for (const int signal : kEnding)
+        sigaddset(&ending, signal);
+    sigprocmask(SIG_BLOCK, &ending, &before);
+    const int file = mkostemp(name.data(), O_CLOEXEC);
+    const int error = errno;
+    if (file >= 0) {
+        doomed[name.copy(doomed, sizeof doomed - 1)] = '\0';
+        for (const int signal : kEnding) {
+            struct sigaction action {};
+            if (sigaction(signal, nullptr, &action) == 0 && action.sa_handler != SIG_IGN) {
+                action.sa_handler = remove_and_end;
+                action.sa_flags = SA_RESETHAND;
+                sigaction(signal, &action, nullptr);
+            }
+        }
+    }
+    sigprocmask(SIG_SETMASK, &before, nullptr);
+    errno = error;
+    return file;
+}
+
+void refuse_what_was_read(const struct stat &target, const std::string &name)
+{
+    if (was_read(target))
+        throw sheets::RequestError{name + " has been read; the output would write over it"};
+}
+
+// The permissions of a new file.
+mode_t usual_mode()
+{
+    const mode_t mask = umask(0);
+    umask(mask);
+    return 0666 & ~mask;
+}
+
+} // namespace
+
+OutputFile::~OutputFile()
+{
+    if (file >= 0 && file != STDOUT_FILENO)
+        static_cast<void>(close(file));
+    if (!temporary.empty())
+        static_cast<void>(unlink(temporary.c_str()));
+    forget_temporary();
+}
+
+void OutputFile::finish()
+{
+    flush();
+    if (file == STDOUT_FILENO)
+        return;
+    // On the disk before it takes the name, so that a crash of the machine leaves no empty file.
+    if (!temporary.empty() && (fchmod(file, mode) != 0 || fsync(file) != 0))
+        throw error_now();
+    if (close(std::exchange(file, -1)) != 0)
+        throw error_now();
+    if (!temporary.empty() && std::rename(temporary.c_str(), replaced.c_str()) != 0)
+        throw error_now();
+    forget_temporary();
+}
+
+void OutputFile::forget_temporary()
+{
+    temporary.clear();
+    doomed[0] = '\0';
+}
+
+std::size_t OutputFile::put(std::string_view text)
+{
+    const ssize_t written = ::write(file, text.data(), text.size());
+    if (written < 0 && errno != EINTR)
+        throw error_now();
+    return static_cast<std::size_t>(written < 0 ? 0 : written);
+}
+
+void OutputFile::open()
+{
+    struct stat standard_output {
+    }, target{};
+    const bool has_output = fstat(STDOUT_FILENO, &standard_output) == 0;
+    const bool named = !path.empty() && path != "-";
+    const bool exists = named && stat(path.c_str(), &target) == 0;
+    if (!named || (exists && has_output && standard_output.st_dev == target.st_dev &&
+                   standard_output.st_ino == target.st_ino)) {
+        refuse_what_was_read(standard_output, "the file behind standard output");
+        file = STDOUT_FILENO;
+    } else if (!exists) { // a link to nothing is refused: it names no file yet
+        if (errno != ENOENT || lstat(path.c_str(), &target) == 0)
+            throw error_now();
+        open_beside(path);
+        mode = usual_mode();
+    } else if (!S_ISREG(target.st_mode)) {
+        file = ::open(path.c_str(), O_WRONLY | O_NOCTTY | O_CLOEXEC);
+    } else {
+        refuse_what_was_read(target, sheets::printable(path));
+        open_to_replace(target);
+    }
+    if (file < 0)
+        throw error_now();
+}
+
+void OutputFile::open_to_replace(const struct stat &target)
+{
+    struct stat name {
+    }, made{};
+    std::string real = path;
+    if (lstat(path.c_str(), &name) == 0 && S_ISLNK(name.st_mode)) { // which stays
+        const std::unique_ptr<char, decltype(&std::free)> end(realpath(path.c_str(), nullptr),
+                                                              std::free);
+        if (!end)
+            throw error_now();
+        real = end.get();
+    }
+    if (access(path.c_str(), W_OK) != 0)
+        throw error_now();
+    open_beside(real);
+    if (fstat(file, &made) != 0)
+        throw error_now();
+    if ((made.st_uid != target.st_uid || made.st_gid != target.st_gid) &&
+        fchown(file, target.st_uid, target.st_gid) != 0)
+        throw OutputError{"a new file cannot be given its owner and group; choose another name"};
+    mode = target.st_mode & 07777;
+}
+
+void OutputFile::open_beside(const std::string &target)
+{
+    replaced = target;
+    const auto slash = target.rfind('/');
+    const std::string folder = slash == std::string::npos ? "" : target.substr(0, slash + 1);
+    std::string name = folder + ".vantrel.XXXXXX"; // of no more characters where the name has 255
+    file = make_temporary(name);
+    if (file < 0)
+        throw OutputError{fmt::format("no file can be made in its folder {}: {}",
+                                      folder.empty() ? "." : sheets::printable(folder),
+                                      std::strerror(errno))};
+    temporary = name;
+}
+
+} // namespace vantrel::program
