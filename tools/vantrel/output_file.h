@@ -42,7 +42,7 @@ private:
     std::string buffer;
     int file = -1;
     std::string temporary, replaced; // both empty where the file is written straight
-    mode_t mode = 0;                 // that the file will have
+    unsigned mode = 0;               // that the file will have
 };
 
 } // namespace vantrel::program

@@ -10,7 +10,7 @@
 #include <fmt/format.h>
 
 #define WIN32_LEAN_AND_MEAN
-#define NOMINMAX
+#define NOMINMAX 1
 #include <windows.h>
 
 #include <shellapi.h>
@@ -56,7 +56,8 @@ std::string utf8(const wchar_t *text)
 // Nothing where it is no file on a disk.
 std::optional<State> state_of(int file)
 {
-    const auto handle = reinterpret_cast<HANDLE>(_get_osfhandle(file));
+    auto *const handle = reinterpret_cast<HANDLE>( // NOLINT(performance-no-int-to-ptr)
+        _get_osfhandle(file));
     State state{};
     if (GetFileType(handle) != FILE_TYPE_DISK || !GetFileInformationByHandle(handle, &state))
         return std::nullopt;
@@ -138,8 +139,7 @@ void prepare(char **&words)
 // A console that understands escape sequences.
 bool is_terminal(Stream stream)
 {
-    const HANDLE handle =
-        GetStdHandle(stream == Stream::output ? STD_OUTPUT_HANDLE : STD_ERROR_HANDLE);
+    HANDLE handle = GetStdHandle(stream == Stream::output ? STD_OUTPUT_HANDLE : STD_ERROR_HANDLE);
     DWORD mode = 0;
     return GetConsoleMode(handle, &mode) &&
            SetConsoleMode(handle, mode | ENABLE_VIRTUAL_TERMINAL_PROCESSING);
