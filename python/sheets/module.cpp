@@ -81,6 +81,8 @@ std::string answer_of(std::string_view command, const std::vector<Measurement> &
     }
     if (command == "predict")
         return predict(sheets.at(0), options);
+    if (command == "ink")
+        return ink(sheets.at(0), options);
     return report({&sheets.at(0)}, sheets.size() > 1 ? &sheets[1] : nullptr, options);
 }
 

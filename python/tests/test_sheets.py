@@ -3,6 +3,7 @@
 import dataclasses
 import os
 import pickle
+import re
 import shlex
 import subprocess
 import warnings
@@ -14,6 +15,7 @@ import numpy as np
 import pytest
 
 import vantrel
+from vantrel._sheet import in_python
 
 LIBRARY = Path(__file__).resolve().parents[1] / "library"
 EXAMPLE = LIBRARY / "examples/two_ink_halftone.txt"
@@ -24,6 +26,13 @@ WIDE += "NUMBER_OF_SETS 2\nBEGIN_DATA\n"
 WIDE += "A1 <b>&grey 101.5 51 1 2 " + " ".join(f"{0.2 + i / 100:.2f}" for i in range(33)) + "\n"
 WIDE += "A2 black 40 11 3 4 " + " ".join(f"{0.02 + i / 1000:.3f}" for i in range(33)) + "\n"
 WIDE += "END_DATA\n"
+SPOT = '<ReflectanceSpectrum ColorSpecification="{0}" StartWL="400">' + "0.{1} " * 31 + "</ReflectanceSpectrum>"
+SPECIFICATION = """<ColorSpecification Id="{0}"><MeasurementSpec><WavelengthRange Increment="10"/>
+<Device><DeviceIllumination>{0}_Light</DeviceIllumination></Device></MeasurementSpec></ColorSpecification>"""
+LIBRARY_OF_SPOTS = f"""<CxF xmlns="http://colorexchangeformat.com/CxF3-core"><Resources><ObjectCollection>
+<Object ObjectType="Standard" Name="Spot" Id="1"><ColorValues>{SPOT.format("M0", 4)}{SPOT.format("M1", 5)}
+</ColorValues></Object></ObjectCollection><ColorSpecificationCollection>{SPECIFICATION.format("M0")}
+{SPECIFICATION.format("M1")}</ColorSpecificationCollection></Resources></CxF>"""
 COLOURS = "name,L,a,b\npaper,95,0,-2\nmagenta,48,75,-4\n"
 
 
@@ -66,6 +75,19 @@ def test_colours_alone_are_a_sheet_too():
     assert sheet.lab[1].tolist() == [48, 75, -4] and "magenta" in sheet._repr_html_()
     with pytest.raises(KeyError, match="colours alone"):
         sheet["paper"]
+    assert "L*a*b* for F7_2DEG" in replace(sheet, lab_illuminant=vantrel.IllumObs.F7_2DEG)._repr_html_()
+
+
+def test_a_library_of_spots_has_no_paper_and_two_conditions():
+    with warnings.catch_warnings():
+        warnings.simplefilter("ignore")
+        sheets = [vantrel.reads(LIBRARY_OF_SPOTS.encode(), condition=c) for c in ("M0", "M1")]
+        comparison = vantrel.compare(*[replace(sheet, file="spots.cxf") for sheet in sheets])
+    assert [(s.collection, s.source.condition, s["Spot"][0]) for s in sheets] == [
+        (True, "M0", 40),
+        (True, "M1", 50),
+    ]
+    assert "spots.cxf (M0)" in str(comparison) and "spots.cxf (M1)" in str(comparison)
 
 
 @pytest.mark.parametrize(
@@ -163,8 +185,23 @@ ASKED = [
         " --tolerance 1.25 --tolerances LIBRARY/examples/proof.toml --substrate-corrected --allow-missing",
     ),
     (
-        lambda sheet, darker: vantrel.compare(sheet, darker, paper="1", pair="id", force_pairs=True),
-        "compare EXAMPLE darker.txt --paper 1 --pair id --force-pairs",
+        lambda sheet, darker: vantrel.compare(
+            sheet, darker, paper="1", pair="id", force_pairs=True, advice=True
+        ),
+        "compare EXAMPLE darker.txt --paper 1 --pair id --force-pairs --advice",
+    ),
+    (
+        lambda sheet, _: vantrel.ink(
+            sheet,
+            "Magenta 100 Yellow 100",
+            against="6",
+            illuminant=0,
+            status="I",
+            paper="1",
+            order=["CMYK_Y", "CMYK_M"],
+        ),
+        "ink EXAMPLE --patch 'Magenta 100 Yellow 100' --against 6 --illuminant A_2DEG --status I_STATUS"
+        " --paper 1 --order CMYK_Y,CMYK_M",
     ),
     (
         lambda sheet, _: vantrel.predict(sheet, order=["CMYK_Y", "CMYK_M"], status="A"),
@@ -259,6 +296,7 @@ def test_what_is_written_reads_back(sheet, tmp_path):
 def test_a_sheet_shows_what_it_is(sheet):
     page = sheet._repr_html_()
     assert page.count("rgb(243, 242, 240)") == 1 and "<td>95.48</td><td>0.04</td><td>1.11</td>" in page
+    assert "L*a*b* for D50_2DEG" in page
     assert "two_ink_halftone.txt: 31 patches, reflectance" in repr(sheet)
     library = vantrel.report(replace(sheet, collection=True, device={}))
     assert (library.paper.name, library.paper.chosen) == (None, "a collection of colours")
@@ -275,7 +313,7 @@ def test_a_sheet_shows_what_it_is(sheet):
         (lambda s: vantrel.compare(s, s, formula=["de2000"] * 2), "named twice"),
         (lambda s: vantrel.compare(s, s, tolerances=EXAMPLE), "two_ink_halftone.txt:1: "),
         (lambda s: vantrel.predict(s, inks={"CMYK_M": 40.5}), "whole percentage"),
-        (lambda s: vantrel.predict(replace(s, device={})), "name inks with ink="),
+        (lambda s: vantrel.predict(replace(s, device={})), "name inks with inks="),
         (lambda s: vantrel.report(replace(s, spectra=s.spectra[:, :30])), "spectra: the shape"),
         (lambda s: vantrel.report(replace(s, spectra=s.spectra * np.nan)), "spectra: numbers"),
         (lambda s: vantrel.report(replace(s, ids=[])), "31 names, 0 ids"),
@@ -289,6 +327,16 @@ def test_a_sheet_shows_what_it_is(sheet):
 def test_what_cannot_be_said_says_why(call, reason, sheet):
     with pytest.raises(ValueError, match=reason):
         call(sheet)
+
+
+def test_texts_name_the_arguments_and_leave_names_alone():
+    for source in (LIBRARY / "sheets").rglob("*.cpp"):
+        for text in re.findall(r'"([^"\n]*--[a-z][^"\n]*)"', source.read_text()):
+            assert "--" not in in_python(text), text
+    text = "my--paper.txt: a “--paper” and --paper-white; --pair auto, --force-pairs or --ink"
+    assert in_python(text) == (
+        'my--paper.txt: a “--paper” and --paper-white; pair="auto", force_pairs= or inks='
+    )
 
 
 def test_figures_show_what_the_sheet_has(sheet, darker):

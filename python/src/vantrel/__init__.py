@@ -146,9 +146,10 @@ from ._constants import (
 )
 from ._resample import resample
 from ._sheet import Origin, Sheet, Source, read, reads
+from ._ink import Ink
 from ._results import Comparison, Predictions, Report
 from ._run import Run
-from ._judge import compare, predict, report, run
+from ._judge import compare, ink, predict, report, run
 
 __version__ = ufuncs.version
 __all__ = [name for name in dir() if not name.startswith("_")]  # what help() lists

@@ -12,7 +12,8 @@ from numpy.typing import ArrayLike, NDArray
 
 from . import plot as plot
 from ._enums import IllumObs as IllumObs, Response as Response, Status as Status
-from ._judge import compare as compare, predict as predict, report as report, run as run
+from ._ink import Ink as Ink
+from ._judge import compare as compare, ink as ink, predict as predict, report as report, run as run
 from ._results import Comparison as Comparison, Predictions as Predictions, Report as Report
 from ._run import Run as Run
 from ._sheet import Origin as Origin, Sheet as Sheet, Source as Source, read as read, reads as reads
@@ -91,8 +92,8 @@ ufuncs: Any
 den_weight: NDArray[np.int64]
 
 __all__ = [
-    "CIEDE2000", "Comparison", "IllumObs", "Origin", "Predictions", "Report", "Response", "Run",
-    "Sheet", "Source", "Status", "adjust_for_paper_refls", "calc_labch",
+    "CIEDE2000", "Comparison", "IllumObs", "Ink", "Origin", "Predictions", "Report", "Response",
+    "Run", "Sheet", "Source", "Status", "adjust_for_paper_refls", "calc_labch",
     "calculate_ccr_densities", "calculate_special_density", "calculate_spectral_density",
     "calculate_spectralx_density", "calculate_tint_color", "choose_bp_wavelen",
     "cie_yxy_to_white_e313_98", "cielab_to_cielch", "cielab_to_cielch_ex", "cielch_to_cielab",
@@ -107,9 +108,9 @@ __all__ = [
     "estimate_tint_color", "find_density_max", "find_density_min", "find_max_density_points",
     "get_achromatic_constants", "get_hexachrome_constants", "get_hifi_constants",
     "get_normalized_density_weights", "get_num_illuminant_observers", "get_num_responses",
-    "get_num_status_responses", "get_num_statuses", "get_spectralx_constants", "is_chromatic",
-    "is_chromatic_lch", "lab_to_de2000", "lab_to_de2000_ex", "lab_to_de94", "lab_to_de_cmc",
-    "lab_to_de_lab", "lab_to_dh", "lab_to_xyz", "metamerism", "plot",
+    "get_num_status_responses", "get_num_statuses", "get_spectralx_constants", "ink",
+    "is_chromatic", "is_chromatic_lch", "lab_to_de2000", "lab_to_de2000_ex", "lab_to_de94",
+    "lab_to_de_cmc", "lab_to_de_lab", "lab_to_dh", "lab_to_xyz", "metamerism", "plot",
     "pol_determine_density_response", "pol_refl_adjust", "pol_refl_auto_adjust",
     "pol_refl_to_densities", "pol_refl_to_density", "pol_refl_to_dot_area",
     "pol_refl_to_dot_gain", "pol_refl_to_hue_gray", "pol_refl_to_print_contrast",

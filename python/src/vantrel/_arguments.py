@@ -7,6 +7,7 @@ into.
 import difflib
 import warnings
 from enum import IntEnum
+from typing import Any
 
 import numpy as np
 
@@ -43,7 +44,7 @@ def as_array(value, name):
             "in percent: quantity.to('percent').magnitude"
         )
     value = numbers_of_pandas(value) if library_of(value) == "pandas" else as_numpy(value)
-    dtype = getattr(value, "dtype", type(value).__name__)
+    dtype: Any = getattr(value, "dtype", type(value).__name__)
     if getattr(dtype, "kind", None) not in tuple("fiub"):
         raise ValueError(f"{name}: numbers are needed, not {dtype}")
     inside = value.variable.data if library_of(value) == "xarray" else value

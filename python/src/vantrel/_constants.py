@@ -1,6 +1,7 @@
 """What can be set, in this process, for all threads."""
 
 import contextlib
+from typing import Any, Callable, Dict
 
 import numpy as np
 
@@ -256,7 +257,7 @@ def settings(*, hifi=None, hexachrome=None, spectralx=None, achromatic=None):
     0.071
     """
     kept = _ufuncs.get_settings()
-    asked = {
+    asked: Dict[Callable[..., None], Any] = {
         set_hifi_constants: hifi,
         set_hexachrome_constants: hexachrome,
         set_spectralx_constants: spectralx,

@@ -1,6 +1,7 @@
 """What a declaration says of a function, and the call of its ufunc on NumPy arrays."""
 
 import inspect
+from typing import Any, Dict
 
 import numpy as np
 
@@ -34,7 +35,7 @@ class Declared:
         self.outputs = outputs
         self.parameters = list(inspect.signature(declaration).parameters.values())
         self.ufunc = getattr(_ufuncs, self.name)
-        self.flagged = getattr(_ufuncs, self.name + "_ok", None)
+        self.flagged: Any = getattr(_ufuncs, self.name + "_ok", None)
         self.signature = _signature(self.ufunc)
         inputs, _, results = self.signature.partition("->")
         self.cores = _cores(inputs)
@@ -110,13 +111,13 @@ class Declared:
                 return None
         if not percent:
             return None
-        key = tuple(key)
-        seen = self.seen.get(key)
+        called = tuple(key)
+        seen = self.seen.get(called)
         if seen is None:
             values = zip(self.prepare(self.bind(args, {})), self.dtypes)
             seen = [np.asarray(*v) for v in values], [i for i, k in enumerate(key) if k is _HANDED_ON]
             if len(self.seen) < _MOST_REMEMBERED:
-                self.seen[key] = seen
+                self.seen[called] = seen
         prepared = seen[0].copy()
         for i in seen[1]:
             prepared[i] = args[i]
@@ -150,7 +151,7 @@ def _last(kind, core):
     return tuple(int(d) if d.isdigit() else BANDS for d in core)
 
 
-DECLARED = {}
+DECLARED: Dict[str, Any] = {}
 
 
 def evaluate(name, ok, *values, out=None, missing=()):

@@ -97,7 +97,7 @@ def function(*outputs):
             inspect.Parameter(name, inspect.Parameter.KEYWORD_ONLY, default=default)
             for name, default in keywords.items()
         ]
-        call.__signature__ = inspect.Signature(declared.parameters + extra)
+        vars(call)["__signature__"] = inspect.Signature(declared.parameters + extra)
         return call
 
     return make

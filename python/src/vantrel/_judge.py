@@ -1,4 +1,4 @@
-"""What the program's commands say of sheets: report, compare, predict, run."""
+"""What the program's commands say of sheets: report, compare, predict, ink, run."""
 
 import functools
 import json
@@ -11,6 +11,7 @@ import numpy as np
 
 from ._arguments import INDICES
 from ._enums import IllumObs, Status
+from ._ink import Ink
 from ._results import Comparison, Predictions, Report
 from ._run import Run
 from ._sheet import Sheet, extension, in_python, read
@@ -318,6 +319,55 @@ def predict(
         pairs: List[Tuple[str, float]] = [*(inks.items() if isinstance(inks, Mapping) else inks)]
         options["ink"] = [[name, percent] for name, percent in pairs]
     result: Predictions = _result(Predictions, "predict", [sheet], options)
+    return result
+
+
+def ink(
+    sheet: Sheet,
+    patch: str,
+    *,
+    against: Optional[str] = None,
+    illuminant: Optional[Illuminant] = None,
+    status: StatusName = "E",
+    paper: Optional[str] = None,
+    order: Optional[Sequence[str]] = None,
+) -> Ink:
+    """One patch under every status and illuminant, alone or beside another, as `vantrel ink`.
+
+    Parameters
+    ----------
+    sheet : Sheet
+    patch : str
+        Its name or id.
+    against : str, optional
+        The name or id of another patch.
+    illuminant, status, paper, order
+        As of report().
+
+    Returns
+    -------
+    ink : Ink
+        What is odd becomes warnings.
+
+    Raises
+    ------
+    ValueError
+        Where the sheet does not hold what is asked for.
+
+    Examples
+    --------
+    >>> sheet = vantrel.read("examples/two_ink_halftone.txt")
+    >>> ink = vantrel.ink(sheet, "Magenta 100", against="Magenta 90")
+    >>> round(ink.statuses[3].densities["Green"], 3), round(ink.against.de00, 2)
+    (0.44, 1.54)
+    """
+    options = {
+        **_usual(illuminant, status, paper),
+        "patch": patch,
+        "against": against,
+        "order": None if order is None else [*order],
+    }
+    result: Ink = _result(Ink, "ink", [sheet], options)
     return result
 
 

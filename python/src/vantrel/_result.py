@@ -20,7 +20,7 @@ def made(kind: Any, value: Any) -> Any:
     """What JSON holds, as the dataclass, tuple, dictionary or plain value that `kind` asks for."""
     if value is None:
         return None
-    if is_dataclass(kind):
+    if isinstance(kind, type) and is_dataclass(kind):
         hints = _hints(kind)
         known = {name: made(hint, value[name]) for name, hint in hints.items() if name in value}
         if "delta_e" in hints:  # members that go by the names of the formulas

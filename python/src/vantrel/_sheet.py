@@ -20,6 +20,22 @@ Condition = Optional[Literal["M0", "M1", "M2", "M3"]]
 _SCALES = {"automatic": 0, "percent": 1, "fraction": 2}
 _MOST_SHOWN = 200  # patches in a notebook
 
+# What the program's texts name after two hyphens; those that a patch or a file has in its name stay.
+_OPTIONS = {
+    "format html: this program": "to_html(): this package",
+    "format json": "to_dict()",
+    "ink": "inks=",
+    "pair auto": 'pair="auto"',
+    **{
+        option: option.replace("-", "_") + "="
+        for option in (
+            "advice", "condition", "force-pairs", "illuminant", "pair", "paper", "scale",
+            "substrate-corrected",
+        )
+    },
+}
+_OPTION = re.compile(rf"(?<!\S)--({'|'.join(_OPTIONS)})(?![\w-])")
+
 
 @dataclass(frozen=True)
 class Source:
@@ -27,7 +43,7 @@ class Source:
 
     `averaged`: several of its values make a band. `interpolated`: they are 20 nm apart. `held`: the
     last value stands for bands outside their range. `scaled`: they are not in percent there, and
-    `scale_by` says what told so. `condition`: M0 to M3 (ISO 13655), "" where the file does not say.
+    `scale_by` says what told so: a keyword, the kind of file, "values" or the option "--scale". `condition`: M0 to M3 (ISO 13655), "" where the file does not say.
     """
 
     first_nm: float
@@ -122,7 +138,8 @@ class Sheet:
         """The spectrum of a patch, by its name or id."""
         if self.spectra is None:
             raise KeyError(f"{name!r} has no spectrum: the file holds colours alone")
-        return self.spectra[self.index(name)]
+        spectrum: NDArray[np.float64] = self.spectra[self.index(name)]
+        return spectrum
 
     def to_pandas(self) -> Any:
         """A DataFrame: id, name, device values, the spectrum by wavelength, L*a*b* of the file."""
@@ -159,10 +176,10 @@ class Sheet:
 
     def _colours(self) -> Any:
         """(L*a*b*, what it is for) of the patches that a notebook shows."""
-        if self.spectra is None:
-            stated = self.lab_illuminant.name if self.lab_illuminant is not None else ""
-            return self.lab[:_MOST_SHOWN], stated or self.lab_stated
-        return refl_to_cielab(self.spectra[:_MOST_SHOWN]), "D50_2DEG"
+        if self.spectra is not None:
+            return refl_to_cielab(self.spectra[:_MOST_SHOWN]), "D50_2DEG"
+        stated = self.lab_illuminant.name if self.lab_illuminant is not None else ""
+        return np.asarray(self.lab)[:_MOST_SHOWN], stated or self.lab_stated
 
     def _repr_html_(self) -> str:
         lab, light = self._colours()
@@ -191,7 +208,7 @@ class Sheet:
 def extension() -> Any:
     """The extension module of measurement files."""
     try:
-        from . import _sheets
+        from . import _sheets  # type: ignore[attr-defined]
     except ImportError:
         raise NotImplementedError("vantrel was built without the reader of measurement files")
     return _sheets
@@ -205,7 +222,7 @@ def srgb(lab: Any) -> NDArray[np.uint8]:
 
 def in_python(text: str) -> str:
     """Text of the program with its options as arguments: "--force-pairs" as "force_pairs="."""
-    return re.sub(r"--([a-z][a-z-]*)", lambda found: found[1].replace("-", "_") + "=", text)
+    return re.sub(_OPTION, lambda found: _OPTIONS[found[1]], text)
 
 
 def _array(buffer: Any, *shape: int) -> NDArray[np.float64]:

@@ -78,7 +78,7 @@ def wavelengths_of(labels):
         return None
     if labels.dtype.kind in "OUT":
         found = [_LABEL.fullmatch(str(label).strip()) for label in labels]
-        return np.array([float(m.group(1)) for m in found]) if all(found) else None
+        return np.array([float(m.group(1)) for m in found if m]) if all(found) else None
     if labels.dtype.kind not in "fiu" or np.array_equal(labels, np.arange(labels.size)):
         return None
     return labels.astype(np.float64)
@@ -86,8 +86,8 @@ def wavelengths_of(labels):
 
 def _is_spectral(name, labels):
     nm = None if labels is None else wavelengths_of(labels)
-    several = nm is not None and nm.size > 1 and 300 <= nm.min() and nm.max() <= 1100
-    return several and nm.max() > 600 or str(name).lower() in _NAMES
+    spectral = nm is not None and nm.size > 1 and 300 <= nm.min() and 600 < nm.max() <= 1100
+    return spectral or str(name).lower() in _NAMES
 
 
 def _refuse_turned(dims, last, name):

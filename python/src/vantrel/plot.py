@@ -8,7 +8,7 @@ perfect white is white.
     vantrel.plot.ab_plane(vantrel.read("sheet.cxf")).figure.savefig("gamut.png")
 """
 
-from typing import Any, List, Optional, Sequence, Tuple, Union
+from typing import Any, Iterable, List, Optional, Sequence, Tuple, Union
 
 import numpy as np
 from numpy.typing import NDArray
@@ -42,7 +42,7 @@ def _lab(sheet: Union[Sheet, Report]) -> NDArray[np.float64]:
     return np.asarray(refl_to_cielab(sheet.spectra, "D50_2DEG"))
 
 
-def hull(points: Sequence[Tuple[float, float]]) -> List[Tuple[float, float]]:
+def hull(points: Iterable[Tuple[float, float]]) -> List[Tuple[float, float]]:
     """The corners of the convex hull, against the clock (Andrew's monotone chain)."""
     ordered = sorted({(float(x), float(y)) for x, y in points})
 
