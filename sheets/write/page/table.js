@@ -105,6 +105,6 @@ export function searchTable({ caption, noun, columns, rows, colour, text, onChoo
   return h('section', { class: 'patches' },
     h('div', { class: 'bar' }, h('h3', {}, caption), search, status),
     h('div', { class: 'scroll', tabindex: '0', role: 'region', 'aria-label': caption },
-      h('table', {}, h('thead', {}, h('tr', {}, heads)), body)),
+      h('table', { 'aria-label': caption }, h('thead', {}, h('tr', {}, heads)), body)),
     pager);
 }
