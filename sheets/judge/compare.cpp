@@ -1,5 +1,6 @@
 #include "judge/compare.h"
 
+#include "judge/compare_doubts.h"
 #include "judge/control.h"
 #include "judge/densitometer.h"
 #include "judge/inks.h"
@@ -19,8 +20,6 @@ namespace vantrel::sheets {
 namespace {
 
 constexpr std::size_t kMostWorst = 10;
-constexpr double kFarOff = 3;   // a colour difference that is no scatter
-constexpr double kWideMean = 1; // as for the patches of a paper, in ΔE00
 
 // One of the two sheets.
 struct Sheet {
@@ -242,88 +241,12 @@ void warn_of_papers(Comparison &comparison)
     }
 }
 
-void warn_of_conditions(const Measurement &reference, const Measurement &sample,
-                        std::vector<std::string> &warnings)
-{
-    const std::string &first = reference.source.condition, &second = sample.source.condition;
-    if (!first.empty() && !second.empty() && first != second)
-        warnings.push_back(fmt::format("{} was measured under {}, {} under {}", reference.file,
-                                       first, sample.file, second));
-}
-
 std::vector<Unpaired> unpaired_of(const Measurement &sheet, const std::vector<std::size_t> &places)
 {
     std::vector<Unpaired> out;
     for (const std::size_t place : places)
         out.push_back({sheet.patches[place].id, sheet.patches[place].name});
     return out;
-}
-
-// Where most aims serve several patches, one in each zone, say, and some another number that is no
-// multiple of it.
-void warn_of_uneven(const Pairs &pairs, const Measurement &reference, const Measurement &sample,
-                    std::vector<std::string> &warnings)
-{
-    std::map<std::size_t, std::size_t> served, often; // patches of an aim; aims of as many patches
-    for (const Pair &pair : pairs.matched)
-        served[pair.reference.front()] += pair.sample.size();
-    for (const auto &[aim, patches] : served)
-        ++often[patches];
-    // Of counts that are as frequent, the largest.
-    const std::size_t most =
-        std::max_element(often.rbegin(), often.rend(), [](const auto &first, const auto &second) {
-            return first.second < second.second;
-        })->first;
-    std::string others;
-    std::size_t aims = 0;
-    for (const auto &[aim, patches] : served)
-        if (patches % most != 0 && ++aims <= 3)
-            others += fmt::format("{}{} ({})", others.empty() ? "" : ", ",
-                                  in_quotes(reference.patches[aim].name), patches);
-    if (aims > 0)
-        warnings.push_back(fmt::format("{}: most aims have {} patches, {} another number: {}{}",
-                                       sample.file, most, aims, others, aims > 3 ? ", …" : ""));
-}
-
-void warn_of_wide_means(const std::optional<Means> &means, const std::string &file,
-                        std::vector<std::string> &warnings)
-{
-    if (means && means->spread > kWideMean)
-        warnings.push_back(fmt::format("{}: the {} patches of {} are up to ΔE00 {:.2f} from their "
-                                       "mean, which is judged",
-                                       file, means->repeats, in_quotes(means->widest),
-                                       means->spread));
-}
-
-// Two measurements of one patch never agree to the last digit.
-void warn_of_same(Comparison &out)
-{
-    const auto same = [](const PairReport &pair) {
-        return pair.reference.refl && pair.reference.refl == pair.sample.refl;
-    };
-    if (!out.pairs.empty() && std::all_of(out.pairs.begin(), out.pairs.end(), same))
-        out.warnings.push_back(fmt::format(
-            "{} and {} hold the same spectra to the last digit, as one measurement does",
-            out.reference, out.sample));
-}
-
-// Two of the worst pairs that would agree if their samples changed places.
-void warn_of_exchanged(Comparison &out)
-{
-    const Metric &metric = out.metrics[0];
-    for (std::size_t i = 0; i < out.worst.size(); ++i)
-        for (std::size_t j = i + 1; j < out.worst.size(); ++j) {
-            const PairReport &one = out.pairs[out.worst[i]], &other = out.pairs[out.worst[j]];
-            const double own = std::min(one.delta_e[0], other.delta_e[0]);
-            const double exchanged =
-                std::max(metric(one.reference.colour.lab, other.sample.colour.lab),
-                         metric(other.reference.colour.lab, one.sample.colour.lab));
-            if (own > kFarOff && exchanged < own / 3)
-                out.warnings.push_back(fmt::format(
-                    "{}: {} and {} would agree with each other's aim: are their rows "
-                    "exchanged?",
-                    out.sample, in_quotes(one.sample.name), in_quotes(other.sample.name)));
-        }
 }
 
 std::vector<SolidAdvice> advice_of(const std::vector<PairReport> &pairs,
@@ -436,6 +359,7 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
     if (!request.pairing.zones) // which differ
         warn_of_wide_means(out.sample_means, sample.file, out.warnings);
     warn_of_same(out);
+    warn_of_misfit(out);
     warn_of_exchanged(out);
     return out;
 }

@@ -3,11 +3,17 @@
 #include "judge/densitometer.h"
 #include "judge/inks.h"
 #include "judge/names.h"
+#include "judge/repeats.h"
+#include "read/text.h"
+
+#include <fmt/format.h>
 
 #include <utility>
 
 namespace vantrel::sheets {
 namespace {
+
+constexpr std::size_t kMostIds = 8;
 
 StatusReading under_status(const Spectrum &refl, const Spectrum &paper, int status)
 {
@@ -39,6 +45,24 @@ IlluminantReading under_illuminant(const Spectrum &refl, const Spectrum *other, 
     return out;
 }
 
+// The mean of the patches of this name, with a warning where there are several.
+std::shared_ptr<const Patch> patch_of(const Measurement &sheet, const std::string &name,
+                                      ILLUM_OBS illuminant, std::vector<std::string> &warnings)
+{
+    const std::vector<std::size_t> places = places_named(sheet, name);
+    Repeats mean = mean_of(sheet, places, illuminant);
+    if (places.size() > 1) {
+        std::vector<std::string_view> ids;
+        for (std::size_t i = 0; i < places.size() && i < kMostIds; ++i)
+            ids.emplace_back(sheet.patches[places[i]].id);
+        warnings.push_back(fmt::format(
+            "{}: the mean of the {} patches {} is taken (ids {}{}), up to ΔE00 {:.2f} from each",
+            sheet.file, places.size(), in_quotes(name), fmt::join(ids, ", "),
+            places.size() > kMostIds ? ", …" : "", *mean.spread));
+    }
+    return std::make_shared<const Patch>(std::move(mean.patch));
+}
+
 } // namespace
 
 PatchStudy study_of(Measurement measurement, const InkRequest &request)
@@ -48,14 +72,18 @@ PatchStudy study_of(Measurement measurement, const InkRequest &request)
     std::vector<std::string> warnings = reading_warnings(sheet);
     const IlluminantChoice illuminant = illuminant_for(request.illuminant, {&sheet}, warnings);
     const Paper paper = paper_of(sheet, request.paper, illuminant, warnings);
-    const Patch &patch = patch_named(sheet, request.patch);
-    const Patch *other = request.against.empty() ? nullptr : &patch_named(sheet, request.against);
+    const auto kept_patch = patch_of(sheet, request.patch, illuminant, warnings);
+    const Patch &patch = *kept_patch;
+    const auto other =
+        request.against.empty() ? nullptr : patch_of(sheet, request.against, illuminant, warnings);
     const Inks inks(sheet, request.order);
     const Conditions conditions{sheet, inks, paper, illuminant, request.status};
     PatchStudy out{.sheet = kept,
                    .illuminant = illuminant,
                    .status = request.status,
                    .paper = paper.choice,
+                   .kept = kept_patch,
+                   .kept_against = other,
                    .patch = patch_report(patch, conditions),
                    .as_paper = paper_report({{patch.name, "by name"}, patch.refl, {}}, illuminant),
                    .statuses = {},

@@ -38,6 +38,7 @@ struct PatchStudy {
     IlluminantChoice illuminant;
     int status;
     PaperChoice paper;
+    std::shared_ptr<const Patch> kept, kept_against; // of several patches the mean
     PatchReport patch;
     PaperReport as_paper; // brightness and whiteness of this patch
     std::array<StatusReading, NUM_STATUSES> statuses;
@@ -47,7 +48,7 @@ struct PatchStudy {
 };
 
 struct InkRequest {
-    std::string patch;                   // by name or id
+    std::string patch;                   // by name or id; of several their mean
     std::string against;                 // likewise; none where it is empty
     std::optional<ILLUM_OBS> illuminant; // as the file states where it is empty, or else D50
     int status = E_STATUS;

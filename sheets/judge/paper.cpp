@@ -27,16 +27,6 @@ template <typename Condition> Places places_where(const Measurement &sheet, Cond
     return out;
 }
 
-Places places_named(const Measurement &sheet, std::string_view name)
-{
-    Places out = places_where(sheet, [&](const Patch &patch) { return patch.name == name; });
-    if (out.empty())
-        out = places_where(sheet, [&](const Patch &patch) { return patch.id == name; });
-    if (out.empty())
-        patch_named(sheet, name); // throws
-    return out;
-}
-
 // The largest RGB value of a scale, where the sheet's values reach its end.
 std::optional<double> white_of_rgb(const Measurement &sheet)
 {

@@ -4,6 +4,7 @@
 #include "judge/densitometer.h"
 #include "judge/names.h"
 #include "judge/tone_value.h"
+#include "read/text.h"
 
 #include <fmt/format.h>
 
@@ -61,24 +62,32 @@ MetamerismReport metamerism_of(const Measurement &sheet, const Paper &paper, ILL
                                const ReportRequest &request, std::vector<std::string> &warnings)
 {
     const Measurement &other = request.second_sheet ? *request.second_sheet : sheet;
-    for (const Measurement *one : {&sheet, &other})
-        if (one->kind == Kind::colours)
-            throw RequestError{
-                fmt::format("{} holds colours alone, and metamerism takes spectra", one->file)};
-    require_paper(paper.choice, sheet.file, "metamerism");
-    if (request.second_sheet)
+    require_paper(paper.choice, sheet.file, "--second-paper");
+    if (request.second_sheet) {
         for (const std::string &warning : reading_warnings(other))
             warnings.push_back(warning);
+        if (other.kind == Kind::colours)
+            illuminant_for(illuminant, {&other}, warnings);
+    }
     const Paper second = paper_of(other, request.second_paper, illuminant, warnings);
-    require_paper(second.choice, other.file, "metamerism");
+    require_paper(second.choice, other.file, "--second-paper");
     MetamerismReport out{.file = request.second_sheet ? other.file : "",
                          .paper = second.choice,
                          .illuminant = request.second_illuminant.value_or(usual_second(illuminant)),
                          .de00 = delta_e00(lab_of(paper, illuminant), lab_of(second, illuminant)),
-                         .sum = 0,
-                         .din6172 = 0};
-    Metamerism(paper.refl.data(), second.refl.data(), illuminant, out.illuminant, &out.sum);
-    ReflToDIN6172(paper.refl.data(), second.refl.data(), illuminant, out.illuminant, &out.din6172);
+                         .sum = {},
+                         .din6172 = {}};
+    for (const Measurement *one : {&sheet, &other})
+        if (one->kind == Kind::colours) {
+            warnings.push_back(fmt::format(
+                "{} holds colours alone: there is no metamerism, which takes spectra", one->file));
+            return out;
+        }
+    double sum = 0, din6172 = 0;
+    Metamerism(paper.refl.data(), second.refl.data(), illuminant, out.illuminant, &sum);
+    ReflToDIN6172(paper.refl.data(), second.refl.data(), illuminant, out.illuminant, &din6172);
+    out.sum = sum;
+    out.din6172 = din6172;
     return out;
 }
 
@@ -169,6 +178,36 @@ PaperReport paper_report(const Paper &paper, ILLUM_OBS illuminant)
 
 namespace {
 
+// Patches of the same device values that stand several times, one in each zone, say, and some of
+// them once less.
+void warn_of_lost_repeats(const Measurement &sheet, const Inks &inks,
+                          std::vector<std::string> &warnings)
+{
+    struct Repeated {
+        const Patch *first;
+        std::size_t count;
+    };
+    std::map<Tints, Repeated> patches;
+    for (const Patch &patch : sheet.patches)
+        if (const auto tints = inks.tints_of(patch))
+            ++patches.try_emplace(*tints, Repeated{&patch, 0}).first->second.count;
+    std::map<std::size_t, std::vector<const Patch *>> often; // the first of each, by their count
+    for (const auto &[tints, repeated] : patches)
+        often[repeated.count].push_back(repeated.first);
+    for (const auto &[count, whole] : often) {
+        const auto less = often.find(count - 1);
+        if (count < 3 || less == often.end() || 3 * whole.size() < patches.size() ||
+            10 * (whole.size() + less->second.size()) < 8 * patches.size())
+            continue;
+        std::string names;
+        for (std::size_t i = 0; i < less->second.size() && i < 3; ++i)
+            names += (i ? ", " : "") + in_quotes(less->second[i]->name);
+        warnings.push_back(fmt::format("{}: {} patches stand {} times, and {} once less: {}{}",
+                                       sheet.file, whole.size(), count, less->second.size(), names,
+                                       less->second.size() > 3 ? ", …" : ""));
+    }
+}
+
 // For the solids, by the mean of the patches of each, as compare() gives it.
 void add_advice(Report &report, const ReportRequest &request)
 {
@@ -222,6 +261,7 @@ Report report_of(Measurement measurement, const ReportRequest &request)
     for (const PatchReport &patch : report.patches)
         densities.push_back(patch.density);
     warn_of_paper(sheet.file, paper.choice, densities, report.warnings);
+    warn_of_lost_repeats(sheet, inks, report.warnings);
     report.tone_curves = tone_curves(inks, report.patches);
     if (inks.is_ramp())
         report.warnings.push_back(fmt::format(

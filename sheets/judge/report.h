@@ -59,10 +59,10 @@ struct PaperReport {
 struct MetamerismReport {
     std::string file; // of the second; empty where it is on the same sheet
     PaperChoice paper;
-    ILLUM_OBS illuminant; // the second one
-    double de00;          // under the first
-    double sum;           // of the two ΔE*ab
-    double din6172;
+    ILLUM_OBS illuminant;      // the second one
+    double de00;               // under the first
+    std::optional<double> sum; // of the two ΔE*ab; missing where a side has no spectra
+    std::optional<double> din6172;
 };
 
 // Of patches of one nominal value: their means.

@@ -165,12 +165,14 @@ std::optional<double> wavelength_at(std::string_view line, char separator)
 // A table whose rows are wavelengths, and whose columns are patches with their names above.
 class Columns {
 public:
-    // Whether the text holds such a table: one wavelength after the other, enough for a spectrum.
+    // Whether the text holds such a table: one row of a wavelength after the other, enough for a
+    // spectrum; two may be exchanged.
     bool find(std::string_view text);
     void read(Sheet &sheet);
 
 private:
     static constexpr std::size_t kFewest = 14; // 410 to 680 nm in steps of 20 nm
+    static constexpr std::size_t kMostDescents = 2;
     std::string_view names, rows; // the line above the first wavelength, and from there
     std::size_t line = 0;         // of the names
     char separator = ',';
@@ -183,12 +185,14 @@ bool Columns::find(std::string_view text)
         std::string_view rest = text, above;
         std::size_t count = 0, at = 0;
         double last = 0;
+        std::size_t descents = 0;
         while (!rest.empty() && count < kFewest) {
             const std::string_view begin = rest, now = next_line(rest);
             const auto nm = wavelength_at(now, separator);
             ++at;
-            if (!nm || (count > 0 && *nm <= last)) {
-                count = 0;
+            descents += nm && *nm <= last;
+            if (!nm || descents > kMostDescents) {
+                count = descents = 0;
                 above = now;
                 line = at;
             } else if (count++ == 0) {

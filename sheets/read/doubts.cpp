@@ -1,5 +1,6 @@
 #include "read/doubts.h"
 
+#include "read/shades.h"
 #include "read/text.h"
 
 #include <fmt/format.h>
@@ -18,11 +19,15 @@
 namespace vantrel::sheets {
 namespace {
 
-constexpr double kLeastRange = 5;    // of the reflectances in a band of a sheet that is printed on
-constexpr double kDeadRange = 0.01;  // of those in a band that measures nothing
-constexpr double kNoise = 0.5;       // of an instrument near black
-constexpr double kSpike = 10;        // of a band beyond both its neighbours; brightener reaches 6
-constexpr double kFullTint = 50;     // from which on an ink shows its colour
+constexpr double kLeastRange = 5;     // of the reflectances in a band of a sheet that is printed on
+constexpr double kDeadRange = 0.01;   // of those in a band that measures nothing
+constexpr double kNoise = 0.5;        // of an instrument near black
+constexpr double kSpike = 10;         // of a band beyond both its neighbours; brightener reaches 6
+constexpr double kFullTint = 50;      // from which on an ink shows its colour
+constexpr double kMostFraction = 1.5; // of paper with brightener
+constexpr double kMostPercent = 300;
+constexpr double kLeastPercent = 20; // of the lightest patch
+constexpr double kBlackest = 0.1;    // percent, which no print is below throughout
 constexpr double kMostOfBlack = 0.6; // between the densities of a black
 constexpr double kLeastOfInk = 0.1;  // between those of two filters, beyond what paper and noise do
 
@@ -146,6 +151,48 @@ void doubt_ids(const std::vector<Patch> &patches, std::vector<Doubt> &out)
                          counted, patches.size(), in_quotes(before->id), in_quotes(after->id))});
 }
 
+// A place such as B12: its row, and where in it.
+std::optional<std::pair<std::string_view, long>> place_of(const std::string &text)
+{
+    const auto digits = text.find_first_of("0123456789");
+    if (digits == 0 || digits == std::string::npos || digits > 2 || text.size() - digits > 3)
+        return std::nullopt;
+    const auto number = number_of(text.substr(digits));
+    return number ? std::optional(std::pair(std::string_view(text).substr(0, digits), *number))
+                  : std::nullopt;
+}
+
+// Names that are places and leave out some of a row, as ids do.
+void doubt_places(const std::vector<Patch> &patches, std::vector<Doubt> &out)
+{
+    std::map<std::string_view, std::map<long, const Patch *>> rows;
+    for (const Patch &patch : patches) {
+        const auto place = place_of(patch.name);
+        if (!place || !rows[place->first].emplace(place->second, &patch).second)
+            return;
+    }
+    std::size_t missing = 0;
+    const Patch *before = nullptr, *after = nullptr; // at the first gap
+    for (const auto &[row, places] : rows) {
+        const Patch *last = nullptr;
+        long number = places.begin()->first - 1;
+        for (const auto &[place, patch] : places) {
+            missing += static_cast<std::size_t>(place - number - 1);
+            if (place > number + 1 && !after) {
+                before = last;
+                after = patch;
+            }
+            number = place;
+            last = patch;
+        }
+    }
+    if (after && missing <= patches.size() / 10 + 1)
+        out.push_back({after->line, fmt::format("by their places {} of {} patches are missing: "
+                                                "after {} comes {}",
+                                                missing, patches.size() + missing,
+                                                in_quotes(before->name), in_quotes(after->name))});
+}
+
 // An id that stands for several patches of other names, or a name for several device values: a slip
 // where they are few, the way of the file where they are many.
 void doubt_names(const std::vector<Patch> &patches, std::vector<Doubt> &out)
@@ -242,7 +289,7 @@ std::optional<std::size_t> other_ink(const Patch &patch, std::size_t ink)
     return other ? std::optional(static_cast<std::size_t>(most - density.begin())) : std::nullopt;
 }
 
-void doubt_inks(const std::vector<Patch> &patches, std::vector<Doubt> &out)
+void doubt_inks(const std::vector<Patch> &patches, Named &named, std::vector<Doubt> &out)
 {
     const Patch *first = nullptr;
     std::size_t count = 0;
@@ -251,6 +298,7 @@ void doubt_inks(const std::vector<Patch> &patches, std::vector<Doubt> &out)
         if (!ink || !other_ink(patch, *ink))
             continue;
         first = first ? first : &patch;
+        named.insert(&patch);
         ++count;
     }
     if (!first)
@@ -263,18 +311,99 @@ void doubt_inks(const std::vector<Patch> &patches, std::vector<Doubt> &out)
                                   kInks[ink].name, and_more(count))});
 }
 
+// Whether the patch is dark in percent where it cannot be: with no or little ink, of one colour
+// without any of another, or wholly black.
+bool is_fraction(const Patch &patch, double least, double most)
+{
+    double ink = 0;
+    bool known = false, cmy = true;
+    for (const auto &[field, percent] : patch.device)
+        if (is_ink(field)) {
+            known = true;
+            ink += percent;
+            cmy = cmy && (percent == 0 || (field.starts_with("CMYK_") && field != "CMYK_K"));
+        }
+    return (known && (ink <= kFullTint || (cmy && ink <= 100))) ||
+           (least < kBlackest && most > 5 * least) || most < kBlackest;
+}
+
+// "12, 14 to 20", and … where there are more.
+std::string lines_of(const std::vector<std::size_t> &lines)
+{
+    std::string out;
+    std::size_t parts = 0;
+    for (std::size_t begin = 0; begin < lines.size();) {
+        std::size_t end = begin + 1;
+        while (end < lines.size() && lines[end] == lines[end - 1] + 1)
+            ++end;
+        if (++parts > 4)
+            return out + ", …";
+        out += fmt::format("{}{}", out.empty() ? "" : ", ", lines[begin]);
+        if (end > begin + 1)
+            out += fmt::format(" to {}", lines[end - 1]);
+        begin = end;
+    }
+    return out;
+}
+
+// Rows of another scale than the others.
+void doubt_scales(const std::vector<Patch> &patches, Named &named, std::vector<Doubt> &out)
+{
+    double largest = 0;
+    for (const Patch &patch : patches)
+        largest = std::max(largest, *std::max_element(patch.refl.begin(), patch.refl.end()));
+    const double unit = largest > kMostPercent ? 100 : 1;
+    std::vector<std::size_t> lines;
+    const Patch *low = nullptr, *high = nullptr;
+    double most_low = 0, most_high = 0;
+    bool certain = false;
+    for (const Patch &patch : patches) {
+        const auto [least, most] = std::minmax_element(patch.refl.begin(), patch.refl.end());
+        if (*most <= kMostFraction * unit) {
+            certain = certain || is_fraction(patch, *least / unit, *most / unit);
+            named.insert(&patch);
+            lines.push_back(patch.line);
+            if (!low || *most > most_low) {
+                low = &patch;
+                most_low = *most;
+            }
+        } else if (!high || *most > most_high) {
+            high = &patch;
+            most_high = *most;
+        }
+    }
+    if (!certain || most_high < kLeastPercent * unit) {
+        named.clear();
+        return;
+    }
+    out.push_back(
+        {low->line, fmt::format("{} reads {:.3g} % at most, and {} {:.4g} %: are {} of {} "
+                                "rows fractions, and the others percentages? (lines {})",
+                                in_quotes(low->name), most_low, in_quotes(high->name), most_high,
+                                lines.size(), patches.size(), lines_of(lines))});
+}
+
 } // namespace
 
-std::vector<Doubt> doubts_about(const std::vector<Patch> &patches)
+std::vector<Doubt> doubts_about(const std::vector<Patch> &patches, Kind kind)
 {
     std::vector<Doubt> out;
-    doubt_bands(patches, out);
-    doubt_signs(patches, out);
-    doubt_spikes(patches, out);
+    Named named;
+    if (kind != Kind::colours) {
+        if (kind == Kind::reflectance)
+            doubt_scales(patches, named, out);
+        doubt_bands(patches, out);
+        doubt_signs(patches, out);
+        doubt_spikes(patches, out);
+    }
     doubt_ids(patches, out);
+    doubt_places(patches, out);
     doubt_names(patches, out);
-    doubt_copies(patches, out);
-    doubt_inks(patches, out);
+    if (kind != Kind::colours) {
+        doubt_copies(patches, out);
+        doubt_inks(patches, named, out);
+    }
+    doubt_order(patches, kind, named, out);
     return out;
 }
 

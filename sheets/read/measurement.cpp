@@ -44,4 +44,14 @@ const Patch &patch_named(const Measurement &sheet, std::string_view name)
                                    in_quotes(name), names, sheet.patches.size() > 8 ? ", …" : "")};
 }
 
+std::vector<std::size_t> places_named(const Measurement &sheet, std::string_view name)
+{
+    const bool by_name = patch_named(sheet, name).name == name;
+    std::vector<std::size_t> out;
+    for (std::size_t i = 0; i < sheet.patches.size(); ++i)
+        if ((by_name ? sheet.patches[i].name : sheet.patches[i].id) == name)
+            out.push_back(i);
+    return out;
+}
+
 } // namespace vantrel::sheets

@@ -111,4 +111,8 @@ const Patch *find_patch(const Measurement &sheet, std::string_view name);
 // find_patch(); throws RequestError.
 const Patch &patch_named(const Measurement &sheet, std::string_view name);
 
+// The places of all patches of this name, or else of this id; throws RequestError where there is
+// none.
+std::vector<std::size_t> places_named(const Measurement &sheet, std::string_view name);
+
 } // namespace vantrel::sheets

@@ -58,7 +58,7 @@ void Sheet::warn_of(const Bands &used, std::size_t line)
     const Source source = used.source();
     if (const auto neighbours = used.out_of_order(); neighbours && !std::exchange(told_order, true))
         warn(line, fmt::format("the wavelengths are out of order, {:g} nm stands before {:g}: each "
-                               "value is taken for the wavelength that it stands under",
+                               "value is taken for its own wavelength",
                                neighbours->first, neighbours->second));
     if (source.interpolated && !std::exchange(told_interpolated, true))
         warn(line, "steps of 20 nm: the values between are interpolated by third-order Lagrange "
@@ -260,9 +260,8 @@ Measurement Sheet::measurement()
     if (xyz)
         bring_to_lab(colours);
     check_inks();
-    if (kind != Kind::colours)
-        for (const Doubt &doubt : doubts_about(patches))
-            warn(doubt.line, doubt.text);
+    for (const Doubt &doubt : doubts_about(patches, kind))
+        warn(doubt.line, doubt.text);
     if (kind == Kind::transmission)
         warn(0, "transmission, not reflectance: there is no paper");
     return {.file = {},

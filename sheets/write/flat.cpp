@@ -25,17 +25,28 @@ bool is_formula(std::string_view text)
     return false;
 }
 
+// Letters, blanks and hyphens alone compute nothing: "--paper chooses".
+bool is_words(std::string_view text)
+{
+    return std::all_of(text.begin(), text.end(),
+                       [](char c) { return c == ' ' || c == '-' || (c >= 'a' && c <= 'z'); });
+}
+
 // Text with an apostrophe wherever a spreadsheet would begin a formula, be it one that takes
 // semicolons for the ends of cells; text that can be printed holds no tabs. Numbers stay as they
-// are.
+// are, and so do words behind a semicolon.
 std::string without_formulas(std::string_view text)
 {
     std::string out;
     bool begins = true; // a cell
+    bool first = true;  // it is this text's own
     for (std::size_t i = 0; i < text.size(); ++i) {
-        if (begins && is_formula(text.substr(i)) && !number_in(text))
+        const std::string_view rest = text.substr(i);
+        if (begins && is_formula(rest) && !number_in(text) &&
+            (first || !is_words(rest.substr(0, rest.find(';')))))
             out += '\'';
         out += text[i];
+        first = first && text[i] != ';';
         begins = text[i] == ';' || (begins && (text[i] == ' ' || text[i] == '"'));
     }
     return out;

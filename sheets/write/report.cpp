@@ -89,12 +89,14 @@ void add_paper(Lines &lines, const Report &report)
                     paper.whiteness ? fixed(paper.whiteness) : "none (" + paper.no_whiteness + ")",
                     fixed(*paper.lab)));
     if (const auto &metamerism = report.metamerism)
-        lines.add(fmt::format("Against {}{}: ΔE00 {}, metamerism {} (ΔE*ab under {} plus {}), DIN "
-                              "6172 {}",
-                              metamerism->file.empty() ? "" : metamerism->file + ": ",
-                              said(metamerism->paper), fixed(metamerism->de00),
+        lines.add(fmt::format(
+            "Against {}{}: ΔE00 {}{}", metamerism->file.empty() ? "" : metamerism->file + ": ",
+            said(metamerism->paper), fixed(metamerism->de00),
+            metamerism->sum
+                ? fmt::format(", metamerism {} (ΔE*ab under {} plus {}), DIN 6172 {}",
                               fixed(metamerism->sum), name_of(report.illuminant),
-                              name_of(metamerism->illuminant), fixed(metamerism->din6172)));
+                              name_of(metamerism->illuminant), fixed(metamerism->din6172))
+                : ""));
 }
 
 struct BlockColumn {
@@ -200,8 +202,8 @@ Json paper_json(const Report &report)
             {"chosen", metamerism->paper.reason},
             {"de00", metamerism->de00},
             {"illuminant", name_of(metamerism->illuminant)},
-            {"sum", metamerism->sum},
-            {"din6172", metamerism->din6172}};
+            {"sum", or_null(metamerism->sum)},
+            {"din6172", or_null(metamerism->din6172)}};
     return out;
 }
 

@@ -3,7 +3,10 @@
 #include "judge/report.h"
 #include "options.h"
 #include "progress.h"
+#include "read/text.h"
 #include "system.h"
+
+#include <fmt/format.h>
 
 #include <cmath>
 #include <memory>
@@ -38,6 +41,17 @@ SecondPaper second_paper_of(const ReportOptions &options)
     return {std::nullopt, text};
 }
 
+// FILE:NAME without such a file may be the name of a patch.
+void require_patch_or_file(const Measurement &sheet, const std::string &paper)
+{
+    if (const auto colon = paper.rfind(':');
+        colon != std::string::npos && !find_patch(sheet, paper))
+        throw RequestError{fmt::format("--second-paper: there is no file {}, and {} holds no patch "
+                                       "{}",
+                                       in_quotes(paper.substr(0, colon)), sheet.file,
+                                       in_quotes(paper))};
+}
+
 Outcome run(const ReportOptions &options)
 {
     if (!(options.n_factor > 0) || !std::isfinite(options.n_factor))
@@ -61,7 +75,10 @@ Outcome run(const ReportOptions &options)
     std::vector<Report> sheets;
     std::vector<std::string> warnings;
     for (const std::string &file : options.files) {
-        sheets.push_back(report_of(sheet_of(file, options, true), request));
+        Measurement sheet = sheet_of(file, options, true);
+        if (!second.sheet)
+            require_patch_or_file(sheet, second.name);
+        sheets.push_back(report_of(std::move(sheet), request));
         for (const std::string &warning : sheets.back().warnings)
             warnings.push_back(warning);
     }

@@ -48,6 +48,13 @@ const toneCurves = (sheet, solids) => sheet.tone_values.map(({ ink, solid, tone_
         : { area: value.dot_area, gain: value.dot_gain }) })),
     { nominal: 100, area: 100, gain: 0 }] }));
 
+function secondPaper(other) {
+  const which = ['to ', chosenPaper(other.paper, other.chosen), ' of ', named(other.file)];
+  return other.sum === null ? ['Paper ΔE00', fixed(other.de00), which] :
+    ['Metamerism', fixed(other.sum), [...which, ` under ${other.illuminant}; DIN 6172 ` +
+      `${fixed(other.din6172)}, ΔE00 ${fixed(other.de00)}`]];
+}
+
 function keyFigures(sheet, solids) {
   const { paper } = sheet;
   const gain = largest(sheet.patches, 'dot_gain');
@@ -60,10 +67,7 @@ function keyFigures(sheet, solids) {
         paper.whiteness === null ? paper.no_whiteness : 'ASTM E313'],
     ] : [['Paper', 'none', `${paper.chosen}; densities are absolute, and what is relative to a ` +
       'paper is left out']]),
-    paper.metamerism && ['Metamerism', fixed(paper.metamerism.sum),
-      ['to ', chosenPaper(paper.metamerism.paper, paper.metamerism.chosen),
-        ' of ', named(paper.metamerism.file), ` under ${paper.metamerism.illuminant}; DIN 6172 ` +
-        `${fixed(paper.metamerism.din6172)}, ΔE00 ${fixed(paper.metamerism.de00)}`]],
+    paper.metamerism && secondPaper(paper.metamerism),
     ...[...solids].slice(0, 8).map(([ink, solid]) =>
       [['Density ', swatch(colourOf(solid))], fixed(solid.density, 3),
         [named(solidName(ink, solid.name)), solid.response ? `, ${solid.response}` : '']]),
