@@ -360,6 +360,8 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
         warn_of_wide_means(out.sample_means, sample.file, out.warnings);
     warn_of_same(out);
     warn_of_misfit(out);
+    if (!warn_of_better_fit(out) && references.has_spectra() && samples.has_spectra() && out.papers)
+        warn_of_brightener(out, references.paper.refl, samples.paper.refl);
     warn_of_exchanged(out);
     return out;
 }

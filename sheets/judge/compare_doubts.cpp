@@ -1,6 +1,7 @@
 #include "judge/compare_doubts.h"
 
 #include "judge/colour.h"
+#include "read/illuminant.h"
 #include "read/text.h"
 
 #include <fmt/format.h>
@@ -14,12 +15,78 @@ namespace {
 
 constexpr double kFarOff = 3;   // a colour difference that is no scatter
 constexpr double kWideMean = 1; // as for the patches of a paper, in ΔE00
-constexpr double kMisfit = 10;  // mean ΔE00
+constexpr double kLeastMisfit = 0.5;
+constexpr double kLeastOffset = 0.3; // of Y
+constexpr std::size_t kMostTried = 200, kFewestTried = 5;
+constexpr double kSamePaper = 0.015, kOtherBlue = 0.05, kOtherPaper = 0.3; // of reflectances
+constexpr double kMisfit = 10;                                             // mean ΔE00
 constexpr double kCoarsest = 1; // rounding of reflectances or of colours
 
 bool is_rounded(double value, double unit)
 {
     return std::abs(value - unit * std::round(value / unit)) < 1e-6 * unit;
+}
+
+// Pairs that are tried, an even choice.
+std::vector<const PairReport *> some_of(const std::vector<PairReport> &pairs)
+{
+    std::vector<const PairReport *> out;
+    for (std::size_t i = 0; i < pairs.size(); i += pairs.size() / kMostTried + 1)
+        if (pairs[i].sample.refl)
+            out.push_back(&pairs[i]);
+    return out;
+}
+
+// The mean ΔE00 where the spectra of the sample are changed.
+template <typename Change>
+double mean_if(const std::vector<const PairReport *> &pairs, ILLUM_OBS illuminant, Change change)
+{
+    double sum = 0;
+    for (const PairReport *pair : pairs)
+        sum +=
+            delta_e00(pair->reference.colour.lab, lab_of(change(*pair->sample.refl), illuminant));
+    return sum / static_cast<double>(pairs.size());
+}
+
+// Its values a band further, the last one held.
+Spectrum moved(const Spectrum &refl, bool up)
+{
+    Spectrum out = refl;
+    if (up)
+        std::copy(refl.begin(), refl.end() - 1, out.begin() + 1);
+    else
+        std::copy(refl.begin() + 1, refl.end(), out.begin());
+    return out;
+}
+
+double luminance(const CIELABCOORD &lab)
+{
+    const double f = (lab.L + 16) / 116;
+    return 100 * (lab.L > 8 ? f * f * f : lab.L / 903.3);
+}
+
+// Y of the sample as a line over that of the reference.
+struct Line {
+    double factor = 1, offset = 0;
+};
+
+Line line_of(const std::vector<const PairReport *> &pairs)
+{
+    double x = 0, y = 0, xx = 0, xy = 0;
+    const auto n = static_cast<double>(pairs.size());
+    for (const PairReport *pair : pairs) {
+        const double aim = luminance(pair->reference.colour.lab),
+                     own = luminance(pair->sample.colour.lab);
+        x += aim / n;
+        y += own / n;
+        xx += aim * aim / n;
+        xy += aim * own / n;
+    }
+    const double spread = xx - x * x;
+    if (!(spread > 1))
+        return {};
+    const double factor = (xy - x * y) / spread;
+    return {factor, y - factor * x};
 }
 
 } // namespace
@@ -131,6 +198,81 @@ void warn_of_misfit(Comparison &out)
                                            "they hardly fit each other",
                                            out.reference, out.sample, phrase_of(out.paired_by),
                                            mean));
+}
+
+bool warn_of_better_fit(Comparison &out)
+{
+    const std::vector<const PairReport *> pairs = some_of(out.pairs);
+    if (pairs.size() < kFewestTried)
+        return false;
+    const ILLUM_OBS illuminant = out.illuminant;
+    const auto same = [](const Spectrum &refl) { return refl; };
+    const double own = mean_if(pairs, illuminant, same);
+    if (!(own > kLeastMisfit))
+        return false;
+    double least = own;
+    std::string how;
+    const auto consider = [&](double mean, auto words) {
+        if (mean < least) {
+            least = mean;
+            how = words();
+        }
+    };
+    for (const bool up : {false, true})
+        consider(mean_if(pairs, illuminant, [up](const Spectrum &refl) { return moved(refl, up); }),
+                 [up] {
+                     return fmt::format("with its spectra moved by {} nm: are wavelengths wrong?",
+                                        up ? 10 : -10);
+                 });
+    const Line line = line_of(pairs);
+    if (line.factor > 0.2)
+        consider(mean_if(pairs, illuminant,
+                         [&line](Spectrum refl) {
+                             for (double &value : refl)
+                                 value = (value - line.offset) / line.factor;
+                             return refl;
+                         }),
+                 [&line] {
+                     return fmt::format(
+                         "were it {:.3f} times as light{}: is the white, the backing "
+                         "or the filter another one?",
+                         1 / line.factor,
+                         std::abs(line.offset) > kLeastOffset
+                             ? fmt::format(" after {:.1f} % are {}", std::abs(line.offset),
+                                           line.offset > 0 ? "taken off" : "added")
+                             : "");
+                 });
+    const bool colours = !out.pairs.front().reference.refl;
+    for (int i = 0; i < NUM_ILLUM_OBS && colours; ++i) {
+        const auto other = static_cast<ILLUM_OBS>(i);
+        consider(mean_if(pairs, other, same),
+                 [other] { return fmt::format("under {}: are the aims for it?", name_of(other)); });
+    }
+    if (!(least < own / 3))
+        return false;
+    out.warnings.push_back(fmt::format("{} would agree with {} to a mean ΔE00 of {:.2f}, not "
+                                       "{:.2f}, {}",
+                                       out.sample, out.reference, least, own, how));
+    return true;
+}
+
+void warn_of_brightener(Comparison &out, const Spectrum &reference, const Spectrum &sample)
+{
+    const auto ratio = [&](std::size_t begin, std::size_t end) { // of bands, both inclusive
+        double of_sample = 0, of_reference = 0;
+        for (std::size_t band = begin; band <= end; ++band) {
+            of_sample += sample[band];
+            of_reference += reference[band];
+        }
+        return of_sample / of_reference;
+    };
+    const double blue = ratio(2, 6), rest = ratio(12, 30); // 420 to 460, 520 to 700 nm
+    if (std::abs(rest - 1) < kSamePaper && std::abs(blue / rest - 1) > kOtherBlue &&
+        std::abs(blue / rest - 1) < kOtherPaper)
+        out.warnings.push_back(fmt::format(
+            "the paper of {} reflects {:.1f} % {} from 420 to 460 nm than that of {}, and "
+            "the same above 520 nm: another condition (M0 to M3), or brightener?",
+            out.sample, 100 * std::abs(blue - 1), blue < 1 ? "less" : "more", out.reference));
 }
 
 void warn_of_exchanged(Comparison &out)

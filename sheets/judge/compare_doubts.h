@@ -27,6 +27,13 @@ void warn_of_same(Comparison &out);
 // As those of a sheet and of another's aims do; paper and process differ by less.
 void warn_of_misfit(Comparison &out);
 
+// Where the sample would agree far better if its wavelengths, its illuminant or its white were
+// another one: what nothing in a file tells. Whether it would.
+bool warn_of_better_fit(Comparison &out);
+
+// Papers that differ in the brightener's light alone.
+void warn_of_brightener(Comparison &out, const Spectrum &reference, const Spectrum &sample);
+
 // Of the worst pairs those that would agree if their samples changed places, each with one other.
 void warn_of_exchanged(Comparison &out);
 

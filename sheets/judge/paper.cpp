@@ -7,6 +7,7 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <array>
 
 namespace vantrel::sheets {
 namespace {
@@ -92,6 +93,13 @@ bool contains(const Places &places, std::size_t place)
     return std::find(places.begin(), places.end(), place) != places.end();
 }
 
+bool is_named_paper(const Patch &patch)
+{
+    constexpr std::array names = {"paper", "papier", "white", "weiß", "substrate", "bedruckstoff"};
+    return std::any_of(names.begin(), names.end(),
+                       [&](const char *name) { return equal_ignoring_case(patch.name, name); });
+}
+
 // What speaks against the paper at these places; `bare` are those of the patches without ink.
 void warn_of_choice(const Measurement &sheet, const Paper &paper, const Places &places,
                     const Places &bare, std::string_view how, ILLUM_OBS illuminant,
@@ -112,6 +120,10 @@ void warn_of_choice(const Measurement &sheet, const Paper &paper, const Places &
     if (lightness > lab.L + kLighter && !contains(places, lightest) && !contains(bare, lightest))
         doubts.push_back(fmt::format("{} has an L* of {:.1f} to its {:.1f}",
                                      in_quotes(sheet.patches[lightest].name), lightness, lab.L));
+    const Places named = places_where(sheet, is_named_paper);
+    if (!has_device && !named.empty() && !is_named_paper(sheet.patches[places.front()]))
+        doubts.push_back(
+            fmt::format("another patch is named {}", in_quotes(sheet.patches[named.front()].name)));
     if (!doubts.empty())
         warnings.push_back(fmt::format("{}: {} stands for the paper {}, but {}; --paper chooses",
                                        sheet.file, in_quotes(paper.choice.name), how,

@@ -44,8 +44,10 @@ bool next_record(std::string_view &text, char separator, std::size_t &line, Row 
 
 std::size_t wavelengths_in(const Row &row)
 {
-    return static_cast<std::size_t>(std::count_if(row.values.begin(), row.values.end(),
-                                                  [](auto field) { return wavelength_of(field); }));
+    // a row of percentages holds none
+    return static_cast<std::size_t>(
+        std::count_if(row.values.begin(), row.values.end(),
+                      [](auto field) { return wavelength_of(field).value_or(0) >= 200; }));
 }
 
 constexpr char separators[] = {',', ';', '\t'};

@@ -8,6 +8,7 @@
 #include <algorithm>
 #include <array>
 #include <charconv>
+#include <cmath>
 #include <cstdint>
 #include <cstring>
 #include <map>
@@ -28,6 +29,8 @@ constexpr double kMostFraction = 1.5; // of paper with brightener
 constexpr double kMostPercent = 300;
 constexpr double kLeastPercent = 20; // of the lightest patch
 constexpr double kBlackest = 0.1;    // percent, which no print is below throughout
+constexpr double kCoat = 25;         // C*: more than black has
+constexpr double kPi = 3.14159265358979323846;
 constexpr double kMostOfBlack = 0.6; // between the densities of a black
 constexpr double kLeastOfInk = 0.1;  // between those of two filters, beyond what paper and noise do
 
@@ -56,6 +59,21 @@ void doubt_bands(const std::vector<Patch> &patches, std::vector<Doubt> &out)
         if (most[band] - least[band] <= kDeadRange)
             out.push_back({0, fmt::format("the band at {} reads {:g} % in every patch", nm_of(band),
                                           least[band])});
+}
+
+void doubt_zeros(const std::vector<Patch> &patches, Named &named, std::vector<Doubt> &out)
+{
+    const Patch *first = nullptr;
+    std::size_t count = 0;
+    for (const Patch &patch : patches)
+        if (std::all_of(patch.refl.begin(), patch.refl.end(), [](double v) { return v == 0; })) {
+            first = first ? first : &patch;
+            named.insert(&patch);
+            ++count;
+        }
+    if (first)
+        out.push_back({first->line, fmt::format("{} reads 0 % in every band{}: was it measured?",
+                                                in_quotes(first->name), and_more(count))});
 }
 
 void doubt_signs(const std::vector<Patch> &patches, std::vector<Doubt> &out)
@@ -275,10 +293,29 @@ std::optional<std::size_t> only_ink(const Patch &patch)
     return out;
 }
 
+// The ink that a colour looks like instead, by the nearest of the usual hues.
+std::optional<std::size_t> other_ink(const CIELABCOORD &lab, std::size_t ink)
+{
+    if (std::hypot(lab.a, lab.b) < kCoat)
+        return std::nullopt;
+    constexpr std::array<double, 4> hues = {0, 233, 355, 93};
+    const double hue = std::atan2(lab.b, lab.a) * 180 / kPi;
+    const auto apart = [&](std::size_t other) {
+        return std::abs(std::remainder(hue - hues[other], 360));
+    };
+    std::size_t nearest = 1;
+    for (std::size_t other = 2; other < hues.size(); ++other)
+        if (apart(other) < apart(nearest))
+            nearest = other;
+    return nearest == ink ? std::nullopt : std::optional(nearest);
+}
+
 // The ink that a patch of one ink looks like instead: an ink is densest through the filter of the
 // other colour, black through all alike.
-std::optional<std::size_t> other_ink(const Patch &patch, std::size_t ink)
+std::optional<std::size_t> other_ink(const Patch &patch, std::size_t ink, Kind kind)
 {
+    if (kind == Kind::colours)
+        return patch.lab ? other_ink(*patch.lab, ink) : std::nullopt;
     std::array<double, 4> density{};
     for (const int response : {RED_RESPONSE, GREEN_RESPONSE, BLUE_RESPONSE})
         ReflToDensity(patch.refl.data(), nullptr, E_STATUS, response,
@@ -289,13 +326,13 @@ std::optional<std::size_t> other_ink(const Patch &patch, std::size_t ink)
     return other ? std::optional(static_cast<std::size_t>(most - density.begin())) : std::nullopt;
 }
 
-void doubt_inks(const std::vector<Patch> &patches, Named &named, std::vector<Doubt> &out)
+void doubt_inks(const std::vector<Patch> &patches, Kind kind, Named &named, std::vector<Doubt> &out)
 {
     const Patch *first = nullptr;
     std::size_t count = 0;
     for (const Patch &patch : patches) {
         const auto ink = only_ink(patch);
-        if (!ink || !other_ink(patch, *ink))
+        if (!ink || !other_ink(patch, *ink, kind))
             continue;
         first = first ? first : &patch;
         named.insert(&patch);
@@ -307,7 +344,7 @@ void doubt_inks(const std::vector<Patch> &patches, Named &named, std::vector<Dou
     out.push_back(
         {first->line, fmt::format("{} looks {}, but is {} by its device values{}: are "
                                   "rows or columns exchanged?",
-                                  in_quotes(first->name), kInks[*other_ink(*first, ink)].name,
+                                  in_quotes(first->name), kInks[*other_ink(*first, ink, kind)].name,
                                   kInks[ink].name, and_more(count))});
 }
 
@@ -359,6 +396,8 @@ void doubt_scales(const std::vector<Patch> &patches, Named &named, std::vector<D
     bool certain = false;
     for (const Patch &patch : patches) {
         const auto [least, most] = std::minmax_element(patch.refl.begin(), patch.refl.end());
+        if (*least == 0 && *most == 0)
+            continue;
         if (*most <= kMostFraction * unit) {
             certain = certain || is_fraction(patch, *least / unit, *most / unit);
             named.insert(&patch);
@@ -377,10 +416,11 @@ void doubt_scales(const std::vector<Patch> &patches, Named &named, std::vector<D
         return;
     }
     out.push_back(
-        {low->line, fmt::format("{} reads {:.3g} % at most, and {} {:.4g} %: are {} of {} "
-                                "rows fractions, and the others percentages? (lines {})",
-                                in_quotes(low->name), most_low, in_quotes(high->name), most_high,
-                                lines.size(), patches.size(), lines_of(lines))});
+        {low->line,
+         fmt::format("{} reads {:.3g} % at most, and {} {:.4g} %: are {} of {} "
+                     "rows fractions, and the others percentages? ({} {})",
+                     in_quotes(low->name), most_low, in_quotes(high->name), most_high, lines.size(),
+                     patches.size(), lines.size() == 1 ? "line" : "lines", lines_of(lines))});
 }
 
 } // namespace
@@ -392,6 +432,7 @@ std::vector<Doubt> doubts_about(const std::vector<Patch> &patches, Kind kind)
     if (kind != Kind::colours) {
         if (kind == Kind::reflectance)
             doubt_scales(patches, named, out);
+        doubt_zeros(patches, named, out);
         doubt_bands(patches, out);
         doubt_signs(patches, out);
         doubt_spikes(patches, out);
@@ -399,10 +440,9 @@ std::vector<Doubt> doubts_about(const std::vector<Patch> &patches, Kind kind)
     doubt_ids(patches, out);
     doubt_places(patches, out);
     doubt_names(patches, out);
-    if (kind != Kind::colours) {
+    if (kind != Kind::colours)
         doubt_copies(patches, out);
-        doubt_inks(patches, named, out);
-    }
+    doubt_inks(patches, kind, named, out);
     doubt_order(patches, kind, named, out);
     return out;
 }
