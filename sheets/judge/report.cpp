@@ -15,6 +15,8 @@
 namespace vantrel::sheets {
 namespace {
 
+constexpr std::size_t kMostRepeated = 2000; // kinds of patches in a zone
+
 // A gain is never negative: a tint that prints too light has none.
 double gain_of(double dot_area, double nominal)
 {
@@ -190,7 +192,9 @@ void warn_of_lost_repeats(const Measurement &sheet, const Inks &inks,
     std::map<Tints, Repeated> patches;
     for (const Patch &patch : sheet.patches)
         if (const auto tints = inks.tints_of(patch))
-            ++patches.try_emplace(*tints, Repeated{&patch, 0}).first->second.count;
+            if (++patches.try_emplace(*tints, Repeated{&patch, 0}).first->second.count == 1 &&
+                patches.size() > kMostRepeated)
+                return;
     std::map<std::size_t, std::vector<const Patch *>> often; // the first of each, by their count
     for (const auto &[tints, repeated] : patches)
         often[repeated.count].push_back(repeated.first);

@@ -16,6 +16,7 @@ namespace vantrel::sheets {
 namespace {
 
 constexpr std::size_t kMostNamed = 5;
+constexpr std::size_t kMostInks = 20;
 constexpr std::size_t kMostShades = 2000; // that are compared each with each
 
 // How deep a patch is: densities through the filters of cyan, magenta and yellow, or the visual one
@@ -66,15 +67,15 @@ std::vector<Shade> shades_of(const std::vector<Patch> &patches, Kind kind, const
         for (const auto &[field, percent] : patch.device)
             if (is_ink(field))
                 fields.emplace(field, fields.size());
+    if (fields.size() > kMostInks)
+        return {};
     std::map<std::vector<double>, Shade> shades;
     for (const Patch &patch : patches) {
         Shade shade;
-        shade.tints.resize(fields.size());
         bool solids = true;
         for (const auto &[field, percent] : patch.device) {
             if (!is_ink(field) || !(percent > 0))
                 continue;
-            shade.tints[fields.find(field)->second] = percent;
             ++shade.inks;
             shade.spot = shade.spot || !field.starts_with("CMYK_");
             solids = solids && percent == 100;
@@ -83,6 +84,10 @@ std::vector<Shade> shades_of(const std::vector<Patch> &patches, Kind kind, const
         const bool few = patches.size() <= kMostShades || shade.inks == 1 || solids;
         if (!wanted || !few || named.contains(&patch) || (kind == Kind::colours && !patch.lab))
             continue;
+        shade.tints.resize(fields.size());
+        for (const auto &[field, percent] : patch.device)
+            if (is_ink(field) && percent > 0)
+                shade.tints[fields.find(field)->second] = percent;
         const Depth depth = depth_of(patch, kind);
         const auto [found, is_new] = shades.try_emplace(shade.tints, shade);
         if (is_new && shades.size() > kMostShades) {
@@ -142,15 +147,11 @@ std::vector<Contradiction> contradictions_of(const std::vector<Shade> &shades, s
     return out;
 }
 
-} // namespace
+using Patches = std::vector<const Patch *>;
 
-void doubt_order(const std::vector<Patch> &patches, Kind kind, const Named &named,
-                 std::vector<Doubt> &out)
+// The patches that contradict most others, one after the other until no contradiction is left.
+Patches suspects_of(std::vector<Contradiction> open)
 {
-    constexpr std::array filters = {"red", "green", "blue"};
-    const bool colours = kind == Kind::colours;
-    std::vector<Contradiction> open =
-        contradictions_of(shades_of(patches, kind, named), colours ? 1 : filters.size());
     using Counts = std::map<const Patch *, std::size_t>;
     const auto count_of = [](const std::vector<Contradiction> &some) {
         Counts out;
@@ -161,34 +162,53 @@ void doubt_order(const std::vector<Patch> &patches, Kind kind, const Named &name
         return out;
     };
     Counts all = count_of(open);
-    std::vector<std::pair<const Patch *, Contradiction>> suspects; // with their worst
-    while (!open.empty() && suspects.size() <= kMostNamed) {
+    Patches out;
+    while (!open.empty() && out.size() <= kMostNamed) {
         Counts often = count_of(open);
         const Patch *suspect = open.front().more;
         for (const auto &[patch, times] : often)
             if (std::pair(times, all[patch]) > std::pair(often[suspect], all[suspect]))
                 suspect = patch;
-        const Contradiction *worst = nullptr;
-        for (const Contradiction &one : open)
-            if ((one.less == suspect || one.more == suspect) &&
-                (!worst || one.density - one.of_more > worst->density - worst->of_more))
-                worst = &one;
-        suspects.emplace_back(suspect, *worst);
+        out.push_back(suspect);
         std::erase_if(open, [&](const Contradiction &one) {
             return one.less == suspect || one.more == suspect;
         });
     }
+    return out;
+}
+
+} // namespace
+
+void doubt_order(const std::vector<Patch> &patches, Kind kind, const Named &named,
+                 std::vector<Doubt> &out)
+{
+    constexpr std::array filters = {"red", "green", "blue"};
+    const bool colours = kind == Kind::colours;
+    const std::vector<Contradiction> contradictions =
+        contradictions_of(shades_of(patches, kind, named), colours ? 1 : filters.size());
+    const Patches suspects = suspects_of(contradictions);
     if (suspects.empty())
         return;
-    const auto &[suspect, worst] = suspects.front();
+    const auto is_suspect = [&](const Patch *patch) {
+        return std::find(suspects.begin(), suspects.end(), patch) != suspects.end();
+    };
+    // The worst, at best between two of them.
+    const Contradiction &worst = *std::max_element(
+        contradictions.begin(), contradictions.end(), [&](const auto &first, const auto &second) {
+            const auto weight = [&](const Contradiction &one) {
+                return std::pair(is_suspect(one.less) + is_suspect(one.more),
+                                 one.density - one.of_more);
+            };
+            return weight(first) < weight(second);
+        });
     std::vector<std::string> others;
-    for (const auto &[patch, contradiction] : suspects)
+    for (const Patch *patch : suspects)
         if (patch != worst.less && patch != worst.more)
             others.push_back(in_quotes(patch->name));
     if (others.size() > kMostNamed - 2)
         others.back() = "others";
     out.push_back(
-        {suspect->line,
+        {is_suspect(worst.more) ? worst.more->line : worst.less->line,
          fmt::format("{} has a {} density of {:.2f}, and {}, with as much or more of "
                      "every ink, {:.2f}{}: are rows exchanged?",
                      in_quotes(worst.less->name), colours ? "visual" : filters[worst.filter],
