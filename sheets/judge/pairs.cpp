@@ -2,119 +2,154 @@
 
 #include "judge/colour.h"
 #include "judge/device_values.h"
+#include "read/first_alike.h"
 #include "read/text.h"
 
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <array>
 #include <optional>
-#include <unordered_map>
+#include <string_view>
 #include <utility>
 
 namespace vantrel::sheets {
 namespace {
 
+constexpr std::size_t kNone = static_cast<std::size_t>(-1);
+
+// What a patch is called, by numbers that are equal where the texts are; kNone where there is none.
+struct Marks {
+    std::size_t id, name, device;
+};
+
 // What a pairing rests on.
 struct Sheets {
     const Measurement &reference, &sample;
     const DeviceValues &values;
+    std::vector<Marks> of_reference, of_sample;
 };
 
-// Texts that are numbered in the order in which they come; those of patches hold no end of line.
-class Numbers {
-public:
-    // Its number, and whether it is new.
-    std::pair<std::size_t, bool> add(std::string text)
-    {
-        const auto [found, is_new] = numbers.try_emplace(std::move(text), numbers.size());
-        return {found->second, is_new};
+// Of the patches of both sheets, one after the other.
+std::vector<std::size_t> numbers_of(const std::vector<std::string_view> &texts)
+{
+    std::vector<std::size_t> out = first_alike(texts);
+    for (std::size_t i = 0; i < out.size(); ++i)
+        if (texts[i].empty())
+            out[i] = kNone;
+    return out;
+}
+
+Sheets sheets_of(const Measurement &reference, const Measurement &sample,
+                 const DeviceValues &values)
+{
+    std::vector<std::string_view> ids, names;
+    std::vector<std::string> keys;
+    for (const Measurement *sheet : {&reference, &sample})
+        for (const Patch &patch : sheet->patches) {
+            ids.emplace_back(patch.id);
+            names.emplace_back(patch.name);
+            keys.push_back(values.key_of(patch));
+        }
+    const std::vector<std::size_t> id = numbers_of(ids), name = numbers_of(names),
+                                   device = numbers_of({keys.begin(), keys.end()});
+    Sheets out{reference, sample, values, {}, {}};
+    for (std::size_t i = 0; i < id.size(); ++i)
+        (i < reference.patches.size() ? out.of_reference : out.of_sample)
+            .push_back({id[i], name[i], device[i]});
+    return out;
+}
+
+// What tells patches apart under a pairing: first the key, then what follows.
+using Key = std::array<std::size_t, 3>;
+
+Key key_of(Pairing by, const Marks &marks, std::size_t place)
+{
+    switch (by) {
+    case Pairing::name:
+        return {marks.name, marks.device, kNone};
+    case Pairing::id:
+        return {marks.id, marks.device, marks.name};
+    case Pairing::device:
+        return {marks.device, kNone, marks.name};
+    case Pairing::order:
+    case Pairing::automatic:
+        break;
     }
-    std::optional<std::size_t> find(const std::string &text) const
-    {
-        const auto found = numbers.find(text);
-        return found == numbers.end() ? std::nullopt : std::optional(found->second);
-    }
+    return {place, marks.device, kNone};
+}
 
-private:
-    std::unordered_map<std::string, std::size_t> numbers;
-};
-
-// What tells patches apart: the key, then the device values, then the name.
-struct Marks {
-    std::string key, device, name;
-
-    std::string with_device() const { return key + '\n' + device; }
-    std::string all() const { return with_device() + '\n' + name; }
-};
-
+// The patches of the reference, sorted by their keys.
 class Finder {
 public:
-    Finder(const Sheets &sheets, Pairing by) : sheets(sheets), by(by)
+    Finder(const Sheets &sheets, Pairing by) : sheets(sheets)
     {
-        for (std::size_t i = 0; i < sheets.reference.patches.size(); ++i) {
-            const Marks marks = marks_of(sheets.reference, i);
-            if (marks.key.empty())
-                continue;
-            for (const std::string &text : {marks.key, marks.with_device(), marks.all()})
-                add(text, i);
+        for (std::size_t i = 0; i < sheets.of_reference.size(); ++i)
+            if (const Key key = key_of(by, sheets.of_reference[i], i); key[0] != kNone)
+                entries.push_back({key, i});
+        std::sort(entries.begin(), entries.end());
+        firsts.resize(entries.size());
+        for (std::size_t begin = 0, end = 0; begin < entries.size(); begin = end) {
+            First &first = firsts[begin] = {entries[begin].second, true};
+            for (; end < entries.size() && entries[end].first[0] == entries[begin].first[0]; ++end)
+                first.place = std::min(first.place, entries[end].second);
+            for (std::size_t i = begin; i < end && end - begin > 1; ++i)
+                first.alike =
+                    first.alike && agree(first, sheets.reference.patches[entries[i].second]);
         }
     }
 
-    Marks marks_of(const Measurement &sheet, std::size_t place) const
-    {
-        const Patch &patch = sheet.patches[place];
-        std::string device = sheets.values.key_of(patch);
-        switch (by) {
-        case Pairing::name:
-            return {patch.name, device, {}};
-        case Pairing::id:
-            return {patch.id, device, patch.name};
-        case Pairing::device:
-            return {device, {}, patch.name};
-        case Pairing::order:
-        case Pairing::automatic:
-            break;
-        }
-        return {std::to_string(place), device, {}};
-    }
-
-    struct Found {
-        std::size_t aim;
-        bool agrees;
+    // Entries that agree in the first so many parts of their keys.
+    struct Aim {
+        std::size_t parts, begin, end;
+        bool agrees; // in its device values
     };
-    std::optional<Found> find(const Patch &patch, const Marks &marks) const
+    // Those that agree in most.
+    std::optional<Aim> find(const Patch &patch, const Key &key) const
     {
-        for (const std::string &text : {marks.all(), marks.with_device()})
-            if (const auto aim = numbers.find(text))
-                return Found{*aim, true};
-        const auto aim = numbers.find(marks.key);
-        if (!aim)
-            return std::nullopt;
-        const Patch &first = sheets.reference.patches[aims[*aim].front()];
-        return Found{*aim, alike[*aim] && sheets.values.agree(first, patch)};
+        for (std::size_t parts = 3; parts > 0; --parts) {
+            const auto less = [parts](const Entry &one, const Entry &other) {
+                const auto count = static_cast<std::ptrdiff_t>(parts);
+                return std::lexicographical_compare(one.first.begin(), one.first.begin() + count,
+                                                    other.first.begin(),
+                                                    other.first.begin() + count);
+            };
+            const auto [begin, end] =
+                std::equal_range(entries.begin(), entries.end(), Entry{key, 0}, less);
+            if (begin == end)
+                continue;
+            const auto at = static_cast<std::size_t>(begin - entries.begin());
+            return Aim{parts, at, static_cast<std::size_t>(end - entries.begin()),
+                       parts > 1 || (firsts[at].alike && agree(firsts[at], patch))};
+        }
+        return std::nullopt;
     }
 
-    const std::vector<std::size_t> &places(std::size_t aim) const { return aims[aim]; }
+    // In the reference, in its order.
+    std::vector<std::size_t> places(const Aim &aim) const
+    {
+        std::vector<std::size_t> out;
+        for (std::size_t i = aim.begin; i < aim.end; ++i)
+            out.push_back(entries[i].second);
+        std::sort(out.begin(), out.end());
+        return out;
+    }
 
 private:
-    void add(const std::string &text, std::size_t place)
+    using Entry = std::pair<Key, std::size_t>; // and the place
+    struct First {
+        std::size_t place; // of the patches that share a first part
+        bool alike;        // whether the device values of all agree
+    };
+
+    bool agree(const First &first, const Patch &patch) const
     {
-        const auto [aim, is_new] = numbers.add(text);
-        if (is_new) {
-            aims.emplace_back();
-            alike.push_back(true);
-        } else if (alike[aim]) {
-            alike[aim] = sheets.values.agree(sheets.reference.patches[aims[aim].front()],
-                                             sheets.reference.patches[place]);
-        }
-        aims[aim].push_back(place);
+        return sheets.values.agree(sheets.reference.patches[first.place], patch);
     }
 
     const Sheets &sheets;
-    Pairing by;
-    Numbers numbers;
-    std::vector<std::vector<std::size_t>> aims; // places in the reference
-    std::vector<bool> alike;                    // whether their device values agree
+    std::vector<Entry> entries;
+    std::vector<First> firsts; // where such patches begin
 };
 
 struct Outcome {
@@ -138,36 +173,45 @@ Outcome pairs_by(Pairing by, const Sheets &sheets, const PairingRequest &request
     const Finder finder(sheets, by);
     Outcome out;
     out.pairs.by = out.result.by = by;
-    std::vector<Pair> &matched = out.pairs.matched;
-    std::vector<bool> reference_taken(sheets.reference.patches.size()),
-        sample_taken(sheets.sample.patches.size());
-    Numbers patches; // of the sample: repeats of a patch have one number
+    struct Hit {
+        Key group; // repeats of a patch are in one
+        std::size_t place;
+        Finder::Aim aim;
+    };
+    std::vector<Hit> hits;
     for (std::size_t i = 0; i < sheets.sample.patches.size(); ++i) {
         const Patch &patch = sheets.sample.patches[i];
-        const Marks marks = finder.marks_of(sheets.sample, i);
-        const auto found = marks.key.empty() ? std::nullopt : finder.find(patch, marks);
-        if (!found)
+        const Key key = key_of(by, sheets.of_sample[i], i);
+        const auto aim = key[0] == kNone ? std::nullopt : finder.find(patch, key);
+        if (!aim)
             continue;
-        const std::vector<std::size_t> &aim = finder.places(found->aim);
-        if (!found->agrees) {
+        if (!aim->agrees) {
             if (out.result.disagreeing++ == 0) {
-                out.reference = &sheets.reference.patches[aim.front()];
+                out.reference = &sheets.reference.patches[finder.places(*aim).front()];
                 out.sample = &patch;
             }
             if (!request.force)
                 continue;
         }
-        const auto [number, is_new] =
-            patches.add(request.each    ? std::to_string(i)
-                        : request.zones ? std::to_string(found->aim)
-                                        : fmt::format("{}\n{}", found->aim, marks.all()));
-        if (is_new) {
-            matched.push_back({aim, {}});
-            for (const std::size_t place : aim)
+        const Key group = request.each    ? Key{i, 0, 0}
+                          : request.zones ? Key{aim->parts, aim->begin, 0}
+                                          : key;
+        hits.push_back({group, i, *aim});
+    }
+    std::sort(hits.begin(), hits.end(), [](const Hit &one, const Hit &other) {
+        return std::pair(one.group, one.place) < std::pair(other.group, other.place);
+    });
+    std::vector<Pair> &matched = out.pairs.matched;
+    std::vector<bool> reference_taken(sheets.reference.patches.size()),
+        sample_taken(sheets.sample.patches.size());
+    for (std::size_t i = 0; i < hits.size(); ++i) {
+        if (i == 0 || hits[i].group != hits[i - 1].group) {
+            matched.push_back({finder.places(hits[i].aim), {}});
+            for (const std::size_t place : matched.back().reference)
                 reference_taken[place] = true;
         }
-        matched[number].sample.push_back(i);
-        sample_taken[i] = true;
+        matched.back().sample.push_back(hits[i].place);
+        sample_taken[hits[i].place] = true;
     }
     std::sort(matched.begin(), matched.end(), [](const Pair &first, const Pair &second) {
         return std::pair(first.reference.front(), first.sample.front()) <
@@ -342,7 +386,7 @@ Pairs pairs_of(const Measurement &reference, const Measurement &sample,
                const PairingRequest &request, std::vector<std::string> &warnings)
 {
     const DeviceValues values(reference, sample);
-    const Sheets sheets{reference, sample, values};
+    const Sheets sheets = sheets_of(reference, sample, values);
     Outcome outcome = request.by == Pairing::automatic ? automatic_pairs(sheets, request, warnings)
                                                        : named_pairs(sheets, request, warnings);
     if (outcome.pairs.matched.empty())

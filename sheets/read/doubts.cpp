@@ -1,5 +1,6 @@
 #include "read/doubts.h"
 
+#include "read/first_alike.h"
 #include "read/shades.h"
 #include "read/text.h"
 
@@ -211,15 +212,24 @@ void doubt_places(const std::vector<Patch> &patches, std::vector<Doubt> &out)
                                                 in_quotes(before->name), in_quotes(after->name))});
 }
 
+std::vector<std::string_view> texts_of(const std::vector<Patch> &patches, std::string Patch::*text)
+{
+    std::vector<std::string_view> out;
+    out.reserve(patches.size());
+    for (const Patch &patch : patches)
+        out.emplace_back(patch.*text);
+    return out;
+}
+
 // An id that stands for several patches of other names, or a name for several device values: a slip
 // where they are few, the way of the file where they are many.
 void doubt_names(const std::vector<Patch> &patches, std::vector<Doubt> &out)
 {
-    std::map<std::string_view, const Patch *> ids, names; // the first of each
+    const std::vector<std::size_t> ids = first_alike(texts_of(patches, &Patch::id)),
+                                   names = first_alike(texts_of(patches, &Patch::name));
     std::vector<Doubt> slips;
-    for (const Patch &patch : patches) {
-        const Patch &same_id = *ids.emplace(patch.id, &patch).first->second;
-        const Patch &same_name = *names.emplace(patch.name, &patch).first->second;
+    for (std::size_t i = 0; i < patches.size(); ++i) {
+        const Patch &patch = patches[i], &same_id = patches[ids[i]], &same_name = patches[names[i]];
         if (same_id.name != patch.name)
             slips.push_back(
                 {patch.line, fmt::format("the id {} stands for {} and {}", in_quotes(patch.id),
@@ -241,6 +251,7 @@ void doubt_copies(const std::vector<Patch> &patches, std::vector<Doubt> &out)
         std::size_t count = 0;
     } strangers, repeats; // of other device values; of the same, or none
     std::vector<std::pair<std::uint64_t, std::size_t>> hashes;
+    hashes.reserve(patches.size());
     for (std::size_t i = 0; i < patches.size(); ++i)
         hashes.emplace_back(hash_of(patches[i].refl), i);
     std::sort(hashes.begin(), hashes.end());
