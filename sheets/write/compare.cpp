@@ -160,24 +160,25 @@ void add_verdicts(Lines &lines, const Comparison &comparison)
 
 Json side_json(const Side &side)
 {
-    return {{"id", side.id},
-            {"name", side.name},
-            {"rgb", hex(side.colour.rgb)},
-            {"lab", lab_json(side.colour.lab)},
-            {"density", or_null(side.density)},
-            {"refl", or_null(side.refl)},
-            {"repeats", side.repeats},
-            {"spread", or_null(side.spread)}};
+    Members out;
+    out.add("id", side.id);
+    out.add("name", side.name);
+    out.add("rgb", hex(side.colour.rgb));
+    out.add("lab", lab_json(side.colour.lab));
+    out.add("density", or_null(side.density));
+    out.add("refl", or_null(side.refl));
+    out.add("repeats", side.repeats);
+    out.add("spread", or_null(side.spread));
+    return std::move(out.members);
 }
 
 Json means_json(const std::optional<Means> &means)
 {
-    if (!means)
-        return {};
-    return {{"patches", means->patches},
-            {"widest", means->widest},
-            {"repeats", means->repeats},
-            {"spread", means->spread}};
+    return means ? Json({{"patches", means->patches},
+                         {"widest", means->widest},
+                         {"repeats", means->repeats},
+                         {"spread", means->spread}})
+                 : Json();
 }
 
 Json sheet_json(const std::string &file, const PaperChoice &paper)
@@ -206,25 +207,26 @@ Json tries_json(const std::vector<PairingTry> &tries)
 
 Json pair_json(const PairReport &pair, const Comparison &comparison)
 {
-    Json out = {{"name", pair.name()},
-                {"reference", side_json(pair.reference)},
-                {"sample", side_json(pair.sample)}};
+    const auto formula = [&](std::size_t i) { return names_of(comparison.metrics[i].formula).key; };
+    Members out;
+    out.add("name", pair.name());
+    out.add("reference", side_json(pair.reference));
+    out.add("sample", side_json(pair.sample));
     for (std::size_t i = 0; i < pair.delta_e.size(); ++i)
-        out[std::string(names_of(comparison.metrics[i].formula).key)] = pair.delta_e[i];
-    out["verbal"] = or_null(pair.verbal);
-    out["metamerism"] = or_null(pair.metamerism);
-    out["din6172"] = or_null(pair.din6172);
-    out["response"] =
-        pair.response ? Json(response_name(comparison.status, *pair.response)) : Json();
-    out["density_difference"] = or_null(pair.density_difference);
-    if (!pair.corrected_aim)
-        return out;
-    Json &corrected = out["corrected"];
-    corrected["lab"] = lab_json(*pair.corrected_aim);
-    for (std::size_t i = 0; i < pair.corrected_delta_e.size(); ++i)
-        corrected[std::string(names_of(comparison.metrics[i].formula).key)] =
-            pair.corrected_delta_e[i];
-    return out;
+        out.add(formula(i), pair.delta_e[i]);
+    out.add("verbal", or_null(pair.verbal));
+    out.add("metamerism", or_null(pair.metamerism));
+    out.add("din6172", or_null(pair.din6172));
+    out.add("response", response_json(pair.response, comparison.status));
+    out.add("density_difference", or_null(pair.density_difference));
+    if (pair.corrected_aim) {
+        Members corrected;
+        corrected.add("lab", lab_json(*pair.corrected_aim));
+        for (std::size_t i = 0; i < pair.corrected_delta_e.size(); ++i)
+            corrected.add(formula(i), pair.corrected_delta_e[i]);
+        out.add("corrected", std::move(corrected.members));
+    }
+    return std::move(out.members);
 }
 
 Json statistics_json(const Comparison &comparison, const std::vector<Statistics> &statistics)
@@ -446,12 +448,9 @@ std::vector<Flat> flat_of(const Comparison &comparison)
                [&pairs](std::size_t i) { return static_cast<double>(pairs[i].reference.repeats); });
     flat.number("reference_spread", "REFERENCE_SPREAD",
                 [&pairs](std::size_t i) { return pairs[i].reference.spread; });
-    flat.text("paper", "PAPER",
-              [&comparison](std::size_t) { return said(comparison.sample_paper); });
-    flat.text("reference_paper", "REFERENCE_PAPER",
-              [&comparison](std::size_t) { return said(comparison.reference_paper); });
-    flat.text("verdict", "VERDICT",
-              [&comparison](std::size_t) { return word_of(comparison.verdict); });
+    flat.same("paper", "PAPER", said(comparison.sample_paper));
+    flat.same("reference_paper", "REFERENCE_PAPER", said(comparison.reference_paper));
+    flat.same("verdict", "VERDICT", word_of(comparison.verdict));
     if (pairs.front().sample.refl)
         flat.spectrum(
             [&pairs](std::size_t i) -> const Spectrum & { return *pairs[i].sample.refl; });

@@ -53,8 +53,19 @@ std::string without_formulas(std::string_view text)
     return out;
 }
 
-std::string csv_text(const std::string &text)
+// Whether a text holds nothing that would have to be escaped.
+bool is_plain(std::string_view text)
 {
+    return std::none_of(text.begin(), text.end(), [](char c) {
+        return c == ',' || c == '"' || c == '\r' || c == '\n' || c == '=' || c == '+' || c == '-' ||
+               c == '@' || c == '\xef'; // the first byte of a full-width sign
+    });
+}
+
+std::string csv_text(std::string text)
+{
+    if (is_plain(text))
+        return text;
     std::string safe = without_formulas(text);
     if (safe.find_first_of(",\"\r\n") == std::string::npos)
         return safe;
@@ -237,6 +248,12 @@ void Flat::text(std::string name, std::string cgats, std::function<std::string(s
                        [get = std::move(get)](std::size_t i, std::string &out) { out += get(i); }});
 }
 
+void Flat::same(std::string name, std::string cgats, std::string text)
+{
+    columns.push_back({std::move(name), std::move(cgats), true,
+                       [text = std::move(text)](std::size_t, std::string &out) { out += text; }});
+}
+
 void Flat::number(std::string name, std::string cgats,
                   std::function<std::optional<double>(std::size_t)> get)
 {
@@ -302,10 +319,12 @@ void Flat::device(const std::vector<std::string> &names,
         std::unordered_map<std::string_view, double> values;
     };
     const auto row = std::make_shared<Row>(); // whose cells are asked for one after the other
-    for (const std::string &name : names)
-        exact(name, name, [get, name, row](std::size_t i) {
+    for (std::size_t at = 0; at < names.size(); ++at)
+        exact(names[at], names[at], [get, name = names[at], at, row](std::size_t i) {
+            const Device &device = get(i);
+            if (at < device.size() && device[at].first == name) // as where every patch has all
+                return std::optional(device[at].second);
             if (row->place != i) {
-                const Device &device = get(i);
                 *row = {i, {device.begin(), device.end()}};
             }
             const auto own = row->values.find(name);

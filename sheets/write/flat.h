@@ -37,6 +37,7 @@ struct Flat {
     // Add columns, given what a row holds there. A number has four decimals, an exact one all that
     // it takes; nothing makes an empty cell.
     void text(std::string name, std::string cgats, std::function<std::string(std::size_t)> get);
+    void same(std::string name, std::string cgats, std::string text); // in every row
     void number(std::string name, std::string cgats,
                 std::function<std::optional<double>(std::size_t)> get);
     void exact(std::string name, std::string cgats,

@@ -13,42 +13,42 @@ Json lab_json(const CIELABCOORD &lab) { return {lab.L, lab.a, lab.b}; }
 
 Json name_json(const PaperChoice &paper) { return paper.exists() ? Json(paper.name) : Json(); }
 
+Json response_json(const std::optional<int> &response, int status)
+{
+    return response ? Json(response_name(status, *response)) : Json();
+}
+
 void add_reading(Json &object, const DensityReading &reading, int status)
 {
-    object["response"] = reading.response ? Json(response_name(status, *reading.response)) : Json();
+    object["response"] = response_json(reading.response, status);
     object["density"] = or_null(reading.density);
 }
 
-// Member by member: braces would make an array of every pair first.
 Json patch_json(const PatchReport &patch, int status)
 {
-    Json::object_t out;
-    out.reserve(19);
-    const auto add = [&out](const char *name, Json value) {
-        out.emplace_back(name, std::move(value));
-    };
+    Members out;
     Json::object_t device;
     for (const auto &[field, value] : patch.patch->device)
         device[field] = value;
-    add("id", patch.patch->id);
-    add("name", patch.patch->name);
-    add("device", std::move(device));
-    add("rgb", hex(patch.colour.rgb));
-    add("lab", lab_json(patch.colour.lab));
-    add("lch", {patch.lch.L, patch.lch.C, patch.lch.h});
-    add("de00_to_paper", or_null(patch.to_paper));
-    add("response", patch.response ? Json(response_name(status, *patch.response)) : Json());
-    add("response_id", or_null(patch.response));
-    add("density", or_null(patch.density));
-    add("dot_area", or_null(patch.dot_area));
-    add("dot_gain", or_null(patch.dot_gain));
-    add("sctv", or_null(patch.sctv));
-    add("print_contrast", or_null(patch.print_contrast));
-    add("hue_error", or_null(patch.hue_error));
-    add("grayness", or_null(patch.grayness));
-    add("trap", or_null(patch.trap));
-    add("refl", patch.refl ? Json(*patch.refl) : Json());
-    return out;
+    out.add("id", patch.patch->id);
+    out.add("name", patch.patch->name);
+    out.add("device", std::move(device));
+    out.add("rgb", hex(patch.colour.rgb));
+    out.add("lab", lab_json(patch.colour.lab));
+    out.add("lch", {patch.lch.L, patch.lch.C, patch.lch.h});
+    out.add("de00_to_paper", or_null(patch.to_paper));
+    out.add("response", response_json(patch.response, status));
+    out.add("response_id", or_null(patch.response));
+    out.add("density", or_null(patch.density));
+    out.add("dot_area", or_null(patch.dot_area));
+    out.add("dot_gain", or_null(patch.dot_gain));
+    out.add("sctv", or_null(patch.sctv));
+    out.add("print_contrast", or_null(patch.print_contrast));
+    out.add("hue_error", or_null(patch.hue_error));
+    out.add("grayness", or_null(patch.grayness));
+    out.add("trap", or_null(patch.trap));
+    out.add("refl", patch.refl ? Json(*patch.refl) : Json());
+    return std::move(out.members);
 }
 
 void add_advice(Json &object, const std::vector<SolidAdvice> &advice)

@@ -15,6 +15,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 namespace vantrel::sheets {
@@ -26,11 +27,22 @@ template <typename Value> Json or_null(const std::optional<Value> &value)
     return value ? Json(*value) : Json();
 }
 
+// An object of a row, member by member: braces would make an array of every pair first, and a
+// search for its name goes through all.
+struct Members {
+    Json::object_t members;
+
+    Members() { members.reserve(20); }
+    void add(std::string_view name, Json value) { members.emplace_back(name, std::move(value)); }
+};
+
 struct PatchReport; // judge/report.h
 
 Json lab_json(const CIELABCOORD &lab);
 
 Json name_json(const PaperChoice &paper); // null where there is none
+
+Json response_json(const std::optional<int> &response, int status); // its name
 
 // Adds `response` and `density`.
 void add_reading(Json &object, const DensityReading &reading, int status);

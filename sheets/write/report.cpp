@@ -286,7 +286,7 @@ Flat flat_of(const Report &report)
                                    name_of(report.illuminant), status_name(report.status),
                                    over(report.paper.choice), report.n_factor);
     flat.rows = patches.size();
-    flat.text("file", "", [&report](std::size_t) { return report.sheet->file; });
+    flat.same("file", "", report.sheet->file);
     flat.text("id", "SAMPLE_ID", [&patches](std::size_t i) { return patches[i].patch->id; });
     flat.text("name", "SAMPLE_NAME", [&patches](std::size_t i) { return patches[i].patch->name; });
     flat.device(device_names(report), [&patches](std::size_t i) -> const Flat::Device & {
@@ -311,7 +311,7 @@ Flat flat_of(const Report &report)
                 [&patches](std::size_t i) { return patches[i].hue_error; });
     flat.number("grayness", "GRAYNESS", [&patches](std::size_t i) { return patches[i].grayness; });
     flat.number("trap", "TRAP", [&patches](std::size_t i) { return patches[i].trap; });
-    flat.text("paper", "PAPER", [&report](std::size_t) { return said(report.paper.choice); });
+    flat.same("paper", "PAPER", said(report.paper.choice));
     if (patches.front().refl)
         flat.spectrum([&patches](std::size_t i) -> const Spectrum & { return *patches[i].refl; });
     if (report.advice.empty()) {
