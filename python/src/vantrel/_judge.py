@@ -408,11 +408,14 @@ def run(
 
     Examples
     --------
-    >>> import dataclasses
+    >>> from dataclasses import replace
     >>> aims = vantrel.read("examples/two_ink_halftone.txt")
-    >>> run = vantrel.run([dataclasses.replace(aims, spectra=aims.spectra * 0.98)], aims)
+    >>> dates = [replace(aims.origin, created=f"2026-03-{day}") for day in range(11, 16)]
+    >>> darker = [aims.spectra * (0.98 - i / 200) for i in range(5)]
+    >>> sheets = [replace(aims, spectra=s, origin=date) for s, date in zip(darker, dates)]
+    >>> run = vantrel.run(sheets, aims)
     >>> print(run.series[-1].title, np.round(run.series[-1].values, 2))
-    largest ΔE00 [0.46]
+    largest ΔE00 [0.46 0.58 0.69 0.81 0.93]
     """
     taken, unread = [], []
     for sheet in sheets:
