@@ -48,14 +48,12 @@ double mean_if(const std::vector<const PairReport *> &pairs, ILLUM_OBS illuminan
     return sum / static_cast<double>(pairs.size());
 }
 
-// Its values a band further, the last one held.
-Spectrum moved(const Spectrum &refl, bool up)
+// Its values some bands further, the last one held.
+Spectrum moved(const Spectrum &refl, int bands)
 {
-    Spectrum out = refl;
-    if (up)
-        std::copy(refl.begin(), refl.end() - 1, out.begin() + 1);
-    else
-        std::copy(refl.begin() + 1, refl.end(), out.begin());
+    Spectrum out{};
+    for (int band = 0; band < VANTREL_BANDS; ++band)
+        out[band] = refl[std::clamp(band - bands, 0, VANTREL_BANDS - 1)];
     return out;
 }
 
@@ -148,6 +146,18 @@ void warn_of_wide_means(const std::optional<Means> &means, const std::string &fi
 
 void warn_of_same(Comparison &out)
 {
+    std::size_t copied = 0;
+    const PairReport *copy = nullptr; // the first
+    for (const PairReport &pair : out.pairs)
+        if (pair.sample.refl && pair.reference.refl == pair.sample.refl && copied++ == 0)
+            copy = &pair;
+    if (copy && copied < out.pairs.size()) {
+        out.warnings.push_back(fmt::format("{}: {} of {} pairs have the spectrum of their aim to "
+                                           "the last digit, the first {}: were they measured?",
+                                           out.sample, copied, out.pairs.size(),
+                                           in_quotes(copy->sample.name)));
+        return;
+    }
     const bool spectra =
         std::all_of(out.pairs.begin(), out.pairs.end(),
                     [](const PairReport &pair) { return pair.reference.refl && pair.sample.refl; });
@@ -218,11 +228,12 @@ bool warn_of_better_fit(Comparison &out)
             how = words();
         }
     };
-    for (const bool up : {false, true})
-        consider(mean_if(pairs, illuminant, [up](const Spectrum &refl) { return moved(refl, up); }),
-                 [up] {
+    for (const int bands : {-2, -1, 1, 2})
+        consider(mean_if(pairs, illuminant,
+                         [bands](const Spectrum &refl) { return moved(refl, bands); }),
+                 [bands] {
                      return fmt::format("with its spectra moved by {} nm: are wavelengths wrong?",
-                                        up ? 10 : -10);
+                                        10 * bands);
                  });
     const Line line = line_of(pairs);
     if (line.factor > 0.2)

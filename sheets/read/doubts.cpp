@@ -28,9 +28,10 @@ constexpr double kSpike = 10;         // of a band beyond both its neighbours; b
 constexpr double kFullTint = 50;      // from which on an ink shows its colour
 constexpr double kMostFraction = 1.5; // of paper with brightener
 constexpr double kMostPercent = 300;
-constexpr double kLeastPercent = 20; // of the lightest patch
-constexpr double kBlackest = 0.1;    // percent, which no print is below throughout
-constexpr double kCoat = 25;         // C*: more than black has
+constexpr double kLeastPercent = 20;   // of the lightest patch
+constexpr double kBlackest = 0.1;      // percent, which no print is below throughout
+constexpr double kMostLightness = 110; // L*; of a fluorescent paper
+constexpr double kCoat = 25;           // C*: more than black has
 constexpr double kPi = 3.14159265358979323846;
 constexpr double kMostOfBlack = 0.6; // between the densities of a black
 constexpr double kLeastOfInk = 0.1;  // between those of two filters, beyond what paper and noise do
@@ -60,6 +61,32 @@ void doubt_bands(const std::vector<Patch> &patches, std::vector<Doubt> &out)
         if (most[band] - least[band] <= kDeadRange)
             out.push_back({0, fmt::format("the band at {} reads {:g} % in every patch", nm_of(band),
                                           least[band])});
+}
+
+// Bands beside each other that read alike everywhere, but for those at the ends, where a value may
+// be held.
+void doubt_alike(const std::vector<Patch> &patches, std::vector<Doubt> &out)
+{
+    constexpr std::size_t bands = VANTREL_BANDS;
+    std::vector<bool> as_before(bands);
+    for (std::size_t band = 1; band < bands; ++band)
+        as_before[band] =
+            std::all_of(
+                patches.begin(), patches.end(),
+                [&](const Patch &patch) { return patch.refl[band] == patch.refl[band - 1]; }) &&
+            std::any_of(patches.begin(), patches.end(), [&](const Patch &patch) {
+                return std::abs(patch.refl[band] - patches[0].refl[band]) > kDeadRange;
+            });
+    std::size_t begin = 1, end = bands;
+    while (begin < end && as_before[begin])
+        ++begin;
+    while (end > begin && as_before[end - 1])
+        --end;
+    while (begin < end && !as_before[begin])
+        ++begin;
+    if (patches.size() >= 3 && begin < end)
+        out.push_back({0, fmt::format("the bands at {} and {} read alike in every patch",
+                                      nm_of(begin - 1), nm_of(begin))});
 }
 
 void doubt_zeros(const std::vector<Patch> &patches, Named &named, std::vector<Doubt> &out)
@@ -280,6 +307,23 @@ void doubt_copies(const std::vector<Patch> &patches, std::vector<Doubt> &out)
                          in_quotes(patches[repeats.first->first].name), and_more(repeats.count))});
 }
 
+// L* from 0 to 1, or above what anything reflects.
+void doubt_lightness(const std::vector<Patch> &patches, std::vector<Doubt> &out)
+{
+    const Patch *lightest = nullptr;
+    double coat = 0;
+    for (const Patch &patch : patches) {
+        if (!patch.lab)
+            continue;
+        lightest = !lightest || patch.lab->L > lightest->lab->L ? &patch : lightest;
+        coat = std::max(coat, std::hypot(patch.lab->a, patch.lab->b));
+    }
+    if (lightest && (lightest->lab->L > kMostLightness || (lightest->lab->L <= 1 && coat > kCoat)))
+        out.push_back({lightest->line, fmt::format("the largest L*, of {}, is {:g}: is it of "
+                                                   "another scale?",
+                                                   in_quotes(lightest->name), lightest->lab->L)});
+}
+
 struct Ink {
     std::string_view field, name;
 };
@@ -445,9 +489,12 @@ std::vector<Doubt> doubts_about(const std::vector<Patch> &patches, Kind kind)
             doubt_scales(patches, named, out);
         doubt_zeros(patches, named, out);
         doubt_bands(patches, out);
+        doubt_alike(patches, out);
         doubt_signs(patches, out);
         doubt_spikes(patches, out);
     }
+    if (kind == Kind::colours)
+        doubt_lightness(patches, out);
     doubt_ids(patches, out);
     doubt_places(patches, out);
     doubt_names(patches, out);

@@ -68,8 +68,8 @@ class Metamerism:
     chosen: str
     de00: float
     illuminant: str
-    sum: float
-    din6172: float
+    sum: Optional[float]
+    din6172: Optional[float]
 
 
 @dataclass(frozen=True)
