@@ -263,7 +263,7 @@ def test_results_are_those_of_the_program(call, command, sheet, darker, tmp_path
     assert len(frame) > 1 and frame.shape[1] > 6 and "<pre>" in result._repr_html_()
 
 
-@pytest.mark.filterwarnings("ignore:.*(transmission, not reflectance|largest reflectance is 0.904)")
+@pytest.mark.filterwarnings("ignore:.*(transmission, not reflectance|largest reflectance is 0.904|a green density of)")
 def test_what_is_written_reads_back(sheet, tmp_path):
     odd = replace(
         sheet,

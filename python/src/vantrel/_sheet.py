@@ -30,7 +30,7 @@ _OPTIONS = {
         option: option.replace("-", "_") + "="
         for option in (
             "advice", "condition", "force-pairs", "illuminant", "pair", "paper", "scale",
-            "substrate-corrected",
+            "second-paper", "substrate-corrected",
         )
     },
 }
@@ -43,7 +43,8 @@ class Source:
 
     `averaged`: several of its values make a band. `interpolated`: they are 20 nm apart. `held`: the
     last value stands for bands outside their range. `scaled`: they are not in percent there, and
-    `scale_by` says what told so: a keyword, the kind of file, "values" or the option "--scale". `condition`: M0 to M3 (ISO 13655), "" where the file does not say.
+    `scale_by` says what told so: a keyword, the kind of file, "values" or the option "--scale".
+    `condition`: M0 to M3 (ISO 13655), "" where the file does not say.
     """
 
     first_nm: float
