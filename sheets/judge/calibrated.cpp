@@ -318,6 +318,11 @@ std::optional<Spectrum> CalibratedModel::predict(const Tints &tints) const
     return estimate(place_without(tints));
 }
 
+bool CalibratedModel::ends_range(double n_factor)
+{
+    return n_factor == kFactors.front() || n_factor == kFactors.back();
+}
+
 std::vector<std::string> CalibratedModel::lacking(const Tints &tints) const
 {
     std::vector<std::string> out;

@@ -33,6 +33,7 @@ public:
     std::vector<std::string> lacking(const Tints &tints) const;
 
     double n_factor() const { return n; }
+    static bool ends_range(double n_factor); // of those that are tried
 
     // ΔE00 of the sheet's overprints with tints, each predicted without it, n chosen without it
     // too; nothing where there are none.

@@ -320,11 +320,12 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
                    .advice = {},
                    .warnings = std::move(warnings),
                    .verdict = {}};
-    for (const auto &[sheet, alone] :
-         {std::pair{&reference, &out.only_reference}, std::pair{&sample, &out.only_sample}})
+    for (const auto &[sheet, other, alone] : {std::tuple{&reference, &sample, &out.only_reference},
+                                              std::tuple{&sample, &reference, &out.only_sample}})
         if (!alone->empty())
-            out.warnings.push_back(fmt::format("{}: {} of {} patches have no partner", sheet->file,
-                                               alone->size(), sheet->patches.size()));
+            out.warnings.push_back(fmt::format("{}: {} of {} patches have no partner in {}",
+                                               sheet->file, alone->size(), sheet->patches.size(),
+                                               other->file));
     warn_of_uneven(pairs, reference, sample, out.warnings);
     const Work work{request.tell, "Comparing", pairs.matched.size()};
     out.pairs.reserve(pairs.matched.size());

@@ -35,6 +35,12 @@ double Densitometer::density(const Spectrum &refl, int response) const
     return density - of_paper;
 }
 
+double Densitometer::neutral_density(const Spectrum &refl) const
+{
+    const bool filters = status != SPECTRAL_STATUS && status != SPECTRALX_STATUS;
+    return Densitometer(paper, filters ? status : E_STATUS).density(refl, VISUAL_RESPONSE);
+}
+
 std::optional<double> Densitometer::dot_area(const Spectrum &solid, const Spectrum &tint,
                                              double n_factor) const
 {

@@ -26,6 +26,9 @@ public:
     // Over the paper under every status: SPECTRAL_STATUS, which takes no paper, included.
     double density(const Spectrum &refl, int response) const;
 
+    // Visual, over the paper; by E_STATUS under the statuses of wavelengths, which have no filters.
+    double neutral_density(const Spectrum &refl) const;
+
     // Measured in the solid's response; nothing where the solid has no density above the paper's.
     std::optional<double> dot_area(const Spectrum &solid, const Spectrum &tint,
                                    double n_factor) const;

@@ -297,7 +297,7 @@ bool contradict(const Pairs &first, const Pairs &second, const Sheets &sheets)
 }
 
 // Of two keys between which no device values decide.
-void choose_by_colour(Outcome &best, Outcome &other, const Sheets &sheets,
+void choose_by_colour(Outcome &best, Outcome &other, const Sheets &sheets, std::string_view hint,
                       std::vector<std::string> &warnings)
 {
     const double mean = mean_difference(best.pairs, sheets),
@@ -306,10 +306,10 @@ void choose_by_colour(Outcome &best, Outcome &other, const Sheets &sheets,
         std::swap(best, other);
     warnings.push_back(fmt::format("{} and {} pair otherwise {} (mean ΔE00 {:.2f}) than {} "
                                    "({:.2f}), and no device values tell "
-                                   "which is right; --pair chooses",
+                                   "which is right{}",
                                    sheets.reference.file, sheets.sample.file,
                                    phrase_of(best.pairs.by), std::min(mean, of_other),
-                                   phrase_of(other.pairs.by), std::max(mean, of_other)));
+                                   phrase_of(other.pairs.by), std::max(mean, of_other), hint));
 }
 
 std::string told(const PairingTry &result, const Sheets &sheets)
@@ -335,7 +335,8 @@ Outcome automatic_pairs(const Sheets &sheets, const PairingRequest &request,
             continue;
         }
         if (!sheets.values.comparable() && contradict(best->pairs, outcome.pairs, sheets))
-            choose_by_colour(*best, outcome, sheets, warnings);
+            choose_by_colour(*best, outcome, sheets, request.zones ? "" : "; --pair chooses",
+                             warnings);
         else if (outcome.result.reference + outcome.result.sample >
                  best->result.reference + best->result.sample)
             std::swap(*best, outcome);
@@ -356,12 +357,12 @@ Outcome automatic_pairs(const Sheets &sheets, const PairingRequest &request,
         std::string tries;
         for (const PairingTry &result : passed_over)
             tries += (tries.empty() ? "" : "; ") + told(result, sheets);
-        throw RequestError{
-            fmt::format("{} and {} have {} and {} patches, and most find no partner: "
-                        "{}; choose with --pair",
-                        sheets.reference.file, sheets.sample.file, sheets.reference.patches.size(),
-                        sheets.sample.patches.size(),
-                        tries.empty() ? "no names, ids or device values" : tries)};
+        throw RequestError{fmt::format(
+            "{} and {} have {} and {} patches, and most find no partner: "
+            "{}{}",
+            sheets.reference.file, sheets.sample.file, sheets.reference.patches.size(),
+            sheets.sample.patches.size(), tries.empty() ? "no names, ids or device values" : tries,
+            request.zones ? "" : "; choose with --pair")};
     }
     best->pairs.passed_over = std::move(passed_over);
     return std::move(*best);

@@ -24,7 +24,7 @@ struct Row {
     int decimals;
     double apart;
 };
-constexpr std::array<Row, 10> kAttributes = {{
+constexpr std::array<Row, 11> kAttributes = {{
     {Attribute::density, "density", "density", 3, 0.02},
     {Attribute::tone_value, "tone_value", "tone value", 2, 1},
     {Attribute::contrast, "contrast", "contrast", 2, 1},
@@ -33,6 +33,7 @@ constexpr std::array<Row, 10> kAttributes = {{
     {Attribute::solid, "solid", "solid ΔE00", 2, 0.5},
     {Attribute::delta_ch, "delta_ch", "ΔCh", 2, 0.5},
     {Attribute::delta_l, "delta_l", "ΔL*", 2, 0.5},
+    {Attribute::neutral, "neutral", "neutral density", 3, 0.02},
     {Attribute::mean_de00, "mean_de00", "mean ΔE00", 2, 0.5},
     {Attribute::max_de00, "max_de00", "largest ΔE00", 2, 0.5},
 }};
@@ -69,6 +70,7 @@ public:
     Measurement sheet;
     Pairs pairs;
     std::vector<int> zones; // of the patches; 0 for none
+    bool by_place = false;  // the zones
 
 private:
     // Where most aims serve the same number of patches.
@@ -80,7 +82,8 @@ private:
         const auto most = std::max_element(often.begin(), often.end(), [](auto &a, auto &b) {
                               return a.second < b.second;
                           })->first;
-        if (most < 2)
+        by_place = most >= 2;
+        if (!by_place)
             return;
         for (const Pair &pair : pairs.matched)
             for (std::size_t i = 0; i < pair.sample.size() && pair.sample.size() == most; ++i)
@@ -138,6 +141,13 @@ public:
             add_trap(tints, printed);
         if (printed.control)
             add_distances(tints, printed);
+        const bool black = tints.size() == 1 && inks.names()[tints[0].ink] == "CMYK_K" &&
+                           tints[0].percent < 100 && is_shown(tints[0]);
+        if (black || (printed.control && is_neutral(*printed.control)))
+            add({Attribute::neutral, short_title_of(tints)}, printed, {},
+                [&](const Spectrum &refl, int) {
+                    return std::optional(densitometer.neutral_density(refl));
+                });
     }
 
     std::vector<ZoneReading> readings;
@@ -355,6 +365,9 @@ SheetReadings readings_of(const Measurement &aims, Measurement measured, Compare
     out.verdict = comparison.verdict;
     out.paper = paper.refl;
     out.warnings = std::move(comparison.warnings);
+    if (zoned.by_place)
+        out.warnings.push_back(sheet.file + ": no names tell the zones; their order in the file is "
+                                            "taken for it, a guess");
     return out;
 }
 

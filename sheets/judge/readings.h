@@ -23,6 +23,7 @@ enum class Attribute {
     solid,    // ΔE00 to the aim
     delta_ch, // √(Δa*² + Δb*²) of a near-neutral to its aim
     delta_l,  // ΔL* of a near-neutral to its aim, signed
+    neutral,  // visual density of a near-neutral or a tint of black, over the paper
     mean_de00,
     max_de00,
 };

@@ -10,6 +10,7 @@
 
 #include <algorithm>
 #include <map>
+#include <tuple>
 #include <utility>
 
 namespace vantrel::sheets {
@@ -212,6 +213,27 @@ void warn_of_lost_repeats(const Measurement &sheet, const Inks &inks,
     }
 }
 
+// A patch is near-neutral by its own colour.
+std::vector<NeutralStep> neutral_steps(const std::vector<PatchReport> &rows, const Paper &paper,
+                                       int status)
+{
+    std::vector<NeutralStep> out;
+    for (std::size_t i = 0; i < rows.size(); ++i) {
+        ControlPatch patch;
+        patch.aim = rows[i].colour.lab;
+        for (const auto &[field, percent] : rows[i].patch->device)
+            if (is_ink(field) && percent > 0)
+                patch.inks.emplace_back(field, percent);
+        if (const auto place = grey_place_of(patch); place && rows[i].refl)
+            out.push_back({*place, i, rows[i].patch->name,
+                           Densitometer(paper.refl, status).neutral_density(*rows[i].refl)});
+    }
+    std::stable_sort(out.begin(), out.end(), [](const NeutralStep &a, const NeutralStep &b) {
+        return std::tie(a.scale, a.nominal) < std::tie(b.scale, b.nominal);
+    });
+    return out;
+}
+
 // For the solids, by the mean of the patches of each, as compare() gives it.
 void add_advice(Report &report, const ReportRequest &request)
 {
@@ -252,6 +274,7 @@ Report report_of(Measurement measurement, const ReportRequest &request)
                   .metamerism = std::move(metamerism),
                   .patches = {},
                   .tone_curves = {},
+                  .greys = {},
                   .advice = {},
                   .warnings = std::move(warnings)};
     const Conditions conditions{sheet, inks, paper, illuminant, request.status, request.n_factor};
@@ -267,6 +290,8 @@ Report report_of(Measurement measurement, const ReportRequest &request)
     warn_of_paper(sheet.file, paper.choice, densities, report.warnings);
     warn_of_lost_repeats(sheet, inks, report.warnings);
     report.tone_curves = tone_curves(inks, report.patches);
+    if (paper.choice.exists())
+        report.greys = neutral_steps(report.patches, paper, request.status);
     if (inks.is_ramp())
         report.warnings.push_back(fmt::format(
             "{}: the names of the patches are taken for the percentages of one ink", sheet.file));

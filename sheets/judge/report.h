@@ -6,6 +6,7 @@
 #include "judge/inks.h"
 #include "judge/left_out.h"
 #include "judge/paper.h"
+#include "judge/scales.h"
 #include "judge/stated.h"
 #include "read/measurement.h"
 
@@ -82,6 +83,13 @@ struct ToneCurve {
     std::vector<ToneValue> values;
 };
 
+// A patch of a grey scale and its visual density over the paper.
+struct NeutralStep : GreyPlace {
+    std::size_t place; // among the patches
+    std::string name;
+    double density;
+};
+
 struct Report {
     std::shared_ptr<const Measurement> sheet;
     IlluminantChoice illuminant;
@@ -93,6 +101,7 @@ struct Report {
     std::vector<PatchReport> patches;
     LeftOut left_out;                   // by choose_for_page()
     std::vector<ToneCurve> tone_curves; // of the inks that have measured tints
+    std::vector<NeutralStep> greys;     // by scale, from light to dark
     std::vector<SolidAdvice> advice;    // where there are aims
     std::vector<std::string> warnings;
 };

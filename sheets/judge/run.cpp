@@ -107,26 +107,40 @@ OverZones over_zones(const ZoneReading &reading)
     return out;
 }
 
-// Zones whose readings are apart from those of the others in the mean of the sheets.
-std::map<int, double> odd_zones(const RunSeries &series)
+// By how much each zone of each sheet is off the middle of the sheet's zones.
+std::map<int, Series> zone_series(const RunSeries &series)
 {
-    std::map<int, std::pair<double, double>> sums; // of the differences from the sheet, and count
-    for (const auto &sheet : series.sheets)
-        if (sheet)
-            for (const auto &[zone, value] : sheet->zones) {
-                sums[zone].first += value - sheet->value;
-                sums[zone].second += 1;
-            }
-    Series differences;
-    std::vector<int> zones;
-    for (const auto &[zone, sum] : sums) {
-        zones.push_back(zone);
-        differences.emplace_back(sum.first / sum.second);
+    std::map<int, Series> out;
+    for (std::size_t i = 0; i < series.sheets.size(); ++i) {
+        if (!series.sheets[i])
+            continue;
+        Series values;
+        for (const auto &[zone, value] : series.sheets[i]->zones)
+            values.emplace_back(value);
+        for (const auto &[zone, value] : series.sheets[i]->zones) {
+            Series &own = out[zone];
+            own.resize(series.sheets.size());
+            own[i] = value - median_of(values);
+        }
     }
-    std::map<int, double> out;
-    for (const std::size_t i : outliers_of(differences, apart_by(series.measurand.attribute)))
-        out[zones[i]] = *differences[i] - median_of(differences);
     return out;
+}
+
+// Zones that are apart from the others on most sheets, and zones of single sheets that are apart
+// from the same zone on the others.
+void find_odd_zones(RunSeries &series)
+{
+    const double least = apart_by(series.measurand.attribute);
+    Series middles;
+    std::vector<int> zones;
+    for (const auto &[zone, own] : zone_series(series)) {
+        zones.push_back(zone);
+        middles.emplace_back(median_of(own));
+        for (const std::size_t sheet : outliers_about_slope(own, least))
+            series.zone_outliers.push_back({sheet, zone, *own[sheet] - median_of(own)});
+    }
+    for (const std::size_t i : outliers_of(middles, least))
+        series.odd_zones[zones[i]] = *middles[i] - median_of(middles);
 }
 
 // "A, B, C and 4 more"
@@ -271,7 +285,7 @@ void RunJudge::judge(RunSeries &series) const
         values.push_back(sheet ? std::optional(sheet->value) : std::nullopt);
     series.outliers = outliers_about_slope(values, apart_by(series.measurand.attribute));
     series.trend = trend_of(values, series.outliers).value();
-    series.odd_zones = odd_zones(series);
+    find_odd_zones(series);
     if (!series.limits)
         return;
     series.first_outside = first_outside(values, *series.limits);
@@ -284,7 +298,11 @@ void RunJudge::find_gaps(Run &run) const
 {
     for (std::size_t i = 0; i < entries.size(); ++i) {
         std::vector<std::string> lacking;
-        std::map<int, std::pair<std::size_t, std::size_t>> zones; // lacking, of all
+        struct Zone {
+            std::size_t readings = 0; // of all
+            std::vector<std::string> lacking;
+        };
+        std::map<int, Zone> zones;
         for (const RunSeries &series : run.series) {
             std::set<int> known;
             for (const auto &sheet : series.sheets)
@@ -295,20 +313,20 @@ void RunJudge::find_gaps(Run &run) const
                 lacking.push_back(series.measurand.title());
             else
                 for (const int zone : known) {
-                    zones[zone].first += !series.sheets[i]->zones.contains(zone);
-                    zones[zone].second += 1;
+                    zones[zone].readings += 1;
+                    if (!series.sheets[i]->zones.contains(zone))
+                        zones[zone].lacking.push_back(series.measurand.title());
                 }
         }
         const std::string &file = entries[i].sheet.file;
         if (!lacking.empty())
             run.gaps.push_back(fmt::format("{}: no {}", file, listed(lacking)));
         std::map<std::string, std::vector<int>> same; // zones by what they lack
-        for (const auto &[zone, count] : zones)
-            if (count.first == count.second)
-                same["missing"].push_back(zone);
-            else if (count.first)
-                same[fmt::format("without {} of {} readings", count.first, count.second)].push_back(
-                    zone);
+        for (const auto &[number, zone] : zones)
+            if (zone.lacking.size() == zone.readings)
+                same["missing"].push_back(number);
+            else if (!zone.lacking.empty())
+                same["without " + listed(zone.lacking)].push_back(number);
         for (const auto &[what, numbers] : same)
             run.gaps.push_back(fmt::format("{}: zone{} {} {}", file, numbers.size() == 1 ? "" : "s",
                                            fmt::join(numbers, ", "), what));
@@ -383,9 +401,18 @@ void RunJudge::add_advice(Run &run) const
 void RunJudge::compare_origins(Run &run) const
 {
     const Entry &first = entries.front();
-    run.job = first.origin.job;
-    run.instrument = first.origin.instrument;
-    run.condition = first.condition;
+    const auto all = [this](const auto &of) {
+        std::vector<std::string> out;
+        for (const Entry &entry : entries)
+            if (std::find(out.begin(), out.end(), of(entry)) == out.end())
+                out.push_back(of(entry));
+        if (out.size() > 1)
+            std::replace(out.begin(), out.end(), std::string(), std::string("not told"));
+        return listed(out);
+    };
+    run.job = all([](const Entry &entry) { return entry.origin.job; });
+    run.instrument = all([](const Entry &entry) { return entry.origin.instrument; });
+    run.condition = all([](const Entry &entry) { return entry.condition; });
     for (std::size_t i = 1; i < entries.size(); ++i) {
         const Entry &entry = entries[i];
         const auto differs = [&](const char *what, const std::string &own,
@@ -394,9 +421,9 @@ void RunJudge::compare_origins(Run &run) const
                 run.warnings.push_back(fmt::format("{}: {} \"{}\", of {} \"{}\"", entry.sheet.file,
                                                    what, own, first.sheet.file, of_first));
         };
-        differs("job", entry.origin.job, run.job);
-        differs("instrument", entry.origin.instrument, run.instrument);
-        differs("condition", entry.condition, run.condition);
+        differs("job", entry.origin.job, first.origin.job);
+        differs("instrument", entry.origin.instrument, first.origin.instrument);
+        differs("condition", entry.condition, first.condition);
         for (std::size_t k = 0; k < i; ++k)
             if (entries[k].readings.readings == entry.readings.readings) {
                 run.warnings.push_back(fmt::format("{} and {} read the same to the last digit",
@@ -414,9 +441,11 @@ void RunJudge::add_warnings(Run &run) const
     std::vector<std::string> first;
     for (const Entry &entry : entries)
         for (const std::string &warning : entry.readings.warnings) {
-            const bool own = warning.starts_with(entry.sheet.file);
-            const std::string text =
-                own ? warning.substr(entry.sheet.file.size()) : std::string(warning);
+            const std::size_t at = warning.find(entry.sheet.file);
+            const bool own = at != std::string::npos;
+            std::string text = warning;
+            if (own)
+                text.erase(at, entry.sheet.file.size());
             const auto [place, is_new] = places.try_emplace(text, all.size());
             if (is_new) {
                 all.emplace_back(text, 0);

@@ -55,13 +55,19 @@ struct RunSeries {
     std::optional<std::size_t> first_outside{}, leaves_at{};
     std::vector<std::size_t> outliers{};
     std::map<int, double> odd_zones{}; // zones unlike the others, and by how much
+    struct ZoneOutlier {
+        std::size_t sheet;
+        int zone;
+        double difference; // from the same zone on the other sheets
+    };
+    std::vector<ZoneOutlier> zone_outliers{};
 };
 
 struct Run {
     std::string aims; // file
     IlluminantChoice illuminant;
     int status;
-    std::string job{}, instrument{}, condition{}; // of the first sheet
+    std::string job{}, instrument{}, condition{}; // of all sheets, each once
     bool by_date = false;                         // the order of the sheets
     std::vector<RunSheet> sheets;
     std::vector<std::string> unread; // sheets, with the reason

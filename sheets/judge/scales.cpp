@@ -20,32 +20,23 @@ std::optional<double> neutral_density(const Paper &paper, const Side &side, int 
 {
     if (!side.refl || !paper.choice.exists())
         return std::nullopt;
-    // The statuses of wavelengths have no visual filter.
-    const bool filters = status != SPECTRAL_STATUS && status != SPECTRALX_STATUS;
-    return Densitometer(paper.refl, filters ? status : E_STATUS)
-        .density(*side.refl, VISUAL_RESPONSE);
+    return Densitometer(paper.refl, status).neutral_density(*side.refl);
 }
 
-struct Step {
-    std::string scale;
-    double nominal;
-};
+} // namespace
 
-// Nothing of a patch that is on no scale of greys.
-std::optional<Step> step_of(const ControlPatch &control)
+std::optional<GreyPlace> grey_place_of(const ControlPatch &patch)
 {
-    const auto &inks = control.inks;
+    const auto &inks = patch.inks;
     if (inks.size() == 1 && inks[0].first == "CMYK_K")
-        return Step{"K", inks[0].second};
-    if (!is_neutral(control))
+        return GreyPlace{"K", inks[0].second};
+    if (!is_neutral(patch))
         return std::nullopt;
     const bool equal = inks[0].second == inks[1].second && inks[1].second == inks[2].second;
     const auto cyan = std::find_if(inks.begin(), inks.end(),
                                    [](const auto &ink) { return ink.first == "CMYK_C"; });
-    return Step{equal ? "CMY" : "CMY grey", cyan->second};
+    return GreyPlace{equal ? "CMY" : "CMY grey", cyan->second};
 }
-
-} // namespace
 
 std::vector<ToneStep> tones_of(const std::vector<ControlPatch> &controls)
 {
@@ -71,13 +62,13 @@ std::vector<GreyStep> greys_of(const std::vector<PairReport> &pairs,
     std::map<std::tuple<std::string, double, decltype(ControlPatch::inks)>, GreyStep> steps;
     for (std::size_t i = 0; i < pairs.size(); ++i) {
         const ControlPatch &control = controls[i];
-        const auto step = step_of(control);
+        const auto step = grey_place_of(control);
         if (!step)
             continue;
         const CIELABCOORD &aim = control.aim, &lab = control.lab;
         steps.try_emplace({step->scale, step->nominal, control.inks},
-                          GreyStep{step->scale, step->nominal, control.name,
-                                   std::hypot(lab.a - aim.a, lab.b - aim.b), lab.L - aim.L,
+                          GreyStep{*step, control.name, std::hypot(lab.a - aim.a, lab.b - aim.b),
+                                   lab.L - aim.L,
                                    neutral_density(reference_paper, pairs[i].reference, status),
                                    neutral_density(paper, pairs[i].sample, status)});
     }

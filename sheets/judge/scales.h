@@ -20,9 +20,15 @@ struct ToneStep {
 };
 
 // A patch of black, of equal parts of cyan, magenta and yellow, or of parts in grey balance.
-struct GreyStep {
+struct GreyPlace {
     std::string scale; // K, CMY or CMY grey
     double nominal;    // of black, or of cyan
+};
+
+// Nothing of a patch that is on no scale.
+std::optional<GreyPlace> grey_place_of(const ControlPatch &patch);
+
+struct GreyStep : GreyPlace {
     std::string name;
     double delta_ch, delta_l;                   // from the aim
     std::optional<double> aim_density, density; // visual, over the paper

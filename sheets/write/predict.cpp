@@ -67,7 +67,11 @@ std::string fit_of(const Predictions &predictions)
 {
     if (!predictions.n_factor)
         return "Not calibrated: the sheet holds " + predictions.not_calibrated;
-    std::string out = fmt::format("Calibrated: n = {:g}; ", *predictions.n_factor);
+    std::string out =
+        fmt::format("Calibrated: n = {:g}{}; ", *predictions.n_factor,
+                    CalibratedModel::ends_range(*predictions.n_factor)
+                        ? ", the end of the range that is tried: another might fit better"
+                        : "");
     if (!predictions.error)
         return out + "no overprints of tints tell its error";
     return out + fmt::format("on {} overprints that it was not shown, each in turn, mean ΔE00 {}, "

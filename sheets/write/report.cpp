@@ -163,6 +163,16 @@ void add_tone_values(Lines &lines, const Report &report)
     }
 }
 
+void add_greys(Lines &lines, const Report &report)
+{
+    if (!report.greys.empty())
+        lines.add(fmt::format("\n{:<11}{:>11}{:>16}  {}", "Grey scales", "nominal",
+                              "visual density", "patch"));
+    for (const NeutralStep &step : report.greys)
+        lines.add(fmt::format("{:<11}{:>11g}{:>16}  {}", step.scale, step.nominal,
+                              fixed(step.density, 3), cut(step.name, kWidestInText)));
+}
+
 void write_table(const Report &report, Lines &lines, bool colour)
 {
     std::size_t width = 10;
@@ -178,6 +188,7 @@ void write_table(const Report &report, Lines &lines, bool colour)
     add_block(lines, report, "Overprints", width, {{"trap", &PatchReport::trap}});
     add_block(lines, report, "Shadows", width, {{"contrast", &PatchReport::print_contrast}});
     add_tone_values(lines, report);
+    add_greys(lines, report);
     add_advice(lines, "Advice for the solids", report.advice);
     if (report.inks.size() > 1)
         lines.add(fmt::format("\nInks print in the order {}", fmt::join(report.inks, ", ")));
@@ -226,6 +237,17 @@ Json tone_values_json(const Report &report)
     return out;
 }
 
+Json greys_json(const Report &report)
+{
+    Json out = Json::array();
+    for (const NeutralStep &step : report.greys)
+        out.push_back({{"scale", step.scale},
+                       {"nominal", step.nominal},
+                       {"name", step.name},
+                       {"density", step.density}});
+    return out;
+}
+
 void write_sheet(const Report &report, const Sink &sink)
 {
     Json head = {
@@ -251,6 +273,7 @@ void write_sheet(const Report &report, const Sink &sink)
                             : Json(report.sheet->source.condition)}}},
         {"paper", paper_json(report)},
         {"tone_values", tone_values_json(report)},
+        {"greys", greys_json(report)},
     };
     if (!report.advice.empty())
         add_advice(head, report.advice);
@@ -311,6 +334,15 @@ Flat flat_of(const Report &report)
                 [&patches](std::size_t i) { return patches[i].hue_error; });
     flat.number("grayness", "GRAYNESS", [&patches](std::size_t i) { return patches[i].grayness; });
     flat.number("trap", "TRAP", [&patches](std::size_t i) { return patches[i].trap; });
+    std::map<std::size_t, double> greys; // by patch
+    for (const NeutralStep &step : report.greys)
+        greys[step.place] = step.density;
+    if (!greys.empty())
+        flat.number("neutral_density", "NEUTRAL_DENSITY",
+                    [greys = std::move(greys)](std::size_t i) -> std::optional<double> {
+                        const auto found = greys.find(i);
+                        return found == greys.end() ? std::nullopt : std::optional(found->second);
+                    });
     flat.same("paper", "PAPER", said(report.paper.choice));
     if (patches.front().refl)
         flat.spectrum([&patches](std::size_t i) -> const Spectrum & { return *patches[i].refl; });

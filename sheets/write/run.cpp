@@ -136,11 +136,20 @@ void add_oddities(const Run &run, std::vector<std::string> &out)
                                               difference > 0 ? "+" : "",
                                               shown(series, difference)));
     }
+    std::map<std::pair<std::size_t, int>, std::vector<std::string>> single;
+    for (const RunSeries &series : run.series)
+        for (const auto &[sheet, zone, difference] : series.zone_outliers)
+            single[{sheet, zone}].push_back(fmt::format("{} {}{}", series.measurand.title(),
+                                                        difference > 0 ? "+" : "",
+                                                        shown(series, difference)));
     for (const auto &[sheet, titles] : sheets)
         out.push_back(fmt::format("{} stands apart from the others: {}", sheet_of(run, sheet),
                                   listed(titles)));
     for (const auto &[zone, titles] : zones)
         out.push_back(fmt::format("zone {} prints unlike the others: {}", zone, listed(titles)));
+    for (const auto &[place, titles] : single)
+        out.push_back(fmt::format("zone {} of {} prints unlike that of the other sheets: {}",
+                                  place.second, sheet_of(run, place.first), listed(titles)));
 }
 
 std::vector<std::string> findings_of(const Run &run)
@@ -261,9 +270,11 @@ Json series_json(const RunSeries &series)
             out[std::to_string(zone)] = value;
         return out;
     };
-    Json outliers = Json::array();
+    Json outliers = Json::array(), zone_outliers = Json::array();
     for (const std::size_t sheet : series.outliers)
         outliers.push_back(sheet + 1);
+    for (const auto &[sheet, zone, difference] : series.zone_outliers)
+        zone_outliers.push_back({{"sheet", sheet + 1}, {"zone", zone}, {"difference", difference}});
     const auto drift = [&](double Drift::*of) {
         return series.trend.drift ? Json((*series.trend.drift).*of) : Json();
     };
@@ -288,6 +299,7 @@ Json series_json(const RunSeries &series)
             {"leaves_at", number_of(series.leaves_at)},
             {"outliers", outliers},
             {"odd_zones", zones_json(series.odd_zones)},
+            {"zone_outliers", zone_outliers},
             {"values", per_sheet([](const OverZones &sheet) { return sheet.value; })},
             {"lowest", per_sheet([](const OverZones &sheet) { return sheet.low; })},
             {"highest", per_sheet([](const OverZones &sheet) { return sheet.high; })},

@@ -110,6 +110,16 @@ class ToneCurve:
 
 
 @dataclass(frozen=True)
+class Neutral:
+    """A patch of the `scale` "CMY" (equal parts), "CMY grey" or "K", and its visual density."""
+
+    scale: str
+    nominal: float
+    name: str
+    density: float
+
+
+@dataclass(frozen=True)
 class ReportSource:
     """What the spectra were in the file."""
 
@@ -139,6 +149,7 @@ class Report(Result):
     source: ReportSource
     paper: PaperReport
     tone_values: Tuple[ToneCurve, ...]
+    greys: Tuple[Neutral, ...]
     patches: Tuple[PatchReport, ...]
 
     @staticmethod

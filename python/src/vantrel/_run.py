@@ -32,7 +32,8 @@ class Series:
 
     `low` and `high` are its limits about the `aim`; `slope` a sheet, with half of its 95 % interval;
     `values` that of the mean of the zones, `lowest` to `highest` and `spread` (standard deviation)
-    over them. `odd_zones` are unlike the others, by so much.
+    over them. `odd_zones` are unlike the others, by so much;
+    `zone_outliers`, each a `sheet`, `zone` and `difference`, unlike the same zone on other sheets.
     """
 
     title: str
@@ -52,6 +53,7 @@ class Series:
     leaves_at: Optional[int]
     outliers: Tuple[int, ...]
     odd_zones: Dict[str, float]
+    zone_outliers: Tuple[Dict[str, float], ...]
     values: Tuple[Optional[float], ...]
     lowest: Tuple[Optional[float], ...]
     highest: Tuple[Optional[float], ...]

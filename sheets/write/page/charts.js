@@ -5,28 +5,28 @@ import { colourOf, h, named, swatch } from './dom.js';
 
 export const mostPoints = 2000;
 const bands = Array.from({ length: 31 }, (_, i) => 400 + 10 * i);
-const printWidths = { half: 330, quarter: 165 }; // of a sheet of paper
+const printWidths = { half: 330, sixth: 112 }; // of a sheet of paper
 const drawn = new Set();
 const self = (field) => ({ value: field, scale: null }); // colours that are the data's own
 
 addEventListener('beforeprint', () => drawn.forEach((draw) => draw(true)));
 addEventListener('afterprint', () => drawn.forEach((draw) => draw()));
 
-// A picture with its title, what it says in words, and further elements. `plot(width)` gives Plot's
-// options, `label()` the words.
+// A picture with its title, what it says in words, and further elements. `plot(width, printed)`
+// gives Plot's options, `label()` the words.
 export function picture(title, plot, label, ...more) {
   const frame = h('div', { class: 'plot' });
   const words = h('span', { class: 'says' });
   let shown = 0;
   function draw(printed = false) {
     const width = !printed ? frame.clientWidth
-      : frame.closest('.strip') ? printWidths.quarter : printWidths.half;
+      : frame.closest('.strip') ? printWidths.sixth : printWidths.half;
     if (!width) return;
     shown = width;
     const svg = Plot.plot({
       width, marginTop: 28, marginRight: 16, marginBottom: 36,
-      style: { fontSize: printed ? '9px' : '12px', fontFamily: 'inherit', background: 'none', overflow: 'visible' },
-      ...plot(width),
+      style: { fontSize: !printed ? '12px' : width < 200 ? '6px' : '9px', fontFamily: 'inherit', background: 'none', overflow: 'visible' },
+      ...plot(width, printed),
     });
     svg.setAttribute('role', 'img');
     svg.setAttribute('aria-label', `${title}. ${label()}`);
@@ -207,8 +207,9 @@ export function seriesPlot({ values, lowest, highest, low, high, aim, decimals }
     high: highest[i] })).filter(({ value }) => value !== null);
   const limits = [low, high].filter((limit) => limit !== null);
   return (width) => ({
-    height: width < 200 ? 90 : 200,
-    marginTop: 8, marginBottom: 20,
+    height: width < 200 ? 62 : 200, marginTop: width < 200 ? 4 : 8,
+    marginBottom: width < 200 ? 12 : 20, marginLeft: width < 200 ? 24 : 40,
+    marginRight: width < 200 ? 4 : 16,
     x: { label: null, domain: [0.5, values.length + 0.5], ticks: Math.min(values.length, 6),
       tickFormat: (sheet) => (Number.isInteger(sheet) ? sheet : '') },
     y: { label: null, nice: true, grid: true, ticks: 4 },
@@ -229,8 +230,8 @@ export function seriesPlot({ values, lowest, highest, low, high, aim, decimals }
 export function zonesPlot(curves) {
   const points = curves.flatMap(({ name, colour, value, zones }) => Object.entries(zones).map(
     ([zone, density]) => ({ name, colour, zone: Number(zone), density, off: density - value })));
-  return () => ({
-    height: 200,
+  return (width, printed) => ({
+    height: printed ? 90 : 200,
     fx: { label: 'Zone' }, x: { axis: null, domain: curves.map(({ name }) => name) },
     y: { label: 'ΔD', grid: true, nice: true },
     marks: [

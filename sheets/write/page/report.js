@@ -1,6 +1,7 @@
 // vantrel report: each sheet with its key figures, pictures and patches.
 
-import { histogramPlot, legend, mostPoints, picture, planePlot, spectraPlot, tonePlot }
+import { histogramPlot, legend, mostPoints, picture, planePlot, scalePlot, spectraPlot,
+  tonePlot }
   from './charts.js';
 import { advice, chosenPaper, colourOf, count, figures, fixed, h, leftOut, named, smallTable, spread,
   swatch, triple, warnings } from './dom.js';
@@ -141,6 +142,20 @@ function tonePictures(curves) {
   ];
 }
 
+function greyPicture(greys) {
+  const curves = [['CMY', '#8a5a44'], ['CMY grey', '#8a8a2a'], ['K', '#555555']]
+    .map(([name, colour]) => ({ name, colour, points: greys.filter(({ scale }) => scale === name)
+      .map(({ nominal, density }) => ({ nominal, value: density })) }))
+    .filter(({ points }) => points.length);
+  return curves.length ? picture('Neutral density', scalePlot(curves, 'Visual density'), () =>
+    'Over the paper, along the grey scales.', legend(curves),
+    h('details', {}, h('summary', {}, 'Numbers'), smallTable('Grey scales', [
+      { label: 'Patch', text: ({ scale, name }) => [`${scale} `, named(name)] },
+      { label: 'Nominal %', number: true, text: ({ nominal }) => String(nominal) },
+      { label: 'D', number: true, text: ({ density }) => fixed(density, 3) },
+    ], greys))).element : null;
+}
+
 function attributeTables(sheet) {
   const having = (field) => sheet.patches.filter((patch) => patch[field] !== null).slice(0, 200);
   const name = { label: 'Patch', text: (patch) => [swatch(colourOf(patch)), named(patch.name)] };
@@ -245,7 +260,7 @@ function sheetSection(sheet, id, heading) {
       'In the order of the file, as a screen can show them.'),
     h('div', { class: 'pictures' }, source.bands ? spectra.element : null,
       ...(curves.length ? tonePictures(curves) : []),
-      plane.element, distances?.element, attributeTables(sheet)),
+      greyPicture(sheet.greys), plane.element, distances?.element, attributeTables(sheet)),
     searchTable({
       caption: 'All patches', noun: 'patch', columns: columnsOf(sheet), rows: sheet.patches,
       colour: colourOf, text: (patch) => `${patch.name} ${patch.id}`,

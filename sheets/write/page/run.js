@@ -6,7 +6,8 @@ import { advice, count, fixed, h, inkColours, named, smallTable, warnings } from
 import { searchTable } from './table.js';
 
 const colourOf = (series) => inkColours[series.subject] ?? '#777777';
-const charted = ['density', 'tone_value', 'solid', 'delta_ch', 'delta_l', 'paper', 'mean_de00'];
+const charted = ['density', 'tone_value', 'solid', 'delta_ch', 'delta_l', 'neutral', 'paper',
+  'mean_de00'];
 
 function verdict({ verdict: word, says, findings }) {
   const [, first, rest] = says.match(/^(.*?)[:,] (.*)$/s);
@@ -48,7 +49,7 @@ function profile(result) {
   const curves = () => densities.filter((series) => series.zones[sheet]).map((series) =>
     ({ name: series.subject, colour: colourOf(series), zones: series.zones[sheet],
       value: series.values[sheet] }));
-  const plot = picture('Ink-zone profile', (width) => zonesPlot(curves())(width),
+  const plot = picture('Ink-zone profile', (...frame) => zonesPlot(curves())(...frame),
     () => `sheet ${sheet + 1}, ${result.sheets[sheet].file}: density less that of the sheet`);
   const buttons = result.sheets.map(({ file }, i) => h('button', { type: 'button',
     class: 'choose', title: file, 'aria-pressed': String(i === sheet), onclick: () => {
@@ -85,17 +86,17 @@ export function runPage(result) {
     limitsTable(`Limits: ${result.tolerances}, on the sheet that is farthest from each`,
       result.limits),
     advice('Solids of the last sheet', result),
-    statistics(result),
-    searchTable({
+    h('div', { class: 'values' }, statistics(result), searchTable({
       caption: 'All values',
       noun: 'reading',
       columns: [
         { label: 'Reading', value: ({ title }) => title },
-        ...result.sheets.map(({ file, created }, i) => ({ label: String(i + 1), decimals: 3,
-          title: `${file} ${created}`, value: ({ values }) => values[i] })),
+        ...result.sheets.map(({ file, created }, i) => ({ label: String(i + 1),
+          decimals: ({ decimals }) => decimals, title: `${file} ${created}`,
+          value: ({ values }) => values[i] })),
       ],
       rows: result.series,
       colour: colourOf,
       text: ({ title, attribute }) => `${title} ${attribute}`,
-    }));
+    })));
 }

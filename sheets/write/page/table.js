@@ -13,6 +13,9 @@ const mostPrinted = 2000;
 const words = new Intl.Collator('en', { numeric: true, sensitivity: 'base' });
 const compare = (a, b) => (typeof a === 'string' ? words.compare(a, b) : a - b);
 
+const isNumber = ({ decimals }) => (decimals ?? null) !== null;
+const decimalsOf = ({ decimals }, row) => (typeof decimals === 'function' ? decimals(row) : decimals);
+
 const features = () => tableFeatures({
   coreReactivityFeature: storeReactivityBindings(),
   columnFilteringFeature,
@@ -25,8 +28,8 @@ const features = () => tableFeatures({
 });
 
 // columns: [{ label, title, value: (row) => text or number or null, decimals }, …], of which the
-// first names the row; `colour` and `text` give the row's swatch and what the search looks into. With
-// `onChoose` the rows can be chosen.
+// first names the row; the row may tell its decimals. `colour` and `text` give the row's swatch and
+// what the search looks into. With `onChoose` the rows can be chosen.
 export function searchTable({ caption, noun, columns, rows, colour, text, onChoose }) {
   const used = columns.filter((column, i) =>
     i === 0 || rows.some((row) => (column.value(row) ?? null) !== null));
@@ -48,7 +51,7 @@ export function searchTable({ caption, noun, columns, rows, colour, text, onChoo
   const chosen = new Set();
 
   const heads = used.map((column, i) => h('th', { scope: 'col',
-    class: typeof column.decimals === 'number' ? 'number' : null },
+    class: isNumber(column) ? 'number' : null },
   h('button', { type: 'button', title: column.title ?? null,
     onclick: () => { table.getColumn(String(i)).toggleSorting(); table.firstPage(); show(); } },
   column.label)));
@@ -68,8 +71,8 @@ export function searchTable({ caption, noun, columns, rows, colour, text, onChoo
   function rowOf(row) {
     return h('tr', {}, used.map((column, i) => {
       const value = column.value(row);
-      if (i) return h('td', { class: typeof column.decimals === 'number' ? 'number' : null },
-        typeof column.decimals === 'number' ? fixed(value, column.decimals) : named(value ?? '–'));
+      if (i) return h('td', { class: isNumber(column) ? 'number' : null },
+        isNumber(column) ? fixed(value, decimalsOf(column, row)) : named(value ?? '–'));
       const name = [colour ? swatch(colour(row)) : null, named(value)];
       return h('th', { scope: 'row' }, !onChoose ? name : h('button', { type: 'button',
         class: 'choose', 'aria-pressed': String(chosen.has(row)), onclick: (event) => {

@@ -54,6 +54,23 @@ test('a click on a sheet of a run shows its zones, of which one is lost', async 
   await page.close();
 });
 
+test('thirty sheets of 32 readings print on two sheets of A4, with the table of all values', async () => {
+  const page = await open(`sed 's/range(1, 11)/range(1, 31)/;s/{"C": 50}, /&{"C": 25}, /' make_run.py > thirty.py
+    python3 thirty.py thirty; vantrel run thirty/sheet_*.txt --aims thirty/aims.txt --tolerances run.toml`);
+  const pdf = (await page.pdf({ preferCSSPageSize: true })).toString('latin1');
+  const sizes = [...pdf.matchAll(/\/MediaBox *\[ *0 0 ([\d.]+) ([\d.]+)/g)].map((box) =>
+    box.slice(1).map((points) => Math.round(points * 25.4 / 72)));
+  assert.deepEqual(sizes, [[210, 297], [297, 210]]);
+  await page.emulateMedia({ media: 'print' });
+  await page.setViewportSize({ width: Math.floor((297 - 16) / 25.4 * 96), height: 900 });
+  await page.evaluate(() => dispatchEvent(new Event('beforeprint')));
+  const table = page.locator('.patches table');
+  assert.deepEqual([await table.locator('tbody tr').count(), await table.locator('thead th').count()], [32, 31]);
+  const [wide, held] = await table.evaluate((all) => [all.scrollWidth, all.parentElement.clientWidth]);
+  assert.ok(wide <= held, `${wide} of ${held}`);
+  await page.close();
+});
+
 test('rows are sorted, searched, paged, and all printed', async () => {
   // 120 patches in the order of 1, 38, 75, …, 120: no two of the same darkness.
   const page = await open(`(echo name,tint,ink,$(seq -s, 400 10 700); i=0; while [ $i -lt 121 ]; do
