@@ -249,10 +249,10 @@ def compare(
     --------
     >>> import dataclasses
     >>> aims = vantrel.read("examples/two_ink_halftone.txt")
-    >>> sheet = dataclasses.replace(aims, spectra=aims.spectra * 0.9, file="sheet")
+    >>> sheet = dataclasses.replace(aims, spectra=aims.spectra * np.linspace(0.9, 1, 31), file="sheet")
     >>> comparison = vantrel.compare(aims, sheet, formula=["de2000", "cmc"], tolerance=2)
     >>> comparison.verdict, round(comparison.statistics["cmc"].max, 2)
-    ('failed', 1.48)
+    ('failed', 3.49)
     """
     options = {
         **_usual(illuminant, status, paper),
@@ -411,11 +411,11 @@ def run(
     >>> from dataclasses import replace
     >>> aims = vantrel.read("examples/two_ink_halftone.txt")
     >>> dates = [replace(aims.origin, created=f"2026-03-{day}") for day in range(11, 16)]
-    >>> darker = [aims.spectra * (0.98 - i / 200) for i in range(5)]
+    >>> darker = [aims.spectra * np.linspace(1 - i / 99, 1, 31) for i in range(1, 6)]
     >>> sheets = [replace(aims, spectra=s, origin=date) for s, date in zip(darker, dates)]
     >>> run = vantrel.run(sheets, aims)
     >>> print(run.series[-1].title, np.round(run.series[-1].values, 2))
-    largest ΔE00 [0.46 0.58 0.69 0.81 0.93]
+    largest ΔE00 [0.27 0.53 0.79 1.06 1.32]
     """
     taken, unread = [], []
     for sheet in sheets:
