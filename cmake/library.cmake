@@ -46,6 +46,10 @@ endif()
 if(VANTREL_CHECKED)
   target_compile_definitions(Vantrel PRIVATE VANTREL_CHECKED)
 endif()
+# The analyzer of clang-tidy follows the functions of the file that it is given, not of those included.
+if(CMAKE_CXX_CLANG_TIDY)
+  set_target_properties(Vantrel PROPERTIES UNITY_BUILD OFF)
+endif()
 
 # The major version, and SOVERSION with it, rises whenever an exported name goes away or the type or
 # layout behind one changes; new names leave it as it is.

@@ -20,17 +20,17 @@ constexpr double kDark = 1e-300; // a solid that is no other than the paper
 constexpr std::size_t kMostTints = 200;       // of one ink
 constexpr std::size_t kMostOverprints = 2000; // to fit to
 
-using Bands = Eigen::Array<double, VANTREL_BANDS, 1>;
+using BandArray = Eigen::Array<double, VANTREL_BANDS, 1>;
 
-Eigen::Map<const Bands> bands_of(const Spectrum &refl)
+Eigen::Map<const BandArray> bands_of(const Spectrum &refl)
 {
-    return Eigen::Map<const Bands>(refl.data());
+    return Eigen::Map<const BandArray>(refl.data());
 }
 
-Spectrum spectrum_of(const Bands &bands)
+Spectrum spectrum_of(const BandArray &bands)
 {
     Spectrum out;
-    Eigen::Map<Bands>(out.data()) = bands;
+    Eigen::Map<BandArray>(out.data()) = bands;
     return out;
 }
 
@@ -78,7 +78,7 @@ CalibratedModel::CalibratedModel(const Measurement &sheet, const Inks &inks, con
         const auto tints = inks.tints_of(patch);
         if (!tints || tints->empty())
             continue;
-        const Bands refl = bands_of(patch.refl).max(0);
+        const BandArray refl = bands_of(patch.refl).max(0);
         const double count = ++patches[*tints];
         Spectrum &mean = measured[*tints];
         mean = spectrum_of(bands_of(mean) + (refl - bands_of(mean)) / count);
@@ -211,7 +211,7 @@ double CalibratedModel::area(const Tint &tint, double below, double above,
     const auto node = [&](double percent) {
         return bands_of(percent > 0 ? roots.at({{tint.ink, percent}}) : roots.at({}));
     };
-    const Bands start = node(below), step = node(above) - start;
+    const BandArray start = node(below), step = node(above) - start;
     double left = below, area_left = 0;
     for (const double level : ramps[tint.ink]) {
         if (level <= below || level == no_tint)
@@ -240,7 +240,7 @@ Spectrum CalibratedModel::estimate(const Place &place) const
         cell.push_back({*(above - 1), *above});
         share.push_back({1 - covered, covered});
     }
-    Bands sum = Bands::Zero();
+    BandArray sum = BandArray::Zero();
     for_each_node(tints, cell, [&](const Tints &node, const std::vector<std::size_t> &at) {
         double weight = 1;
         for (std::size_t i = 0; i < at.size(); ++i)

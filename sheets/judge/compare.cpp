@@ -22,7 +22,7 @@ namespace {
 constexpr std::size_t kMostWorst = 10;
 
 // One of the two sheets.
-struct Sheet {
+struct JudgedSheet {
     const Measurement &measurement;
     Paper paper;
 
@@ -52,14 +52,14 @@ std::string verbal_difference(const Spectrum &reference, const Spectrum &sample,
     return out.empty() ? "On Target" : out;
 }
 
-std::optional<int> response_of(const Sheet &sheet, const Patch &patch, int status)
+std::optional<int> response_of(const JudgedSheet &sheet, const Patch &patch, int status)
 {
     if (!sheet.has_spectra())
         return std::nullopt;
     return Densitometer(sheet.paper.refl, status).response(patch.refl);
 }
 
-Side side_of(const Sheet &sheet, const Repeats &repeats, const Terms &terms,
+Side side_of(const JudgedSheet &sheet, const Repeats &repeats, const Terms &terms,
              const std::optional<int> &response)
 {
     const Patch &patch = repeats.patch;
@@ -91,7 +91,7 @@ void compare_spectra(PairReport &pair, const Spectrum &reference, const Spectrum
     pair.din6172 = din6172;
 }
 
-PairReport pair_report(const Sheet &references, const Sheet &samples, const Pair &pair,
+PairReport pair_report(const JudgedSheet &references, const JudgedSheet &samples, const Pair &pair,
                        const Terms &terms)
 {
     const Repeats reference = mean_of(references.measurement, pair.reference, terms.illuminant),
@@ -181,11 +181,11 @@ const Patch &darkest_of(const Measurement &reference, ILLUM_OBS illuminant)
 }
 
 SubstrateCorrected substrate_corrected(std::vector<PairReport> &pairs,
-                                       std::vector<ControlPatch> controls, const Sheet &reference,
-                                       const Sheet &sample, const Terms &terms,
-                                       const Coverage &coverage)
+                                       std::vector<ControlPatch> controls,
+                                       const JudgedSheet &reference, const JudgedSheet &sample,
+                                       const Terms &terms, const Coverage &coverage)
 {
-    for (const Sheet *sheet : {&reference, &sample})
+    for (const JudgedSheet *sheet : {&reference, &sample})
         require_paper(sheet->paper.choice, sheet->measurement.file, "--substrate-corrected");
     const Patch &darkest = darkest_of(reference.measurement, terms.illuminant);
     const CIELABCOORD black = lab_of(reference.measurement, darkest, terms.illuminant);
@@ -211,7 +211,7 @@ SubstrateCorrected substrate_corrected(std::vector<PairReport> &pairs,
     return out;
 }
 
-std::optional<PaperDifference> papers_of(const Sheet &references, const Sheet &samples,
+std::optional<PaperDifference> papers_of(const JudgedSheet &references, const JudgedSheet &samples,
                                          const Terms &terms)
 {
     const Paper &reference = references.paper, &sample = samples.paper;
@@ -250,8 +250,8 @@ std::vector<Unpaired> unpaired_of(const Measurement &sheet, const std::vector<st
 }
 
 std::vector<SolidAdvice> advice_of(const std::vector<PairReport> &pairs,
-                                   const std::vector<ControlPatch> &controls, const Sheet &samples,
-                                   const Terms &terms)
+                                   const std::vector<ControlPatch> &controls,
+                                   const JudgedSheet &samples, const Terms &terms)
 {
     require_paper(samples.paper.choice, samples.measurement.file, "--advice");
     std::vector<SolidAdvice> out;
@@ -287,8 +287,9 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
     const IlluminantChoice illuminant =
         illuminant_for(request.illuminant, {&reference, &sample}, warnings);
     warn_of_conditions(reference, sample, warnings);
-    const Sheet references{reference, paper_of(reference, request.paper, illuminant, warnings)};
-    const Sheet samples{sample, paper_of(sample, request.paper, illuminant, warnings)};
+    const JudgedSheet references{reference,
+                                 paper_of(reference, request.paper, illuminant, warnings)};
+    const JudgedSheet samples{sample, paper_of(sample, request.paper, illuminant, warnings)};
     const Terms terms{request, illuminant.illuminant,
                       request.second_illuminant.value_or(usual_second(illuminant.illuminant))};
     const Pairs pairs = pairs_of(reference, sample, request.pairing, warnings);

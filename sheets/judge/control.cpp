@@ -42,10 +42,10 @@ ControlPatch control_patch(const PairReport &pair, const Paper &reference_paper,
     return out;
 }
 
-using Pairs = std::vector<const PairReport *>;
+using InkPairs = std::vector<const PairReport *>;
 
 // The mean of the spectra of one side; nothing where one has none.
-std::optional<Spectrum> mean_of(const Pairs &pairs, Side PairReport::*side)
+std::optional<Spectrum> mean_of(const InkPairs &pairs, Side PairReport::*side)
 {
     Spectrum mean{};
     for (const PairReport *pair : pairs) {
@@ -59,7 +59,7 @@ std::optional<Spectrum> mean_of(const Pairs &pairs, Side PairReport::*side)
 }
 
 // Of the mean spectrum, or of one of the patches where there are no spectra.
-CIELABCOORD solid_lab(const std::optional<Spectrum> &mean, const Pairs &pairs,
+CIELABCOORD solid_lab(const std::optional<Spectrum> &mean, const InkPairs &pairs,
                       Side PairReport::*side, ILLUM_OBS illuminant)
 {
     return mean ? lab_of(*mean, illuminant) : (pairs.front()->*side).colour.lab;
@@ -82,7 +82,7 @@ std::vector<ControlPatch> control_patches(const std::vector<PairReport> &pairs,
                                           ILLUM_OBS illuminant, int status, bool collection)
 {
     std::vector<ControlPatch> out;
-    std::map<std::string, Pairs> solids; // of each ink
+    std::map<std::string, InkPairs> solids; // of each ink
     for (const PairReport &pair : pairs) {
         out.push_back(control_patch(pair, reference_paper, collection));
         if (is_solid(out.back()))

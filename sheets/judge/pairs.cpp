@@ -86,7 +86,7 @@ public:
     {
         for (std::size_t i = 0; i < sheets.of_reference.size(); ++i)
             if (const Key key = key_of(by, sheets.of_reference[i], i); key[0] != kNone)
-                entries.push_back({key, i});
+                entries.emplace_back(key, i);
         std::sort(entries.begin(), entries.end());
         firsts.resize(entries.size());
         for (std::size_t begin = 0, end = 0; begin < entries.size(); begin = end) {

@@ -143,16 +143,6 @@ void find_odd_zones(RunSeries &series)
         series.odd_zones[zones[i]] = *middles[i] - median_of(middles);
 }
 
-// "A, B, C and 4 more"
-std::string listed(const std::vector<std::string> &names)
-{
-    constexpr std::size_t most = 3;
-    const std::vector<std::string> first(
-        names.begin(), names.begin() + static_cast<std::ptrdiff_t>(std::min(most, names.size())));
-    return fmt::format("{}{}", fmt::join(first, ", "),
-                       names.size() > most ? fmt::format(" and {} more", names.size() - most) : "");
-}
-
 } // namespace
 
 RunJudge::RunJudge(Measurement aims, RunRequest request)

@@ -82,10 +82,10 @@ bool begun_by_words(std::string_view text)
 }
 
 // Goes through the file line by line.
-class Reader {
+class CgatsReader {
 public:
     // The first table that holds spectra, or else colours, with the later ones of the same fields.
-    Reader(Sheet &sheet, bool spectra) : sheet(sheet), spectra(spectra) {}
+    CgatsReader(Sheet &sheet, bool spectra) : sheet(sheet), spectra(spectra) {}
     void read(std::string_view text);
 
 private:
@@ -124,14 +124,14 @@ private:
     std::unique_ptr<Table> table;
 };
 
-void Reader::check(const Count &count, std::size_t found)
+void CgatsReader::check(const Count &count, std::size_t found)
 {
     if (count.stated && *count.stated != static_cast<double>(found))
         sheet.warn(count.line,
                    fmt::format("{} is {:g}, but {} follow", count.keyword, *count.stated, found));
 }
 
-void Reader::header(std::string_view text)
+void CgatsReader::header(std::string_view text)
 {
     const std::string_view name = text.substr(0, text.find_first_of(" \t"));
     std::string_view value = trimmed(text.substr(name.size()));
@@ -168,7 +168,7 @@ void Reader::header(std::string_view text)
         sheet.header.take(name, value);
 }
 
-void Reader::first_word(std::string_view text)
+void CgatsReader::first_word(std::string_view text)
 {
     kind = upper(text.substr(0, text.find_first_of(" \t")));
     if (kind == "CTI3")
@@ -177,7 +177,7 @@ void Reader::first_word(std::string_view text)
         sheet.kind = Kind::transmission;
 }
 
-void Reader::refuse_light() const
+void CgatsReader::refuse_light() const
 {
     const Header &header = sheet.header;
     for (const auto &[word, holds] : kinds)
@@ -201,7 +201,7 @@ void Reader::refuse_light() const
                        descriptor.empty() ? "" : ", " + in_quotes(header.origin.descriptor))};
 }
 
-void Reader::name_fields(std::string_view text)
+void CgatsReader::name_fields(std::string_view text)
 {
     if (equal_ignoring_case(trimmed(text), "END_DATA_FORMAT")) {
         place = Place::header;
@@ -212,7 +212,7 @@ void Reader::name_fields(std::string_view text)
     fields.insert(fields.end(), values.values.begin(), values.values.end());
 }
 
-void Reader::begin_rows()
+void CgatsReader::begin_rows()
 {
     place = Place::rows;
     rows = 0;
@@ -235,7 +235,7 @@ void Reader::begin_rows()
                                      spectra ? "spectra" : "colours"));
 }
 
-void Reader::row(std::string_view text)
+void CgatsReader::row(std::string_view text)
 {
     if (equal_ignoring_case(trimmed(text), "END_DATA")) {
         end_rows();
@@ -248,7 +248,7 @@ void Reader::row(std::string_view text)
     table->add(values, sheet.header.condition, line);
 }
 
-void Reader::end_rows()
+void CgatsReader::end_rows()
 {
     place = Place::header;
     if (wanted) {
@@ -259,7 +259,7 @@ void Reader::end_rows()
     row_count.stated.reset();
 }
 
-void Reader::read(std::string_view text)
+void CgatsReader::read(std::string_view text)
 {
     const Work work{sheet.tell(), "Reading", text.size()};
     while (!text.empty()) {
@@ -291,11 +291,11 @@ void Reader::read(std::string_view text)
 
 void read_cgats(std::string_view text, Sheet &sheet)
 {
-    Reader(sheet, true).read(text);
+    CgatsReader(sheet, true).read(text);
     if (!sheet.patches.empty())
         return;
     sheet.header = {};
-    Reader(sheet, false).read(text);
+    CgatsReader(sheet, false).read(text);
 }
 
 } // namespace vantrel::sheets

@@ -18,9 +18,9 @@ using Devices = std::vector<std::pair<std::string, double>>;
 
 constexpr std::ptrdiff_t kMostSigns = 32'000'000; // bounds the memory that the parsed text takes
 
-class Reader {
+class CxfReader {
 public:
-    Reader(std::string_view text, Sheet &sheet) : text(text), sheet(sheet) {}
+    CxfReader(std::string_view text, Sheet &sheet) : text(text), sheet(sheet) {}
     void read();
 
 private:
@@ -71,7 +71,7 @@ private:
     std::vector<std::size_t> line_ends; // once a line is asked for
 };
 
-std::size_t Reader::line_at(std::size_t offset)
+std::size_t CxfReader::line_at(std::size_t offset)
 {
     if (line_ends.empty()) {
         for (std::size_t i = 0; i < text.size(); ++i)
@@ -83,7 +83,7 @@ std::size_t Reader::line_at(std::size_t offset)
     return static_cast<std::size_t>(end - line_ends.begin()) + 1;
 }
 
-double Reader::number(const Node &node, std::string_view value)
+double CxfReader::number(const Node &node, std::string_view value)
 {
     const auto number = number_in(value);
     if (!number)
@@ -94,7 +94,7 @@ double Reader::number(const Node &node, std::string_view value)
 }
 
 // The first colour of DeviceColorValues that consists of inks, or else of red, green and blue.
-Devices Reader::device_values(const Node &object)
+Devices CxfReader::device_values(const Node &object)
 {
     constexpr std::pair<std::string_view, const char *> process[] = {
         {"Cyan", "CMYK_C"},  {"Magenta", "CMYK_M"}, {"Yellow", "CMYK_Y"},
@@ -128,8 +128,8 @@ Devices Reader::device_values(const Node &object)
     return rgb;
 }
 
-std::vector<double> Reader::wavelengths(const Node &spectrum, const Settings &settings,
-                                        std::size_t count)
+std::vector<double> CxfReader::wavelengths(const Node &spectrum, const Settings &settings,
+                                           std::size_t count)
 {
     const std::string_view stated = attribute(spectrum, "StartWL");
     const auto first = stated.empty() ? settings.first_nm : std::optional(number(spectrum, stated));
@@ -153,7 +153,7 @@ std::vector<double> Reader::wavelengths(const Node &spectrum, const Settings &se
     return nm;
 }
 
-void Reader::read_spectrum(const Node &spectrum, const Settings &settings, Patch &patch)
+void CxfReader::read_spectrum(const Node &spectrum, const Settings &settings, Patch &patch)
 {
     std::vector<double> values;
     const std::string content = text_of(spectrum);
@@ -172,8 +172,8 @@ void Reader::read_spectrum(const Node &spectrum, const Settings &settings, Patch
                      .of(values);
 }
 
-std::array<double, 3> Reader::coordinates(const Node &colour,
-                                          const std::array<const char *, 3> &names)
+std::array<double, 3> CxfReader::coordinates(const Node &colour,
+                                             const std::array<const char *, 3> &names)
 {
     std::array<double, 3> out{};
     for (std::size_t i = 0; i < 3; ++i) {
@@ -186,7 +186,7 @@ std::array<double, 3> Reader::coordinates(const Node &colour,
 }
 
 // Colours of a second illuminant or observer are counted and left out.
-bool Reader::is_of_other_illuminant(const Settings &settings)
+bool CxfReader::is_of_other_illuminant(const Settings &settings)
 {
     if (settings.illuminant.empty() && settings.observer.empty())
         return false;
@@ -203,7 +203,7 @@ bool Reader::is_of_other_illuminant(const Settings &settings)
 }
 
 // L*a*b*, or X, Y and Z under the illuminant that the file states, or else D50 and 2 degrees.
-std::optional<CIELABCOORD> Reader::read_colour(const Node &colour)
+std::optional<CIELABCOORD> CxfReader::read_colour(const Node &colour)
 {
     const bool xyz = is(colour, "ColorCIEXYZ");
     if ((!xyz && !is(colour, "ColorCIELab")) || is_of_other_illuminant(settings_of(colour)))
@@ -219,7 +219,7 @@ std::optional<CIELABCOORD> Reader::read_colour(const Node &colour)
     return CIELABCOORD{out[0], out[1], out[2]};
 }
 
-void Reader::read_target(const Node &object)
+void CxfReader::read_target(const Node &object)
 {
     const std::string place = place_of(object);
     if (!place.empty() && !child(object, "ColorValues"))
@@ -229,7 +229,7 @@ void Reader::read_target(const Node &object)
 
 // By the object itself; an object whose name only counts those of its type ("M0_Measurement7") is
 // named by its place on the chart.
-void Reader::name(Patch &patch, const Node &object)
+void CxfReader::name(Patch &patch, const Node &object)
 {
     patch.id = printable(trimmed(attribute(object, "Id")));
     patch.name = printable(trimmed(attribute(object, "Name")));
@@ -249,7 +249,7 @@ void Reader::name(Patch &patch, const Node &object)
     }
 }
 
-void Reader::read_object(const Node &object)
+void CxfReader::read_object(const Node &object)
 {
     const Node values = child(object, "ColorValues");
     if (!values && targets.contains(place_of(object)))
@@ -308,7 +308,7 @@ void Reader::read_object(const Node &object)
 
 // Charts are measured in an order of their own; where all places have numbers the objects stand by
 // these, as in other files of the same chart.
-std::vector<Node> Reader::objects(const Node &collection) const
+std::vector<Node> CxfReader::objects(const Node &collection) const
 {
     std::vector<Node> out;
     std::vector<std::pair<double, std::size_t>> order;
@@ -328,7 +328,7 @@ std::vector<Node> Reader::objects(const Node &collection) const
     return sorted;
 }
 
-void Reader::read_about(const Node &root)
+void CxfReader::read_about(const Node &root)
 {
     for (const Node &node : child(root, "FileInformation").children())
         sheet.header.take(local_name(node.name()), node.child_value());
@@ -341,7 +341,7 @@ void Reader::read_about(const Node &root)
     sheet.header.condition.reset(); // each spectrum has its own
 }
 
-void Reader::read()
+void CxfReader::read()
 {
     if (std::count_if(text.begin(), text.end(), [](char c) { return c == '<' || c == '='; }) >
         kMostSigns)
@@ -399,7 +399,7 @@ void read_cxf(std::string_view text, Sheet &sheet)
 {
     sheet.fractions = true;
     sheet.colour_space = "XYZ"; // until there is any L*a*b*
-    Reader(text, sheet).read();
+    CxfReader(text, sheet).read();
 }
 
 } // namespace vantrel::sheets

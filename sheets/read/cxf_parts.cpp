@@ -10,7 +10,7 @@
 namespace vantrel::sheets {
 namespace {
 
-bool contains(std::string_view text, std::string_view part)
+bool contains_any_case(std::string_view text, std::string_view part)
 {
     return upper(text).find(part) != std::string::npos;
 }
@@ -30,9 +30,10 @@ template <typename Visit> auto first_below(const Node &top, Visit visit)
 Condition condition_of(const Node &node)
 {
     const std::string_view name = local_name(node.name());
-    if (contains(name, "ILLUMINATION") || contains(name, "CONDITION") || name == "MeasurementMode")
+    if (contains_any_case(name, "ILLUMINATION") || contains_any_case(name, "CONDITION") ||
+        name == "MeasurementMode")
         return condition_in(node.child_value());
-    if (contains(attribute(node, "Name"), "CONDITION")) {
+    if (contains_any_case(attribute(node, "Name"), "CONDITION")) {
         const std::string_view value = attribute(node, "Value");
         return condition_in(value.empty() ? node.child_value() : value);
     }
@@ -68,7 +69,8 @@ Settings settings_in(const Node &stated)
         out.condition = 3;
     else
         out.condition = first_below(stated, condition_of);
-    if (!out.condition && contains(child(device, "DeviceFilter").child_value(), "UVEXCLUDED"))
+    if (!out.condition &&
+        contains_any_case(child(device, "DeviceFilter").child_value(), "UVEXCLUDED"))
         out.condition = 2;
     for (const char *name : {"Name", "Id"})
         if (!out.condition)
@@ -90,14 +92,14 @@ std::map<std::string_view, TintStep> tint_steps(const Node &custom_resources)
         open.pop_back();
         std::string_view object, tint;
         const auto take = [&](std::string_view name, std::string_view value) {
-            if (contains(name, "TINT") || contains(name, "PERCENT"))
+            if (contains_any_case(name, "TINT") || contains_any_case(name, "PERCENT"))
                 tint = value;
-            else if (contains(name, "OBJECT") || contains(name, "REF"))
+            else if (contains_any_case(name, "OBJECT") || contains_any_case(name, "REF"))
                 object = value;
             else if (name == "SpotInkName")
                 place.ink = value;
             else if (name == "Background")
-                place.on_black = contains(value, "BLACK");
+                place.on_black = contains_any_case(value, "BLACK");
         };
         for (const auto &attribute : place.node.attributes())
             take(local_name(attribute.name()), attribute.value());

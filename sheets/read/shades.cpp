@@ -16,7 +16,7 @@ namespace vantrel::sheets {
 namespace {
 
 constexpr std::size_t kMostNamed = 5;
-constexpr double kLightest = -0.4; // a density of what nothing reflects
+constexpr double kThinnest = -0.4; // a density of what nothing reflects
 constexpr std::size_t kMostInks = 20;
 constexpr std::size_t kMostShades = 2000; // that are compared each with each
 
@@ -90,7 +90,7 @@ std::vector<Shade> shades_of(const std::vector<Patch> &patches, Kind kind, const
             if (is_ink(field) && percent > 0)
                 shade.tints[fields.find(field)->second] = percent;
         const Depth depth = depth_of(patch, kind);
-        if (*std::min_element(depth.density.begin(), depth.density.end()) < kLightest)
+        if (*std::min_element(depth.density.begin(), depth.density.end()) < kThinnest)
             continue;
         const auto [found, is_new] = shades.try_emplace(shade.tints, shade);
         if (is_new && shades.size() > kMostShades) {

@@ -15,8 +15,8 @@ namespace vantrel::sheets {
 namespace {
 
 constexpr std::size_t kMostWarnings = 20;
-constexpr double kFaintest = 5;   // no sheet is darker throughout
-constexpr double kLightest = 105; // L*
+constexpr double kFaintest = 5;        // no sheet is darker throughout
+constexpr double kLightestPaper = 105; // L*
 constexpr std::size_t kLongestInkName = 80;
 
 std::string name_of(const Condition &condition)
@@ -193,11 +193,11 @@ void Sheet::warn_of_guess(double largest)
                             largest, as));
         return;
     }
-    if (largest * 100 / *full_scale <= kLightest)
+    if (largest * 100 / *full_scale <= kLightestPaper)
         return;
     for (const Patch &patch : patches) {
         std::array<double, 3> lab{};
-        if (ReflToCIELAB(patch.refl.data(), D50_2DEG, lab.data()) && lab[0] > kLightest) {
+        if (ReflToCIELAB(patch.refl.data(), D50_2DEG, lab.data()) && lab[0] > kLightestPaper) {
             warn(patch.line, fmt::format("no keyword tells the scale: taken for {}, the patch has "
                                          "an L* of {:.1f}; --scale sets the scale",
                                          as, lab[0]));

@@ -175,6 +175,17 @@ std::string cut(const std::string &text, std::size_t most)
     return text;
 }
 
+std::string listed(const std::vector<std::string> &names)
+{
+    constexpr std::size_t most = 3;
+    std::string out;
+    for (std::size_t i = 0; i < std::min(most, names.size()); ++i)
+        out += (i ? ", " : "") + names[i];
+    if (names.size() > most)
+        out += " and " + std::to_string(names.size() - most) + " more";
+    return out;
+}
+
 std::string in_quotes(std::string_view text)
 {
     return '"' + cut(printable(text.substr(0, 400)), 40) + '"';

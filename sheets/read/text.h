@@ -5,6 +5,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
 namespace vantrel::sheets {
 
@@ -26,6 +27,9 @@ std::string utf8_of_utf16(std::string_view bytes);
 
 // UTF-8 text cut to a number of characters, with an ellipsis after the cut.
 std::string cut(const std::string &text, std::size_t most);
+
+// "A, B, C and 4 more".
+std::string listed(const std::vector<std::string> &names);
 
 // printable(), in quotes and cut to a length that fits a message.
 std::string in_quotes(std::string_view text);

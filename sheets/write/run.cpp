@@ -110,18 +110,6 @@ std::string finding_of(const Run &run, const LimitResult &worst, const LimitPlac
     return fmt::format("{}: {} on {}", title, reason, sheet_of(run, places.worst));
 }
 
-// "A, B, C, D and 3 more"
-std::string listed(const std::vector<std::string> &titles)
-{
-    constexpr std::size_t most = 4;
-    std::string out;
-    for (std::size_t i = 0; i < std::min(most, titles.size()); ++i)
-        out += (i ? ", " : "") + titles[i];
-    if (titles.size() > most)
-        out += fmt::format(" and {} more", titles.size() - most);
-    return out;
-}
-
 // Sheets and zones that stand apart, each with its readings.
 void add_oddities(const Run &run, std::vector<std::string> &out)
 {

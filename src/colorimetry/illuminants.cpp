@@ -3,7 +3,7 @@
 namespace vantrel {
 namespace {
 
-struct Row {
+struct IlluminantRow {
     ILLUM_OBS illum_obs;
     Illuminant illuminant;
 };
@@ -12,7 +12,7 @@ struct Row {
 // Hunter's constants: 175 and 70 for C_2DEG, for the others about 175 √(Xn / 98.074) and
 // 70 √(Zn / 118.232).
 // clang-format off
-constexpr Row kIlluminants[] = {
+constexpr IlluminantRow kIlluminants[] = {
     {A_2DEG,    {{109.850, 100.000,  35.585}, 185.21, 38.41}},
     {A_10DEG,   {{111.144, 100.000,  35.200}, 186.30, 38.20}},
     {C_2DEG,    {{ 98.074, 100.000, 118.232}, 175.00, 70.00}},
@@ -34,20 +34,20 @@ constexpr Row kIlluminants[] = {
 };
 // clang-format on
 
-constexpr bool rows_in_order()
+constexpr bool illuminants_in_order()
 {
     int i = 0;
-    for (const Row &row : kIlluminants)
+    for (const IlluminantRow &row : kIlluminants)
         if (row.illum_obs != i++)
             return false;
     return i == NUM_ILLUM_OBS;
 }
-static_assert(rows_in_order());
+static_assert(illuminants_in_order());
 
 // A digit that slips changes the sum of its column.
 constexpr bool adds_up(double (*value)(const Illuminant &), double sum)
 {
-    for (const Row &row : kIlluminants)
+    for (const IlluminantRow &row : kIlluminants)
         sum -= value(row.illuminant);
     return -1e-9 < sum && sum < 1e-9;
 }

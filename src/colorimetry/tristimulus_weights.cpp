@@ -7,7 +7,7 @@ namespace {
 
 enum Component { X, Y, Z };
 
-struct Row {
+struct WeightRow {
     ILLUM_OBS illum_obs;
     Component component;
     int weights[kBands];
@@ -17,7 +17,7 @@ struct Row {
 // Weighting factors of ASTM E308 for 10 nm steps, times 1000, with the factors below 400 nm and
 // above 700 nm folded into the first and the last band. F12 is not an ASTM table.
 // clang-format off
-constexpr Row kRows[] = {
+constexpr WeightRow kRows[] = {
     {A_2DEG, X, {23, 70, 272, 644, 924, 1036, 1017, 779, 428, 160, 24, 59, 428, 1210, 2313, 3735, 5511, 7573, 9718, 11583, 12706, 12671, 11347, 9010, 6551, 4345, 2626, 1457, 794, 406, 429}, 109849},
     {A_2DEG, Y, {0, 2, 8, 27, 61, 117, 209, 362, 618, 1039, 1802, 3091, 4756, 6320, 7599, 8571, 9219, 9456, 9224, 8543, 7547, 6360, 5061, 3716, 2559, 1639, 971, 533, 289, 147, 154}, 100000},
     {A_2DEG, Z, {110, 333, 1309, 3144, 4635, 5461, 5838, 5128, 3639, 2332, 1513, 962, 533, 305, 162, 75, 36, 21, 17, 13, 10, 5, 2, 1, 0, 0, 0, 0, 0, 0, 0}, 35584},
@@ -77,7 +77,7 @@ constexpr Row kRows[] = {
 
 constexpr bool sums_hold()
 {
-    for (const Row &row : kRows) {
+    for (const WeightRow &row : kRows) {
         int sum = 0;
         for (int weight : row.weights)
             sum += weight;
@@ -88,17 +88,17 @@ constexpr bool sums_hold()
 }
 static_assert(sums_hold());
 
-constexpr bool rows_in_order()
+constexpr bool weights_in_order()
 {
     int i = 0;
-    for (const Row &row : kRows) {
+    for (const WeightRow &row : kRows) {
         if (row.illum_obs != i / 3 || row.component != i % 3)
             return false;
         ++i;
     }
     return i == 3 * NUM_ILLUM_OBS;
 }
-static_assert(rows_in_order());
+static_assert(weights_in_order());
 
 struct Table {
     BandWeights weights[NUM_ILLUM_OBS][kBands];

@@ -7,7 +7,7 @@ namespace {
 
 // State. The slope of the default line is cut to 14 decimals.
 constinit AchromaticPoints points = {84, 14, 3, 11};
-constinit AchromaticLine line = {-0.11428571428571, 12.6};
+constinit AchromaticLine line_of_greys = {-0.11428571428571, 12.6};
 
 } // namespace
 
@@ -21,10 +21,10 @@ bool set_achromatic_points(const AchromaticPoints &through)
     if (!std::isfinite(through.L1) || !std::isfinite(slope) || !std::isfinite(intercept))
         return false;
     points = through;
-    line = {slope, intercept};
+    line_of_greys = {slope, intercept};
     return true;
 }
 
-const AchromaticLine &achromatic_line() { return line; }
+const AchromaticLine &achromatic_line() { return line_of_greys; }
 
 } // namespace vantrel

@@ -7,7 +7,7 @@
 namespace vantrel {
 namespace {
 
-constexpr int kReach = kShape / 2; ///< of a shape to either side
+constexpr int kShapeReach = kShape / 2; ///< of a shape to either side
 
 // State: the centres of HIFI1_RESPONSE and so on, as band indices. Their rows are in den_weight.
 constinit int centres[] = {13, 23, 22, 4, 23};
@@ -44,7 +44,7 @@ void build_row(std::span<std::int64_t, kBands> row, int centre, Shape shape)
     std::int64_t left = 100000;
     for (int i = 0; i < kShape; ++i) {
         const std::int64_t weight = whole_weight(shape[i] * scale);
-        row[centre - kReach + i] = weight;
+        row[centre - kShapeReach + i] = weight;
         left -= weight;
     }
     row[centre] += left;
@@ -55,7 +55,7 @@ void build_row(std::span<std::int64_t, kBands> row, int centre, Shape shape)
 void set_band(int response, double wavelength, const std::optional<Shape> &shape)
 {
     const double band = (wavelength - 400) / 10;
-    if (!(band >= kReach && band < kBands - kReach))
+    if (!(band >= kShapeReach && band < kBands - kShapeReach))
         return;
     const int centre = static_cast<int>(band);
     centre_of(response) = centre;
@@ -71,7 +71,8 @@ std::array<double, kShape> band_shape(int response)
     const int centre = centre_of(response);
     std::array<double, kShape> shape;
     for (int i = 0; i < kShape; ++i)
-        shape[i] = static_cast<double>(row[centre - kReach + i]) / static_cast<double>(row[centre]);
+        shape[i] =
+            static_cast<double>(row[centre - kShapeReach + i]) / static_cast<double>(row[centre]);
     return shape;
 }
 

@@ -6,7 +6,7 @@ namespace vantrel {
 namespace {
 
 // State.
-constinit SpectralXConstants constants = {2.0, 84.0, 1.0, 0.5, 0.1};
+constinit SpectralXConstants current = {2.0, 84.0, 1.0, 0.5, 0.1};
 
 constexpr int kReach = 2; ///< of the window to either side
 constexpr int kFirst = kReach;
@@ -14,7 +14,7 @@ constexpr int kLast = kBands - 1 - kReach;
 
 std::array<double, 5> window()
 {
-    const auto &c = constants;
+    const auto &c = current;
     return {c.outer, c.inner, c.centre, c.inner, c.outer};
 }
 
@@ -80,9 +80,9 @@ Stretch stretch(Spectrum refl, int first, int end)
 
 } // namespace
 
-const SpectralXConstants &spectralx_constants() { return constants; }
+const SpectralXConstants &spectralx_constants() { return current; }
 
-void set_spectralx_constants(const SpectralXConstants &new_constants) { constants = new_constants; }
+void set_spectralx_constants(const SpectralXConstants &new_constants) { current = new_constants; }
 
 double window_density(Spectrum refl, int first_band, std::span<const double> weights)
 {
@@ -111,7 +111,7 @@ Peaks absorption_peaks(Spectrum refl)
     Peaks peaks{};
     bool in_run = false;
     for (int band = first; band <= kLast; ++band) {
-        const bool near = sums[densest] >= sums[band] - constants.tolerance;
+        const bool near = sums[densest] >= sums[band] - current.tolerance;
         if (near && !in_run)
             peaks.points[peaks.count++] = {densities[band], band};
         else if (near && densities[band] > peaks.points[peaks.count - 1].density)

@@ -6,11 +6,11 @@ namespace vantrel {
 namespace {
 
 /// Which channel adjusts the spectrum for a response, and the one status that has the response.
-struct Row {
+struct AdjustedResponse {
     int response, channel;
     int only_status = -1;
 };
-constexpr Row kRows[] = {
+constexpr AdjustedResponse kAdjustedResponses[] = {
     {VISUAL_RESPONSE, VISUAL_RESPONSE},
     {RED_RESPONSE, RED_RESPONSE},
     {GREEN_RESPONSE, GREEN_RESPONSE},
@@ -45,7 +45,7 @@ std::optional<Densities> polarised_densities(Spectrum refl, Targets targets, Pap
         as_set ? *densities(*adjusted_paper, std::nullopt, status) : Densities{};
     const Paper paper = as_set ? std::nullopt : adjusted_paper;
     Densities set{};
-    for (const auto &[response, channel, only_status] : kRows)
+    for (const auto &[response, channel, only_status] : kAdjustedResponses)
         if (only_status < 0 || only_status == status)
             set.density[response] =
                 *density(adjusted[channel], paper, status, response) - paper_set.density[response];

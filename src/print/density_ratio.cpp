@@ -8,7 +8,7 @@
 namespace vantrel {
 
 static constexpr double kLargestRatio = 1000;
-static constexpr double kBlack = 1000; ///< K/S of a reflectance of 0
+static constexpr double kBlackKS = 1000; ///< K/S of a reflectance of 0
 
 double density_ratio(Spectrum reference, Spectrum sample, int status)
 {
@@ -26,10 +26,10 @@ double at_equivalent_density(double refl, double ratio)
     if (ratio <= 0)
         return refl;
     const double R = refl / 100;
-    const double ks = R == 0 ? kBlack : square(1 - R) / (2 * R) * 100 / ratio;
+    const double ks = R == 0 ? kBlackKS : square(1 - R) / (2 * R) * 100 / ratio;
     const double root = sqrt(square(ks) + 2 * ks);
     // Beyond black the difference of two large numbers has lost its digits; this is its equal.
-    return 100 * (ks > kBlack ? 1 / (1 + ks + root) : 1 + ks - root);
+    return 100 * (ks > kBlackKS ? 1 / (1 + ks + root) : 1 + ks - root);
 }
 
 } // namespace vantrel

@@ -112,7 +112,7 @@ Outcome run(const CompareOptions &options)
     return outcome;
 }
 
-constexpr const char *kFooter =
+constexpr const char *kCompareFooter =
     "Patches pair by name, id, device values or place in the file. auto takes the key that pairs "
     "most,\nunless device values disagree. An aim serves any number of patches; of patches with "
     "the "
@@ -189,7 +189,7 @@ Command add_compare(CLI::App &app)
     command->add_flag("--advice", options->advice,
                       "Tell the density change that brings each solid nearest to its aim");
     command->add_flag("--all", options->all, "List every pair in the table, not the worst ten");
-    command->footer(kFooter);
+    command->footer(kCompareFooter);
     return {command, [options] { return run(*options); }};
 }
 

@@ -29,7 +29,7 @@ Outcome run(const InkOptions &options)
     return outcome_of(std::move(study), std::move(warnings), options);
 }
 
-constexpr const char *kFooter =
+constexpr const char *kInkFooter =
     "Densities are over the paper. Brightness and the whiteness of ASTM E313 describe the patch as "
     "a\npaper. With --against there are, under every illuminant, the difference from that patch "
     "(Delta E00)\nand the metamerism of the two beside --illuminant (sum of two Delta E*ab; DIN "
@@ -54,7 +54,7 @@ Command add_ink(CLI::App &app)
     command->add_option("--against", options->against, "Another patch to set it beside");
     add_sheet_options(*command, *options);
     add_order_option(*command, options->order);
-    command->footer(kFooter);
+    command->footer(kInkFooter);
     return {command, [options] { return run(*options); }};
 }
 

@@ -43,7 +43,7 @@ List list_of(const ListOptions &options)
                                        : list_weights(status.value_or(E_STATUS), response);
 }
 
-constexpr const char *kFooter =
+constexpr const char *kListFooter =
     "illuminants: the combinations of illuminant and observer with their white points; with "
     "--illuminant\nthe weights of one, which sum to its white point. statuses: with the codes of "
     "their responses.\nresponses: the filters of every status, or of --status, with the first "
@@ -70,7 +70,7 @@ Command add_list(CLI::App &app)
     command->add_option("--response", options->response,
                         "One of the responses: " + response_names());
     add_common_options(*command, *options);
-    command->footer(kFooter);
+    command->footer(kListFooter);
     return {command, [options] { return outcome_of(list_of(*options), {}, *options); }};
 }
 

@@ -47,7 +47,7 @@ Outcome run(const PredictOptions &options)
     return outcome_of(std::move(predictions), std::move(warnings), options);
 }
 
-constexpr const char *kFooter =
+constexpr const char *kPredictFooter =
     "Three models stand side by side: tints as halftones, which mix ink and paper by area; as "
     "thinner\nfilms, both of up to three inks; and calibrated, the Yule-Nielsen-Neugebauer model "
     "with the dots, the\nn, the overprints and the mid-tones of the sheet itself. It predicts a "
@@ -76,7 +76,7 @@ Command add_predict(CLI::App &app)
                      "NAME is the solid's patch by name or id, or the ink's device field. Without "
                      "any, every measured overprint of two to four inks is predicted")
         ->allow_extra_args(false);
-    command->footer(kFooter);
+    command->footer(kPredictFooter);
     return {command, [options] { return run(*options); }};
 }
 

@@ -85,7 +85,7 @@ Outcome run(const ReportOptions &options)
     return outcome_of(std::move(sheets), std::move(warnings), options);
 }
 
-constexpr const char *kFooter =
+constexpr const char *kReportFooter =
     "The response that reads a patch is V(isual), R(ed), G(reen), B(lue), H1 to H3 (HiFi), X1 or "
     "X2\n(Hexachrome), a wavelength in nm under SPECTRAL_STATUS, a band (b0 is 400 nm, b30 700 nm) "
     "under\nSPECTRALX_STATUS. Densities are over the paper under every status. Dot area and gain "
@@ -123,7 +123,7 @@ Command add_report(CLI::App &app)
     command->add_option("--advice", options->advice,
                         "Measurement file of aims: tell the density change that brings each solid "
                         "nearest to its aim");
-    command->footer(kFooter);
+    command->footer(kReportFooter);
     return {command, [options] { return run(*options); }};
 }
 

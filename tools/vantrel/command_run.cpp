@@ -40,7 +40,7 @@ Outcome run(const RunOptions &options)
     return outcome;
 }
 
-constexpr const char *kFooter =
+constexpr const char *kRunFooter =
     "Sheets stand in the order of their date where all have one, or else as they are named. An aim "
     "serves\nall patches of its inks on a sheet, its zones: their number ends the name, as in "
     "\"M100 Z5\", or is that\nof their place. A reading is that of the mean of the zones; Zones± "
@@ -72,7 +72,7 @@ Command add_run(CLI::App &app)
                         "TOML file of limits by group of patches; examples/ has three");
     add_sheet_options(*command, *options);
     add_order_option(*command, options->order);
-    command->footer(kFooter);
+    command->footer(kRunFooter);
     return {command, [options] { return run(*options); }};
 }
 

@@ -19,7 +19,7 @@
 namespace vantrel::program {
 namespace {
 
-OutputError error_now() { return {std::strerror(errno)}; }
+OutputError output_error_now() { return {std::strerror(errno)}; }
 
 constexpr int kEnding[] = {SIGHUP, SIGINT, SIGQUIT, SIGTERM};
 
@@ -90,11 +90,11 @@ void OutputFile::finish()
         return;
     // On the disk before it takes the name, so that a crash of the machine leaves no empty file.
     if (!temporary.empty() && (fchmod(file, mode) != 0 || fsync(file) != 0))
-        throw error_now();
+        throw output_error_now();
     if (close(std::exchange(file, -1)) != 0)
-        throw error_now();
+        throw output_error_now();
     if (!temporary.empty() && std::rename(temporary.c_str(), replaced.c_str()) != 0)
-        throw error_now();
+        throw output_error_now();
     forget_temporary();
 }
 
@@ -108,7 +108,7 @@ std::size_t OutputFile::put(std::string_view text)
 {
     const ssize_t written = ::write(file, text.data(), text.size());
     if (written < 0 && errno != EINTR)
-        throw error_now();
+        throw output_error_now();
     return static_cast<std::size_t>(written < 0 ? 0 : written);
 }
 
@@ -125,7 +125,7 @@ void OutputFile::open()
         file = STDOUT_FILENO;
     } else if (!exists) { // a link to nothing is refused: it names no file yet
         if (errno != ENOENT || lstat(path.c_str(), &target) == 0)
-            throw error_now();
+            throw output_error_now();
         open_beside(path);
         mode = usual_mode();
     } else if (!S_ISREG(target.st_mode)) {
@@ -135,7 +135,7 @@ void OutputFile::open()
         open_to_replace(target);
     }
     if (file < 0)
-        throw error_now();
+        throw output_error_now();
 }
 
 void OutputFile::open_to_replace(const struct stat &target)
@@ -147,14 +147,14 @@ void OutputFile::open_to_replace(const struct stat &target)
         const std::unique_ptr<char, decltype(&std::free)> end(realpath(path.c_str(), nullptr),
                                                               std::free);
         if (!end)
-            throw error_now();
+            throw output_error_now();
         real = end.get();
     }
     if (access(path.c_str(), W_OK) != 0)
-        throw error_now();
+        throw output_error_now();
     open_beside(real);
     if (fstat(file, &made) != 0)
-        throw error_now();
+        throw output_error_now();
     if ((made.st_uid != target.st_uid || made.st_gid != target.st_gid) &&
         fchown(file, target.st_uid, target.st_gid) != 0)
         throw OutputError{"a new file cannot be given its owner and group; choose another name"};
