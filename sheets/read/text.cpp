@@ -175,6 +175,11 @@ std::string cut(const std::string &text, std::size_t most)
     return text;
 }
 
+std::string and_more(std::size_t count)
+{
+    return count > 1 ? ", and " + std::to_string(count - 1) + " more" : "";
+}
+
 std::string listed(const std::vector<std::string> &names)
 {
     constexpr std::size_t most = 3;

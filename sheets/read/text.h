@@ -28,6 +28,9 @@ std::string utf8_of_utf16(std::string_view bytes);
 // UTF-8 text cut to a number of characters, with an ellipsis after the cut.
 std::string cut(const std::string &text, std::size_t most);
 
+// ", and 3 more" after the first of 4; nothing after the first of 1.
+std::string and_more(std::size_t count);
+
 // "A, B, C and 4 more".
 std::string listed(const std::vector<std::string> &names);
 
