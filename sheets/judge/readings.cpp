@@ -5,13 +5,12 @@
 #include "judge/inks.h"
 #include "judge/repeats.h"
 #include "judge/tone_value.h"
+#include "read/labels.h"
 
 #include <fmt/format.h>
 
 #include <algorithm>
 #include <array>
-#include <cctype>
-#include <charconv>
 #include <cmath>
 #include <utility>
 
@@ -321,17 +320,9 @@ std::string Measurand::title() const
 
 int take_zone(Patch &patch)
 {
-    std::string &name = patch.name;
-    const auto z = name.find_last_of("Zz");
-    if (z == std::string::npos || z == 0 || std::isalnum(static_cast<unsigned char>(name[z - 1])))
-        return 0;
-    int zone = 0;
-    const char *last = name.data() + name.size();
-    const auto [end, error] = std::from_chars(name.data() + z + 1, last, zone);
-    if (error != std::errc() || end != last || zone <= 0)
-        return 0;
-    name.resize(name.find_last_not_of(" _-.", z - 1) + 1);
-    return zone;
+    const ZonedName zoned = zoned_name(patch.name);
+    patch.name.resize(zoned.name.size());
+    return zoned.zone;
 }
 
 SheetReadings readings_of(const Measurement &aims, Measurement measured, CompareRequest request,

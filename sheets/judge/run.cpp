@@ -279,8 +279,11 @@ void RunJudge::judge(RunSeries &series) const
     if (!series.limits)
         return;
     series.first_outside = first_outside(values, *series.limits);
-    if (series.trend.drift)
-        series.leaves_at = leaves_at(*series.trend.drift, *series.limits, values.size(), kAhead);
+    if (series.trend.drift) {
+        for (const std::size_t sheet : series.outliers)
+            values[sheet].reset();
+        series.leaves_at = leaves_at(*series.trend.drift, *series.limits, values, kAhead);
+    }
 }
 
 // What a sheet lacks of what any other has.

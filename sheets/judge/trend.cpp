@@ -133,13 +133,19 @@ std::optional<std::size_t> first_outside(const Series &series, const Limits &lim
     return std::nullopt;
 }
 
-std::optional<std::size_t> leaves_at(const Drift &drift, const Limits &limits, std::size_t sheets,
+std::optional<std::size_t> leaves_at(const Drift &drift, const Limits &limits, const Series &series,
                                      std::size_t ahead)
 {
-    if (!drift.significant() || !limits.hold(drift.at(static_cast<double>(sheets) - 1)))
+    const auto beyond = [&](double value) {
+        return drift.slope > 0 ? limits.high && value > *limits.high
+                               : limits.low && value < *limits.low;
+    };
+    const auto last = std::find_if(series.rbegin(), series.rend(),
+                                   [](const auto &reading) { return reading.has_value(); });
+    if (!drift.significant() || last == series.rend() || beyond(**last))
         return std::nullopt;
-    for (std::size_t sheet = sheets; sheet < sheets + ahead; ++sheet)
-        if (!limits.hold(drift.at(static_cast<double>(sheet))))
+    for (std::size_t sheet = series.size(); sheet < series.size() + ahead; ++sheet)
+        if (beyond(drift.at(static_cast<double>(sheet))))
             return sheet;
     return std::nullopt;
 }

@@ -60,9 +60,9 @@ struct Limits {
 // The first sheet whose reading is outside, counted from 0.
 std::optional<std::size_t> first_outside(const Series &series, const Limits &limits);
 
-// The sheet at which the drift leaves the limits, of the next `ahead` after `sheets`; nothing where
-// it does not, is not significant, or is outside by the last sheet.
-std::optional<std::size_t> leaves_at(const Drift &drift, const Limits &limits, std::size_t sheets,
+// The sheet at which the drift passes the limit that it runs to, of the next `ahead`; nothing where
+// it does not, is not significant, or the last reading is beyond.
+std::optional<std::size_t> leaves_at(const Drift &drift, const Limits &limits, const Series &series,
                                      std::size_t ahead);
 
 } // namespace vantrel::sheets

@@ -122,15 +122,15 @@ void Header::take(std::string_view keyword, std::string_view value)
     if (key == "WEIGHTINGFUNCTION" && words.starts_with("ILLUMINANT"))
         keep_illuminant(value.substr(std::min(value.find_first_not_of(" ,", 10), value.size())));
     else if (key == "WEIGHTINGFUNCTION" && words.starts_with("OBSERVER"))
-        keep(observer, value.substr(std::min(value.find_first_not_of(" ,", 8), value.size())));
+        keep_observer(value.substr(std::min(value.find_first_not_of(" ,", 8), value.size())));
     else if (key == "ILLUMINATIONNAME" || key == "ILLUMINANT" ||
              (key == "WEIGHTINGFUNCTION" && illuminant_in(value, 2)))
         keep_illuminant(value);
     else if (key == "OBSERVERANGLE" || key == "OBSERVER")
-        keep(observer, value);
+        keep_observer(value);
     else if (key == "MEASUREMENTSOURCE") {
         keep_illuminant(behind(words, "ILLUMINATION="));
-        keep(observer, behind(words, "OBSERVERANGLE="));
+        keep_observer(behind(words, "OBSERVERANGLE="));
     }
 }
 
@@ -141,6 +141,15 @@ void Header::keep_illuminant(std::string_view value)
         illuminant = stated;
     else if (illuminant_in(stated, 2) && illuminant_in(stated, 2) != illuminant_in(illuminant, 2))
         other_illuminant = stated;
+}
+
+void Header::keep_observer(std::string_view value)
+{
+    const std::string stated = printable(trimmed(value));
+    if (observer.empty())
+        observer = stated;
+    else if (observer_in(stated) && observer_in(stated) != observer_in(observer))
+        other_observer = stated;
 }
 
 bool Header::transmission() const { return contains(quantity, "TRANSMI"); }

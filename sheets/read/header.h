@@ -18,9 +18,9 @@ Condition condition_in(std::string_view text);
 struct Header {
     Origin origin;
     std::string quantity; // what was measured: "REFLECTIVE", "TRANSMITTANCE", "EMISSION"
-    std::string illuminant, observer; // of the file's own colours
-    std::string other_illuminant;     // that the file states too
-    Condition condition;              // the one that was named last
+    std::string illuminant, observer;             // of the file's own colours
+    std::string other_illuminant, other_observer; // that the file states too
+    Condition condition;                          // the one that was named last
 
     // The first to say something is believed, but for the condition.
     void take(std::string_view keyword, std::string_view value);
@@ -34,6 +34,7 @@ struct Header {
 
 private:
     void keep_illuminant(std::string_view value);
+    void keep_observer(std::string_view value);
 };
 
 } // namespace vantrel::sheets

@@ -5,8 +5,10 @@
 
 #include <fmt/format.h>
 
+#include <cctype>
 #include <charconv>
 #include <cstddef>
+#include <iterator>
 #include <map>
 #include <optional>
 #include <string>
@@ -95,6 +97,22 @@ void doubt_places(const std::vector<Patch> &patches, std::vector<Doubt> &out)
                                                 in_quotes(before->name), in_quotes(after->name))});
 }
 
+// Zones that a sheet leaves out between others.
+void doubt_zones(const std::vector<Patch> &patches, std::vector<Doubt> &out)
+{
+    std::map<int, const Patch *> zones;
+    for (const Patch &patch : patches)
+        if (const int zone = zoned_name(patch.name).zone)
+            zones.emplace(zone, &patch);
+    for (auto zone = zones.begin(); zone != zones.end(); ++zone)
+        if (const auto next = std::next(zone); next != zones.end() && next->first > zone->first + 1)
+            out.push_back(
+                {next->second->line, fmt::format("by their names zone {} is missing: after {} "
+                                                 "comes {}",
+                                                 zone->first + 1, in_quotes(zone->second->name),
+                                                 in_quotes(next->second->name))});
+}
+
 std::vector<std::string_view> texts_of(const std::vector<Patch> &patches, std::string Patch::*text)
 {
     std::vector<std::string_view> out;
@@ -128,10 +146,25 @@ void doubt_names(const std::vector<Patch> &patches, std::vector<Doubt> &out)
 
 } // namespace
 
+ZonedName zoned_name(std::string_view name)
+{
+    const auto z = name.find_last_of("Zz");
+    if (z == std::string_view::npos || z == 0 ||
+        std::isalnum(static_cast<unsigned char>(name[z - 1])))
+        return {name};
+    int zone = 0;
+    const char *last = name.data() + name.size();
+    const auto [end, error] = std::from_chars(name.data() + z + 1, last, zone);
+    if (error != std::errc() || end != last || zone <= 0)
+        return {name};
+    return {name.substr(0, name.find_last_not_of(" _-.", z - 1) + 1), zone};
+}
+
 void doubt_labels(const std::vector<Patch> &patches, std::vector<Doubt> &out)
 {
     doubt_ids(patches, out);
     doubt_places(patches, out);
+    doubt_zones(patches, out);
     doubt_names(patches, out);
 }
 

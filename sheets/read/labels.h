@@ -3,11 +3,19 @@
 
 #include "read/doubts.h"
 
+#include <string_view>
 #include <vector>
 
 namespace vantrel::sheets {
 
-// Gaps in the count of ids or of places, and ids and names that stand for several patches.
+// The zone that ends a name (C100 Z5), and the name without it; 0 where there is none.
+struct ZonedName {
+    std::string_view name;
+    int zone = 0;
+};
+ZonedName zoned_name(std::string_view name);
+
+// Gaps in the count of ids, places or zones, and ids and names that stand for several patches.
 void doubt_labels(const std::vector<Patch> &patches, std::vector<Doubt> &out);
 
 } // namespace vantrel::sheets

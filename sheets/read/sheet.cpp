@@ -257,6 +257,9 @@ Measurement Sheet::measurement()
     if (!header.other_illuminant.empty())
         warn(0, fmt::format("the illuminant is said to be {}, and {} elsewhere: the first is taken",
                             in_quotes(header.illuminant), in_quotes(header.other_illuminant)));
+    if (!header.other_observer.empty())
+        warn(0, fmt::format("the observer is said to be {}, and {} elsewhere: the first is taken",
+                            in_quotes(header.observer), in_quotes(header.other_observer)));
     if (xyz)
         bring_to_lab(colours);
     check_inks();

@@ -126,6 +126,15 @@ std::string ink_of(std::string key, bool initials)
     return percent && (key.starts_with("SPOT") || key.starts_with("INK")) ? key : "";
 }
 
+// Whether a column that is none known may be that of an ink: a percentage, or SPOT_1, PC6_5, HEX_O.
+bool may_be_ink(std::string_view key)
+{
+    return key.ends_with('%') || key.ends_with("%)") || key.ends_with("%]") ||
+           key.ends_with("PCT") || key.find("PERCENT") != std::string_view::npos ||
+           key.starts_with("SPOT") || key.starts_with("HEX") ||
+           (key.size() > 2 && key.starts_with("PC") && key[2] >= '0' && key[2] <= '9');
+}
+
 [[noreturn]] void throw_twice(std::string_view field, std::size_t first, std::size_t second,
                               std::size_t line)
 {
@@ -284,6 +293,24 @@ void Table::find_devices(const std::vector<std::string> &keys, std::size_t line)
             throw_twice(fields[i], before->second, i, line);
         devices.push_back({i, std::move(device)});
     }
+    warn_of_inks(keys, line);
+}
+
+void Table::warn_of_inks(const std::vector<std::string> &keys, std::size_t line)
+{
+    std::vector<std::string> unknown;
+    for (std::size_t i = 0; i < fields.size(); ++i) {
+        const bool device = std::any_of(devices.begin(), devices.end(),
+                                        [i](const Device &known) { return known.column == i; });
+        const bool spectral = std::find(values.begin(), values.end(), i) != values.end();
+        if (!device && !spectral && i != tint && may_be_ink(keys[i]))
+            unknown.push_back(in_quotes(fields[i]));
+    }
+    if (!unknown.empty())
+        sheet.warn(line,
+                   fmt::format("{} left out, no name of an ink; \"Spot 1 %\" is one, and columns "
+                               "Ink and Tint take any",
+                               listed(unknown)));
 }
 
 double Table::value_at(const Row &row, std::size_t column, std::size_t line)

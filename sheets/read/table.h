@@ -45,6 +45,7 @@ private:
     void find_spectra(std::size_t line);
     void find_colours(const std::vector<std::string> &keys);
     void find_devices(const std::vector<std::string> &keys, std::size_t line);
+    void warn_of_inks(const std::vector<std::string> &keys, std::size_t line);
     const Bands &bands(const Row &row, std::size_t line);
     std::optional<CIELABCOORD> colour(const Row &row, std::size_t line) const;
     std::vector<std::pair<std::string, double>> device_values(const Row &row, std::size_t line);

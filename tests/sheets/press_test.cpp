@@ -29,9 +29,9 @@ TEST(Trend, AnscombesFirstSet)
     EXPECT_EQ(first_outside(anscombe, {.low = {}, .high = 8.5}), 5U);
     EXPECT_EQ(first_outside(anscombe, {.low = 4.9, .high = {}}), 0U);
     // 3.0001 + 0.5001 (4 + sheet) passes 12 at sheet 14.
-    EXPECT_EQ(leaves_at(*trend.drift, {.low = {}, .high = 12}, 11, 10), 14U);
-    EXPECT_FALSE(leaves_at(*trend.drift, {.low = {}, .high = 12}, 11, 3));
-    EXPECT_FALSE(leaves_at(*trend.drift, {.low = 4, .high = {}}, 11, 10));
+    EXPECT_EQ(leaves_at(*trend.drift, {.low = {}, .high = 12}, anscombe, 10), 14U);
+    EXPECT_FALSE(leaves_at(*trend.drift, {.low = {}, .high = 12}, anscombe, 3));
+    EXPECT_FALSE(leaves_at(*trend.drift, {.low = 4, .high = {}}, anscombe, 10));
 }
 
 TEST(Trend, SheetsWithoutTheReadingLeaveGaps)
@@ -42,6 +42,19 @@ TEST(Trend, SheetsWithoutTheReadingLeaveGaps)
     EXPECT_NEAR(trend.drift->at(0), 0, 1e-12);
     EXPECT_FALSE(trend_of({{}, {}}));
     EXPECT_FALSE(trend_of({1, 2})->drift);
+}
+
+// The line may be outside before any reading is; one that comes back does not leave.
+TEST(Trend, LeavesByTheLimitThatItRunsTo)
+{
+    const Limits limits{1.24, 1.498};
+    const auto leaves = [&](const Series &series) {
+        return leaves_at(*trend_of(series)->drift, limits, series, 10);
+    };
+    EXPECT_EQ(leaves({1.461, 1.470, 1.483, 1.490, 1.497, 1.497}), 6u);
+    EXPECT_EQ(leaves({1.461, 1.470, 1.483, 1.490, 1.497, 1.505}), std::nullopt);
+    EXPECT_EQ(leaves({1.540, 1.531, 1.519, 1.512, 1.503, 1.497}), std::nullopt);
+    EXPECT_EQ(leaves({1.277, 1.270, 1.262, 1.258, 1.251, std::nullopt}), 6u);
 }
 
 TEST(Trend, OutlierAndDriftOfOneInkDoNotHideEachOther)
