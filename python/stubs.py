@@ -24,7 +24,8 @@ from . import plot as plot
 from ._enums import IllumObs as IllumObs, Response as Response, Status as Status
 from ._ink import Ink as Ink
 from ._judge import compare as compare, ink as ink, predict as predict, report as report, run as run
-from ._results import Comparison as Comparison, Predictions as Predictions, Report as Report
+from ._predictions import Predictions as Predictions
+from ._results import Comparison as Comparison, Report as Report
 from ._run import Run as Run
 from ._sheet import Origin as Origin, Sheet as Sheet, Source as Source, read as read, reads as reads
 

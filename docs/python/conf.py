@@ -22,7 +22,7 @@ nb_execution_raise_on_error = True
 nb_execution_timeout = 300
 
 SUBJECTS = {
-    "Sheets": "_sheet _judge _results _ink _run",
+    "Sheets": "_sheet _judge _results _predictions _ink _run",
     "Colours": "_colour",
     "Differences": "_difference",
     "Densities": "_density",

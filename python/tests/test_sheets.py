@@ -27,12 +27,12 @@ WIDE += "A1 <b>&grey 101.5 51 1 2 " + " ".join(f"{0.2 + i / 100:.2f}" for i in r
 WIDE += "A2 black 40 11 3 4 " + " ".join(f"{0.02 + i / 1000:.3f}" for i in range(33)) + "\n"
 WIDE += "END_DATA\n"
 SPOT = '<ReflectanceSpectrum ColorSpecification="{0}" StartWL="400">' + "0.{1} " * 31 + "</ReflectanceSpectrum>"
-SPECIFICATION = """<ColorSpecification Id="{0}"><MeasurementSpec><WavelengthRange Increment="10"/>
+CONDITION = """<ColorSpecification Id="{0}"><MeasurementSpec><WavelengthRange Increment="10"/>
 <Device><DeviceIllumination>{0}_Light</DeviceIllumination></Device></MeasurementSpec></ColorSpecification>"""
 LIBRARY_OF_SPOTS = f"""<CxF xmlns="http://colorexchangeformat.com/CxF3-core"><Resources><ObjectCollection>
 <Object ObjectType="Standard" Name="Spot" Id="1"><ColorValues>{SPOT.format("M0", 4)}{SPOT.format("M1", 5)}
-</ColorValues></Object></ObjectCollection><ColorSpecificationCollection>{SPECIFICATION.format("M0")}
-{SPECIFICATION.format("M1")}</ColorSpecificationCollection></Resources></CxF>"""
+</ColorValues></Object></ObjectCollection><ColorSpecificationCollection>{CONDITION.format("M0")}
+{CONDITION.format("M1")}</ColorSpecificationCollection></Resources></CxF>"""
 COLOURS = "name,L,a,b\npaper,95,0,-2\nmagenta,48,75,-4\n"
 
 

@@ -1,6 +1,20 @@
 #include "output_file.h"
 
+#include "read/text.h"
+
+#include <fmt/format.h>
+
+#include <cerrno>
+#include <cstring>
+
 namespace vantrel::program {
+
+OutputError not_made_in(const std::string &folder)
+{
+    const char *reason = std::strerror(errno);
+    return {fmt::format("no file can be made in its folder {}: {}",
+                        folder.empty() ? "." : sheets::printable(folder), reason)};
+}
 
 void OutputFile::write(std::string_view text)
 {

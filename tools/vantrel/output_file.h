@@ -13,6 +13,9 @@ struct OutputError {
     std::string reason;
 };
 
+// That errno keeps a file from being made there; an empty folder is the one that the program is in.
+OutputError not_made_in(const std::string &folder);
+
 // Takes text for a file, or for standard output where the path is empty or "-". A file has either
 // its old content or all of the new one, also when a signal ends the program: it is written under a
 // temporary name beside its own, with the rights, owner and group of the old one, and renamed. What

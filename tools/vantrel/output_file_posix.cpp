@@ -4,8 +4,6 @@
 #include "read/measurement.h"
 #include "read/text.h"
 
-#include <fmt/format.h>
-
 #include <cerrno>
 #include <climits>
 #include <csignal>
@@ -169,9 +167,7 @@ void OutputFile::open_beside(const std::string &target)
     std::string name = folder + ".vantrel.XXXXXX"; // of no more characters where the name has 255
     file = make_temporary(name);
     if (file < 0)
-        throw OutputError{fmt::format("no file can be made in its folder {}: {}",
-                                      folder.empty() ? "." : sheets::printable(folder),
-                                      std::strerror(errno))};
+        throw not_made_in(folder);
     temporary = name;
 }
 

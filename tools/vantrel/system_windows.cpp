@@ -256,9 +256,7 @@ void OutputFile::open_beside(const std::string &target)
             break;
     }
     if (file < 0)
-        throw OutputError{fmt::format("no file can be made in its folder {}: {}",
-                                      folder.empty() ? "." : sheets::printable(folder),
-                                      std::strerror(errno))};
+        throw not_made_in(folder);
     temporary = name;
 }
 

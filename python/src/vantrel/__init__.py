@@ -147,7 +147,8 @@ from ._constants import (
 from ._resample import resample
 from ._sheet import Origin, Sheet, Source, read, reads
 from ._ink import Ink
-from ._results import Comparison, Predictions, Report
+from ._predictions import Predictions
+from ._results import Comparison, Report
 from ._run import Run
 from ._judge import compare, ink, predict, report, run
 

@@ -12,7 +12,8 @@ import numpy as np
 from ._arguments import INDICES
 from ._enums import IllumObs, Status
 from ._ink import Ink
-from ._results import Comparison, Predictions, Report
+from ._predictions import Predictions
+from ._results import Comparison, Report
 from ._run import Run
 from ._sheet import Sheet, extension, in_python, read
 

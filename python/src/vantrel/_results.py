@@ -16,17 +16,17 @@ def frame(rows: Any) -> Any:
     return pd.DataFrame.from_records([*rows])
 
 
-def _plain(patch: Any, *left_out: str) -> Dict[str, Any]:
+def plain(patch: Any, *left_out: str) -> Dict[str, Any]:
     """The fields of one patch as columns, but colours and spectra."""
     left = {"lab", "lch", "refl", "device", *left_out}
     return {f.name: getattr(patch, f.name) for f in fields(patch) if f.name not in left}
 
 
-def _lab(lab: Optional[Lab], prefix: str = "") -> Dict[str, Any]:
+def lab_columns(lab: Optional[Lab], prefix: str = "") -> Dict[str, Any]:
     return {} if lab is None else {prefix + axis: value for axis, value in zip("Lab", lab)}
 
 
-def _refl(refl: Refl) -> Dict[int, float]:
+def refl_columns(refl: Refl) -> Dict[int, float]:
     return {} if refl is None else dict(zip(NM.astype(int).tolist(), refl))
 
 
@@ -161,12 +161,12 @@ class Report(Result):
         """A DataFrame with a row for each patch."""
         return frame(
             {
-                **_plain(p),
+                **plain(p),
                 **p.device,
-                **_lab(p.lab),
+                **lab_columns(p.lab),
                 "C": p.lch[1],
                 "h": p.lch[2],
-                **_refl(p.refl),
+                **refl_columns(p.refl),
             }
             for p in self.patches
         )
@@ -386,119 +386,15 @@ class Comparison(Result):
         """A DataFrame with a row for each pair."""
         return frame(
             {
-                **_plain(p, "reference", "sample", "delta_e", "corrected"),
+                **plain(p, "reference", "sample", "delta_e", "corrected"),
                 **p.delta_e,
-                **_lab(p.reference.lab, "reference_"),
-                **_lab(p.sample.lab),
+                **lab_columns(p.reference.lab, "reference_"),
+                **lab_columns(p.sample.lab),
                 **{f"corrected_{k}": v for k, v in (p.corrected.delta_e if p.corrected else {}).items()},
-                **_refl(p.sample.refl),
+                **refl_columns(p.sample.refl),
             }
             for p in self.pairs
         )
 
     def __repr__(self) -> str:
         return f"<Comparison of {self.sample.file} with {self.reference.file}: {self.says}>"
-
-
-@dataclass(frozen=True)
-class InkTint:
-    """An ink, by its solid's patch, at a percentage."""
-
-    name: str
-    percent: int
-
-
-@dataclass(frozen=True)
-class Estimate:
-    """What a model predicts."""
-
-    rgb: str
-    lab: Lab
-    de00_to_measured: Optional[float]
-    refl: Refl
-    response: Optional[str]
-    density: Optional[float]
-
-
-@dataclass(frozen=True)
-class Measured:
-    """The patch of the sheet that holds the combination."""
-
-    name: str
-    rgb: str
-    lab: Lab
-    response: Optional[str]
-    density: Optional[float]
-
-
-MODELS = ("halftone", "film", "calibrated")
-
-
-@dataclass(frozen=True)
-class Prediction:
-    """Inks in the order of printing by each model, None where it does not take them.
-
-    `halftone` mixes ink and paper by area, `film` takes tints as thinner films, `calibrated` is
-    fitted to the sheet and did without what is `lacking` there.
-    """
-
-    inks: Tuple[InkTint, ...]
-    halftone: Optional[Estimate]
-    film: Optional[Estimate]
-    calibrated: Optional[Estimate]
-    lacking: Tuple[str, ...]
-    measured: Optional[Measured]
-
-
-@dataclass(frozen=True)
-class LeftOutError:
-    """Of the calibrated model, ΔE00 on so many `patches`, each predicted without itself."""
-
-    patches: int
-    mean: float
-    p95: float
-    max: float
-
-
-@dataclass(frozen=True)
-class Calibration:
-    """How the calibrated model was fitted, `words` says it; `missing`: why there is none."""
-
-    n: Optional[float]
-    left_out_error: Optional[LeftOutError]
-    missing: Optional[str]
-    words: str
-
-
-@dataclass(frozen=True, repr=False)
-class Predictions(Result):
-    """What `vantrel predict` says; `left_out` overprints could not be predicted."""
-
-    file: str
-    illuminant: str
-    illuminant_by: str
-    status: str
-    warnings: Tuple[str, ...]
-    paper: Optional[str]
-    paper_chosen: str
-    left_out: int
-    calibration: Calibration
-    predictions: Tuple[Prediction, ...]
-
-    def to_pandas(self) -> Any:
-        """A DataFrame with a row for each prediction and model."""
-        return frame(
-            {
-                "inks": " + ".join(f"{ink.name} {ink.percent} %" for ink in prediction.inks),
-                "model": model,
-                **_plain(estimate),
-                **_lab(estimate.lab),
-                **_refl(estimate.refl),
-            }
-            for prediction in self.predictions
-            for model, estimate in ((model, getattr(prediction, model)) for model in MODELS)
-            if estimate is not None
-        )
-
-    def __repr__(self) -> str:
-        return f"<Predictions of {len(self.predictions)} combinations of {self.file}>"
