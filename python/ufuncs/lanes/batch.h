@@ -36,6 +36,20 @@ template <class F> void each_batch(npy_intp rows, F f)
         f(Batch{first, rows - 1});
 }
 
+/// The same in two steps: first() of a few batches, then then() of each with its result. While one
+/// batch waits for its sum or its logarithm, the processor goes on with the others.
+template <class First, class Then> void each_batch(npy_intp rows, First first, Then then)
+{
+    constexpr int kTogether = 4;
+    for (npy_intp at = 0; at < rows; at += kTogether * N) {
+        decltype(first(Batch{})) results[kTogether];
+        for (int i = 0; i < kTogether; ++i)
+            results[i] = first(Batch{at + i * N, rows - 1});
+        for (int i = 0; i < kTogether; ++i)
+            then(Batch{at + i * N, rows - 1}, results[i]);
+    }
+}
+
 bool is_spectrum(const Operand &o)
 {
     return o.counts[0] == kBands && o.counts[1] == 1 && o.strides[0] == sizeof(double);

@@ -225,19 +225,25 @@ public:
         if (paper.size() && is_same(paper))
             same = vantrel::weighted_density(spectrum(paper), std::nullopt, status, response);
     }
-    V operator()(const Bands &refl, const Batch &batch) const
+    /// Σ R w of a patch and of its paper.
+    struct Sums {
+        V patch, paper;
+    };
+    Sums sums(const Bands &refl, const Batch &batch) const
     {
-        const V density = of(refl);
+        const bool each = paper.size() && !is_same(paper);
+        return {sum(refl), each ? sum(spectra(paper, batch)) : V(0)};
+    }
+    V operator()(const Sums &sums) const
+    {
+        const V density = vantrel::density_of_sum(sums.patch);
         if (!paper.size())
             return density;
-        return density - (is_same(paper) ? V(same) : of(spectra(paper, batch)));
+        return density - (is_same(paper) ? V(same) : vantrel::density_of_sum(sums.paper));
     }
 
 private:
-    V of(const Bands &refl) const
-    {
-        return vantrel::density_of_sum(vantrel::weighted_sum(refl, weights));
-    }
+    V sum(const Bands &refl) const { return vantrel::weighted_sum(refl, weights); }
 
     const Operand &paper;
     vantrel::Bands weights;
@@ -249,9 +255,9 @@ private:
     if (!is_spectrum(o[0]) || !is_paper(o[1]) || !is_same_filter(o[2], o[3]))
         return false;
     const Densities density(o[1], static_cast<int>(integer(o[2])), static_cast<int>(integer(o[3])));
-    each_batch(rows, [&](const Batch &batch) {
-        store(o[4], batch, density(spectra(o[0], batch), batch));
-    });
+    each_batch(
+        rows, [&](const Batch &batch) { return density.sums(spectra(o[0], batch), batch); },
+        [&](const Batch &batch, const auto &sums) { store(o[4], batch, density(sums)); });
     return true;
 }
 
@@ -268,7 +274,7 @@ private:
         const Bands refl = spectra(o[0], batch);
         for (int response = VISUAL_RESPONSE; response < NUM_RESPONSES; ++response) {
             const auto &density = densities[response];
-            store(o[3], batch, density ? (*density)(refl, batch) : V(0), response);
+            store(o[3], batch, density ? (*density)(density->sums(refl, batch)) : V(0), response);
         }
     });
     return true;
@@ -316,15 +322,19 @@ template <class F> bool dot_areas(const Operand *o, npy_intp rows, F store_area)
         !is_same_filter(o[3], o[4]) || !is_same(o[5]) || number(o[5]) == 0)
         return false;
     const Densities density(o[2], static_cast<int>(integer(o[3])), static_cast<int>(integer(o[4])));
-    const auto absorbed = [&](const Operand &patch, const Batch &batch) {
-        return vantrel::absorptance(density(spectra(patch, batch), batch), number(o[5]));
+    const auto absorbed = [&](const Densities::Sums &of) {
+        return vantrel::absorptance(density(of), number(o[5]));
     };
     const bool same = is_same(o[0]) && (!o[2].size() || is_same(o[2]));
-    const V solid = absorbed(o[0], {0, 0});
-    each_batch(rows, [&](const Batch &batch) {
-        store_area(batch, vantrel::absorbed_area(same ? solid : absorbed(o[0], batch),
-                                                 absorbed(o[1], batch)));
-    });
+    const V solid = absorbed(density.sums(spectra(o[0], {0, 0}), {0, 0}));
+    each_batch(
+        rows, [&](const Batch &batch) { return density.sums(spectra(o[1], batch), batch); },
+        [&](const Batch &batch, const Densities::Sums &tint) {
+            store_area(batch,
+                       vantrel::absorbed_area(
+                           same ? solid : absorbed(density.sums(spectra(o[0], batch), batch)),
+                           absorbed(tint)));
+        });
     return true;
 }
 
