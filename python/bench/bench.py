@@ -67,9 +67,9 @@ def colorimetry(c):
     shape = colour.SpectralShape(400, 700, 10)
     observer = colour.MSDS_CMFS["CIE 1931 2 Degree Standard Observer"].copy().align(shape)
     d50 = colour.SDS_ILLUMINANTS["D50"].copy().align(shape)
-    for rows in 10_000, 1_000_000:
+    for rows in 10_000, 100_000, 1_000_000:
         spectra, out = RANDOM.uniform(1, 99, (rows, 31)), np.empty((rows, 3))
-        rounds = 101 if rows < 100_000 else 11
+        rounds = max(11, 1_000_000 // rows + 1)
         name = f"`refl_to_xyz`, {rows:,} spectra"
         report(
             name,
@@ -77,7 +77,7 @@ def colorimetry(c):
             lambda: vantrel.refl_to_xyz(spectra, "D50_2DEG"),
             "colour-science, `msds_to_XYZ_integration`",
             lambda: colour.colorimetry.msds_to_XYZ_integration(spectra, observer, d50, shape=shape),
-            0.25,
+            0.2,
             rounds,
         )
         if rows < 100_000:

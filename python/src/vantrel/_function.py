@@ -3,6 +3,8 @@
 import functools
 import inspect
 
+import numpy as np
+
 from . import _ufuncs
 from ._arguments import library_of
 from ._dask import on_dask
@@ -78,13 +80,17 @@ def function(*outputs):
 
         @functools.wraps(declaration)
         def call(*args, out=None, ok=False, **kwargs):
-            if out is None and ok is False and not kwargs and plain:
-                values = declared.prepare_again(args)
-                if values is not None:
-                    return declared.ufunc(*values)
             if ok and declared.flagged is None:
                 raise TypeError(f"{declared.name}() refuses no row and has no ok=")
-            values = declared.prepare(declared.bind(args, kwargs))
+            if kwargs:
+                args = declared.bind(args, kwargs)
+            if plain and (out is None or type(out) is np.ndarray):
+                values = declared.prepare_again(args)
+                if values is not None:
+                    if out is None and not ok:
+                        return declared.ufunc(*values)
+                    return evaluate(declared.name, bool(ok), *values, out=out)
+            values = declared.prepare(declared.bind(args, {}))
             return _dispatch(declared, *values, ok=bool(ok), out=out)
 
         keywords = {"out": None, "ok": False}
