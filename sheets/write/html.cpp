@@ -7,20 +7,16 @@ namespace vantrel::sheets {
 namespace {
 
 // JSON as the text of a script element: no sequence in it ends the element or opens a comment, and
-// no space stands between its tokens. `<`, U+2028 and U+2029 occur in strings alone. Each piece of
-// the document ends outside of its strings.
+// no space stands between its tokens. `<` occurs in strings alone. Each piece of the document ends
+// outside of its strings.
 std::string script_data(std::string_view json)
 {
     std::string out;
     bool in_string = false;
     for (std::size_t i = 0; i < json.size(); ++i) {
         const char c = json[i];
-        const std::string_view next3 = json.substr(i, 3);
         if (c == '<') {
             out += "\\u003c";
-        } else if (next3 == "\u2028" || next3 == "\u2029") {
-            out += next3 == "\u2028" ? "\\u2028" : "\\u2029";
-            i += 2;
         } else if (in_string && c == '\\') {
             out += json.substr(i, 2);
             ++i;
