@@ -31,10 +31,11 @@
  *   of threads at once, as long as no thread calls a `Set…Constants` function (or writes
  *   #den_weight) meanwhile.
  * - Arithmetic runs in the rounding mode of the caller and changes neither the mode nor what is
- *   trapped. Under another mode than to nearest, results agree to ten places (in single precision
- *   to six, a polarisation intercept to eight), and a value that is rounded, cut or compared may
- *   fall to the other side. Infinities and not-a-numbers come
- *   out of divisions by zero, logarithms of zero and overflows on purpose: a host that has these
+ *   trapped. Under another mode than to nearest, results agree to ten places (ΔE00 and ΔE CMC to
+ *   1e-8, single precision to six places, a polarisation intercept to eight), and a value that is
+ *   rounded, cut or compared may fall to the other side. Where subnormal numbers are flushed to
+ *   zero, results below 1e-150 alone may change. Infinities and not-a-numbers come out of
+ *   divisions by zero, logarithms of zero and overflows on purpose: a host that has these
  *   exceptions trapped must mask them around a call.
  * - A host may define functions with these names itself: the library calls none of its own by an
  *   exported name.

@@ -21,7 +21,7 @@ double log10(double x);
 double exp(double x);
 double exp10(double x);
 
-/// x^y for an exponent y within 1e-8 of 1/3.
+/// x^y for an exponent y within 4e-9 of 1/3.
 double near_cube_root(double x, double y);
 
 /// Sine and cosine of any angle in radians.

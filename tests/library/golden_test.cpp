@@ -94,23 +94,41 @@ TEST(Golden, EveryLine)
 // is in single precision sooner, or the other branch where two meet (those of L* to 0.00001).
 TEST(Golden, AnotherRoundingModeChangesLastPlaces)
 {
-    const std::map<std::string, double> sooner = {
-        {"CalcLabch", 1e-6}, {"ReflToPolIntercept", 1e-8}, {"XYZToCIELab", 1e-5}};
-    for (GoldenCase &golden : one_good_call_each()) {
-        SCOPED_TRACE(golden.where + " " + golden.function->name);
-        const auto found = sooner.find(golden.function->name);
-        const double places = found == sooner.end() ? 1e-10 : found->second;
-        std::vector<Slot> upward = golden.slots;
-        const double result = golden.function->call(golden.slots);
-        std::fesetround(FE_UPWARD);
-        const double upward_result = golden.function->call(upward);
-        EXPECT_EQ(std::fegetround(), FE_UPWARD);
-        std::fesetround(FE_TONEAREST);
-        EXPECT_PRED3(agrees, upward_result, result, places * std::fmax(1, std::fabs(result)));
-        for (std::size_t i = 0; i < upward.size(); ++i)
-            for (std::size_t e = 0; e < upward[i].values.size(); ++e)
-                EXPECT_PRED3(agrees, upward[i].values[e], golden.slots[i].values[e],
-                             places * std::fmax(1, std::fabs(golden.slots[i].values[e])));
+    const std::map<std::string, double> sooner = {{"CalcLabch", 1e-6},
+                                                  {"CIEDE2000::Calculate", 1e-8},
+                                                  {"LabToDE2000Ex", 1e-8},
+                                                  {"ReflToPolIntercept", 1e-8},
+                                                  {"XYZToCIELab", 1e-5}};
+    for (const int mode : {FE_UPWARD, FE_DOWNWARD, FE_TOWARDZERO})
+        for (GoldenCase &golden : one_good_call_each()) {
+            SCOPED_TRACE(golden.where + " " + golden.function->name);
+            const auto found = sooner.find(golden.function->name);
+            const double places = found == sooner.end() ? 1e-10 : found->second;
+            std::vector<Slot> otherwise = golden.slots;
+            const double result = golden.function->call(golden.slots);
+            std::fesetround(mode);
+            const double other_result = golden.function->call(otherwise);
+            EXPECT_EQ(std::fegetround(), mode);
+            std::fesetround(FE_TONEAREST);
+            EXPECT_PRED3(agrees, other_result, result, places * std::fmax(1, std::fabs(result)));
+            for (std::size_t i = 0; i < otherwise.size(); ++i)
+                for (std::size_t e = 0; e < otherwise[i].values.size(); ++e)
+                    EXPECT_PRED3(agrees, otherwise[i].values[e], golden.slots[i].values[e],
+                                 places * std::fmax(1, std::fabs(golden.slots[i].values[e])));
+        }
+
+    // A quarter turn that is rounded up or down leaves an angle of up to another one.
+    for (double h = 0; h < 6.3; h += 0.01) {
+        const CIELABCOORD first = {50, 60 * std::cos(h), 60 * std::sin(h)},
+                          second = {51, 58 * std::cos(h), 58 * std::sin(h + 0.02)};
+        double nearest = 0, other = 0;
+        LabToDE2000(&first, &second, 1, 1, &nearest);
+        for (const int mode : {FE_UPWARD, FE_DOWNWARD, FE_TOWARDZERO}) {
+            std::fesetround(mode);
+            LabToDE2000(&first, &second, 1, 1, &other);
+            std::fesetround(FE_TONEAREST);
+            EXPECT_NEAR(other, nearest, 1e-8);
+        }
     }
 }
 
