@@ -26,7 +26,7 @@ namespace {
 using vantrel::Lanes;
 
 /// The exponents near a third that the library takes.
-constexpr double kThirds[] = {0.333333333333, 0.33333333};
+constexpr double kThirds[] = {0.333333333333, 0.3333333333, 0.33333333};
 
 using Point = std::array<double, 2>;
 using Exact = void (*)(mpfr_t, mpfr_t, mpfr_t);
@@ -130,10 +130,15 @@ std::vector<Function> functions()
          near_third<0>,
          ALL_WIDTHS(near_cube_root(x, kThirds[0])),
          {uniform(0, 100), positive(-1074, 1023)}},
-        {"near_cube_root (8 decimals)",
+        {"near_cube_root (10 decimals)",
          0.75,
          near_third<1>,
          ALL_WIDTHS(near_cube_root(x, kThirds[1])),
+         {uniform(0, 2), positive(-1074, 1023)}},
+        {"near_cube_root (8 decimals)",
+         0.75,
+         near_third<2>,
+         ALL_WIDTHS(near_cube_root(x, kThirds[2])),
          {uniform(0.5, 4), positive(-1074, 1023)}},
         {"sin",
          0.75,
