@@ -2,6 +2,7 @@
 
 #include "judge/colour.h"
 #include "judge/densitometer.h"
+#include "judge/zones.h"
 
 #include <fmt/format.h>
 
@@ -10,9 +11,12 @@
 namespace vantrel::sheets {
 namespace {
 
-constexpr double kThinnest = 0.5, kThickest = 2;
+constexpr double kThinnest = 0.25, kThickest = 4;
 constexpr double kStep = 0.01;
 constexpr double kExact = 1e-5;
+// A change at the press is worth it that takes away so much of ΔE00, and this share of it.
+constexpr double kLeast = 0.5, kLeastShare = 0.2;
+constexpr double kReached = 2; // ΔE00, from which on the hue is off
 
 Spectrum film(const Spectrum &solid, double thickness, const Spectrum &paper)
 {
@@ -44,14 +48,22 @@ template <typename Function> double minimum(Function f, double low, double high)
 
 std::string advice_from() { return fmt::format("{} {}", kAdviceFrom, kAdviceElse); }
 
+std::string name_of(const SolidAdvice &advice) { return name_of_mean(advice.patch, advice.count); }
+
 std::string_view words_of(const Advice &advice)
 {
-    constexpr double near_enough = 0.5; // ΔE00
-    if (advice.de00 < near_enough)
+    if (advice.de00 < kLeast)
         return "on its aim";
-    if (!advice.reaches_aim())
-        return "hue is off: ink, paper or trapping, not density";
-    return advice.density_change > 0 ? "more ink" : "less ink";
+    if (advice.thickness < kThinnest + kStep / 2 || advice.thickness > kThickest - kStep / 2)
+        return "still off at the end of the films tried, 1/4 to 4 times this one";
+    const double gained = advice.de00 - advice.de00_after;
+    const bool worth = gained >= std::fmax(kLeast, kLeastShare * advice.de00);
+    const bool more = advice.density_change > 0;
+    if (advice.de00_after <= kReached)
+        return !worth ? "nothing to gain by density" : more ? "more ink" : "less ink";
+    return !worth ? "hue is off: ink, paper or trapping, not density"
+           : more ? "hue is off: ink, paper or trapping; more ink mends a part"
+                  : "hue is off: ink, paper or trapping; less ink mends a part";
 }
 
 std::optional<Advice> advise(const Spectrum &solid, const Spectrum &paper, const CIELABCOORD &aim,
@@ -77,6 +89,8 @@ std::optional<Advice> advise(const Spectrum &solid, const Spectrum &paper, const
                          densitometer.density(solid, *response);
     out.de00 = delta_e00(aim, lab_of(solid, illuminant));
     out.de00_after = to_aim(out.thickness);
+    if (out.de00_after > out.de00) // the model has no film that is as the solid was printed
+        out = {.thickness = 1, .density_change = 0, .de00 = out.de00, .de00_after = out.de00};
     return out;
 }
 

@@ -3,6 +3,7 @@
 
 #include "read/measurement.h"
 
+#include <cstddef>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -14,11 +15,6 @@ struct Advice {
     double density_change = 0; // in the response that reads the solid
     double de00 = 0;           // to the aim, as printed
     double de00_after = 0;     // with this film
-
-    // Whether ink alone brings it there: otherwise the hue is off by ink, paper or trapping.
-    bool reaches_aim() const { return de00_after <= kReached; }
-
-    static constexpr double kReached = 2; // ΔE00
 };
 
 // How far the model can be trusted, in two lines.
@@ -29,17 +25,21 @@ inline constexpr std::string_view kAdviceElse = "and off by up to 0.6 where it d
 
 std::string advice_from(); // both
 
-// "more ink", "less ink", "on its aim", or why ink does not bring it there.
+// "more ink", "less ink", "on its aim", or why ink does not bring it there. Where the nearest film
+// is farther than ΔE00 2 the hue is off by ink, paper or trapping; ink is changed where that takes
+// away ΔE00 0.5 and a fifth of the difference at the least.
 std::string_view words_of(const Advice &advice);
 
 struct SolidAdvice {
     std::string ink;
     Advice advice;
-    std::string patch{}; // the solid; empty for the mean of its zones
+    std::string patch{};   // the solid, of several the first
+    std::size_t count = 1; // of which this is for the mean
 };
+std::string name_of(const SolidAdvice &advice); // "M100 (mean of 6)"
 
-// The film of this ink on this paper that comes nearest to the aim, between half and twice as thick
-// as it was printed; EstimateReflsForThickness(). Nothing where no response reads the solid.
+// The film of this ink on this paper that comes nearest to the aim, a quarter to four times as
+// thick as it was printed; EstimateReflsForThickness(). Nothing where no response reads the solid.
 std::optional<Advice> advise(const Spectrum &solid, const Spectrum &paper, const CIELABCOORD &aim,
                              ILLUM_OBS illuminant, int status);
 

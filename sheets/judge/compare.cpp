@@ -6,6 +6,7 @@
 #include "judge/inks.h"
 #include "judge/repeats.h"
 #include "judge/substrate.h"
+#include "judge/zones.h"
 #include "read/text.h"
 
 #include <fmt/format.h>
@@ -20,14 +21,6 @@ namespace vantrel::sheets {
 namespace {
 
 constexpr std::size_t kMostWorst = 10;
-
-// One of the two sheets.
-struct JudgedSheet {
-    const Measurement &measurement;
-    Paper paper;
-
-    bool has_spectra() const { return measurement.kind != Kind::colours; }
-};
 
 // What all pairs are judged by.
 struct Terms {
@@ -249,20 +242,26 @@ std::vector<Unpaired> unpaired_of(const Measurement &sheet, const std::vector<st
     return out;
 }
 
-std::vector<SolidAdvice> advice_of(const std::vector<PairReport> &pairs,
-                                   const std::vector<ControlPatch> &controls,
+// For the mean of the solids of each ink, in the order of the reference.
+std::vector<SolidAdvice> advice_of(const std::vector<ControlPatch> &controls,
+                                   const std::vector<Pair> &pairs, const JudgedSheet &references,
                                    const JudgedSheet &samples, const Terms &terms)
 {
     require_paper(samples.paper.choice, samples.measurement.file, "--advice");
-    std::vector<SolidAdvice> out;
-    for (std::size_t i = 0; i < pairs.size(); ++i) {
-        const ControlPatch &control = controls[i];
-        if (control.inks.size() != 1 || control.inks[0].second != 100 || !pairs[i].sample.refl)
+    std::map<Pair, SolidAdvice> in_order;
+    for (const auto &[ink, places] : solids_of(controls, pairs)) {
+        const Patch aim = mean_of(references.measurement, places.reference, terms.illuminant).patch,
+                    solid = mean_of(samples.measurement, places.sample, terms.illuminant).patch;
+        if (!samples.has_spectra())
             continue;
-        if (const auto advice = advise(*pairs[i].sample.refl, samples.paper.refl, control.aim,
+        if (const auto advice = advise(solid.refl, samples.paper.refl,
+                                       lab_of(references.measurement, aim, terms.illuminant),
                                        terms.illuminant, terms.request.status))
-            out.push_back({ink_title(control.inks[0].first), *advice, control.name});
+            in_order[places] = {ink_title(ink), *advice, solid.name, places.sample.size()};
     }
+    std::vector<SolidAdvice> out;
+    for (auto &[places, advice] : in_order)
+        out.push_back(std::move(advice));
     return out;
 }
 
@@ -287,9 +286,11 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
     const IlluminantChoice illuminant =
         illuminant_for(request.illuminant, {&reference, &sample}, warnings);
     warn_of_conditions(reference, sample, warnings);
-    const JudgedSheet references{reference,
-                                 paper_of(reference, request.paper, illuminant, warnings)};
-    const JudgedSheet samples{sample, paper_of(sample, request.paper, illuminant, warnings)};
+    const JudgedSheet references{
+        reference, paper_of(reference, request.paper, illuminant, warnings), zones_of(reference)};
+    const JudgedSheet samples{sample, paper_of(sample, request.paper, illuminant, warnings),
+                              request.sample_zones.empty() ? zones_of(sample)
+                                                           : request.sample_zones};
     const Terms terms{request, illuminant.illuminant,
                       request.second_illuminant.value_or(usual_second(illuminant.illuminant))};
     const Pairs pairs = pairs_of(reference, sample, request.pairing, warnings);
@@ -306,6 +307,7 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
                    .metrics = request.metrics,
                    .tolerance = request.tolerance,
                    .pairs = {},
+                   .left_out = {},
                    .statistics = {},
                    .reference_means = {},
                    .sample_means = {},
@@ -336,12 +338,13 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
     }
     warn_of_papers(out);
     const std::vector<ControlPatch> controls =
-        control_patches(out.pairs, references.paper, samples.paper, illuminant.illuminant,
-                        request.status, reference.collection);
-    out.tones = tones_of(controls);
-    out.greys = greys_of(out.pairs, controls, references.paper, samples.paper, request.status);
+        control_patches(out.pairs, pairs.matched, references, samples, illuminant.illuminant,
+                        request.status, out.warnings);
+    out.tones = tones_of(controls, pairs.matched);
+    out.greys = greys_of(controls, pairs.matched, references, samples, illuminant.illuminant,
+                         request.status);
     if (request.advice)
-        out.advice = advice_of(out.pairs, controls, samples, terms);
+        out.advice = advice_of(controls, pairs.matched, references, samples, terms);
     if (request.advice && out.advice.empty())
         out.warnings.push_back(
             fmt::format("{}: no solid of one ink has a spectrum and an aim, so there is no advice",

@@ -31,8 +31,9 @@ struct CompareRequest {
     std::optional<double> tolerance;
     Tolerances tolerances; // none where it has no limits
     bool substrate_corrected = false;
-    bool advice = false; // for the solids of the sample
-    std::string paper;   // of both sheets, as paper_of() takes it
+    bool advice = false;             // for the solids of the sample
+    std::string paper;               // of both sheets, as paper_of() takes it
+    std::vector<int> sample_zones{}; // of the sample's patches; by their names where it is empty
     Tell tell{};
 };
 

@@ -3,9 +3,9 @@
 #include "judge/densitometer.h"
 #include "judge/inks.h"
 #include "judge/tone_value.h"
+#include "judge/zones.h"
 
 #include <algorithm>
-#include <map>
 
 namespace vantrel::sheets {
 namespace {
@@ -42,83 +42,119 @@ ControlPatch control_patch(const PairReport &pair, const Paper &reference_paper,
     return out;
 }
 
-using InkPairs = std::vector<const PairReport *>;
-
-// The mean of the spectra of one side; nothing where one has none.
-std::optional<Spectrum> mean_of(const InkPairs &pairs, Side PairReport::*side)
-{
-    Spectrum mean{};
-    for (const PairReport *pair : pairs) {
-        const std::optional<Spectrum> &refl = (pair->*side).refl;
-        if (!refl)
-            return std::nullopt;
-        for (int band = 0; band < VANTREL_BANDS; ++band)
-            mean[band] += (*refl)[band] / static_cast<double>(pairs.size());
+// Reads the tints of one sheet, each beside the solid of its zone.
+class Tones {
+public:
+    Tones(const JudgedSheet &sheet, std::vector<std::size_t> Pair::*side, ILLUM_OBS illuminant,
+          int status)
+        : sheet(sheet), side(side), illuminant(illuminant), densitometer(sheet.paper.refl, status)
+    {
     }
-    return mean;
-}
 
-// Of the mean spectrum, or of one of the patches where there are no spectra.
-CIELABCOORD solid_lab(const std::optional<Spectrum> &mean, const InkPairs &pairs,
-                      Side PairReport::*side, ILLUM_OBS illuminant)
-{
-    return mean ? lab_of(*mean, illuminant) : (pairs.front()->*side).colour.lab;
-}
+    void set_solids(const std::vector<ControlPatch> &controls, const std::vector<Pair> &pairs)
+    {
+        for (const auto &[ink, pair] : solids_of(controls, pairs))
+            solids.emplace(ink, by_zone(sheet.measurement, pair.*side, sheet.zones, illuminant));
+    }
 
-// Negative where a tint prints too light.
-std::optional<double> gain_of(const std::optional<Spectrum> &solid, const Side &tint,
-                              double nominal, const Paper &paper, int status)
-{
-    if (!solid || !tint.refl || !paper.choice.exists())
-        return std::nullopt;
-    const auto area = Densitometer(paper.refl, status).dot_area(*solid, *tint.refl, 1);
-    return area ? std::optional(*area - nominal) : std::nullopt;
-}
+    // By density, less the nominal value: negative where a tint prints too light.
+    std::optional<double> gain(const ControlPatch &tint, const Pair &pair)
+    {
+        const auto area = read(tint, pair, [&](const Patch &solid, const Patch &patch) {
+            return sheet.has_spectra() ? densitometer.dot_area(solid.refl, patch.refl, 1)
+                                       : std::nullopt;
+        });
+        return area ? std::optional(*area - tint.inks[0].second) : std::nullopt;
+    }
+
+    std::optional<double> sctv(const ControlPatch &tint, const Pair &pair)
+    {
+        return read(tint, pair, [&](const Patch &solid, const Patch &patch) {
+            return spot_colour_tone_value(lab_of(sheet.paper, illuminant),
+                                          lab_of(sheet.measurement, solid, illuminant),
+                                          lab_of(sheet.measurement, patch, illuminant));
+        });
+    }
+
+    void warn(std::vector<std::string> &warnings) const
+    {
+        warn_of_solids(sheet.measurement.file, lacking, warnings);
+    }
+
+private:
+    // The mean over the zones.
+    template <typename Read>
+    std::optional<double> read(const ControlPatch &tint, const Pair &pair, Read read)
+    {
+        const std::string &ink = tint.inks[0].first;
+        const auto found = solids.find(ink);
+        if (found == solids.end() || !sheet.paper.choice.exists())
+            return std::nullopt;
+        Zones tints = by_zone(sheet.measurement, pair.*side, sheet.zones, illuminant);
+        if (tints.each.empty())
+            tints.each.emplace(0, tints.all.patch);
+        double sum = 0, count = 0;
+        for (const auto &[zone, patch] : tints.each) {
+            const Patch *solid = found->second.in(zone);
+            if (!solid)
+                lacking[ink].insert(zone);
+            else if (const std::optional<double> value = read(*solid, patch)) {
+                sum += *value;
+                ++count;
+            }
+        }
+        return count > 0 ? std::optional(sum / count) : std::nullopt;
+    }
+
+    const JudgedSheet &sheet;
+    std::vector<std::size_t> Pair::*side;
+    ILLUM_OBS illuminant;
+    Densitometer densitometer;
+    std::map<std::string, Zones> solids; // of each ink
+    LackingSolids lacking;
+};
 
 } // namespace
 
-std::vector<ControlPatch> control_patches(const std::vector<PairReport> &pairs,
-                                          const Paper &reference_paper, const Paper &sample_paper,
-                                          ILLUM_OBS illuminant, int status, bool collection)
+std::map<std::string, Pair> solids_of(const std::vector<ControlPatch> &controls,
+                                      const std::vector<Pair> &pairs)
+{
+    std::map<std::string, JoinedPairs> solids;
+    for (std::size_t i = 0; i < pairs.size(); ++i)
+        if (is_solid(controls[i]))
+            solids[controls[i].inks[0].first].add(pairs[i]);
+    std::map<std::string, Pair> out;
+    for (const auto &[ink, joined] : solids)
+        out.emplace(ink, joined.pair());
+    return out;
+}
+
+std::vector<ControlPatch> control_patches(const std::vector<PairReport> &reports,
+                                          const std::vector<Pair> &pairs,
+                                          const JudgedSheet &references, const JudgedSheet &samples,
+                                          ILLUM_OBS illuminant, int status,
+                                          std::vector<std::string> &warnings)
 {
     std::vector<ControlPatch> out;
-    std::map<std::string, InkPairs> solids; // of each ink
-    for (const PairReport &pair : pairs) {
-        out.push_back(control_patch(pair, reference_paper, collection));
-        if (is_solid(out.back()))
-            solids[out.back().inks[0].first].push_back(&pair);
-    }
-    struct Solid {
-        std::optional<Spectrum> aim, sample;
-        CIELABCOORD aim_lab, lab;
-    };
-    std::map<std::string, Solid> means;
-    for (const auto &[ink, all] : solids) {
-        const auto aim = mean_of(all, &PairReport::reference),
-                   sample = mean_of(all, &PairReport::sample);
-        means[ink] = {aim, sample, solid_lab(aim, all, &PairReport::reference, illuminant),
-                      solid_lab(sample, all, &PairReport::sample, illuminant)};
-    }
+    for (const PairReport &pair : reports)
+        out.push_back(control_patch(pair, references.paper, references.measurement.collection));
+    Tones aims(references, &Pair::reference, illuminant, status),
+        tones(samples, &Pair::sample, illuminant, status);
+    aims.set_solids(out, pairs);
+    tones.set_solids(out, pairs);
     for (std::size_t i = 0; i < pairs.size(); ++i) {
         ControlPatch &tint = out[i];
         if (!is_tint(tint))
             continue;
-        const auto &[ink, nominal] = tint.inks[0];
-        const auto found = means.find(ink);
-        if (found == means.end())
+        tint.aim_gain = aims.gain(tint, pairs[i]);
+        tint.gain = tones.gain(tint, pairs[i]);
+        if (is_process_ink(ink_title(tint.inks[0].first)))
             continue;
-        const Solid &solid = found->second;
-        tint.aim_gain = gain_of(solid.aim, pairs[i].reference, nominal, reference_paper, status);
-        tint.gain = gain_of(solid.sample, pairs[i].sample, nominal, sample_paper, status);
-        if (is_process_ink(ink_title(ink)))
-            continue;
-        if (reference_paper.choice.exists())
-            tint.aim_sctv = spot_colour_tone_value(lab_of(reference_paper, illuminant),
-                                                   solid.aim_lab, tint.aim);
-        if (sample_paper.choice.exists())
-            tint.sctv =
-                spot_colour_tone_value(lab_of(sample_paper, illuminant), solid.lab, tint.lab);
+        tint.aim_sctv = aims.sctv(tint, pairs[i]);
+        tint.sctv = tones.sctv(tint, pairs[i]);
     }
+    aims.warn(warnings);
+    tones.warn(warnings);
     return out;
 }
 

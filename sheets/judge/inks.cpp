@@ -83,9 +83,10 @@ Inks::Inks(const Measurement &sheet, const std::vector<std::string> &order) : sh
     for (std::size_t i = 0; i < sheet.patches.size(); ++i)
         if (const auto ink = ink_of_solid(sheet.patches[i]))
             places[*ink].push_back(i);
+    const std::vector<int> zones = zones_of(sheet);
     for (const std::vector<std::size_t> &some : places)
         solids.push_back(some.empty() ? std::nullopt
-                                      : std::optional(mean_of(sheet, some, D50_2DEG)));
+                                      : std::optional(by_zone(sheet, some, zones, D50_2DEG)));
 }
 
 bool Inks::names_are_tints() const

@@ -1,7 +1,7 @@
 // Which inks a patch was printed with, as its device values tell.
 #pragma once
 
-#include "judge/repeats.h"
+#include "judge/zones.h"
 #include "read/measurement.h"
 
 #include <cstddef>
@@ -52,12 +52,11 @@ public:
     // The mean of the ink's solids, under the name of the first; null where there is none.
     const Patch *solid(std::size_t ink) const
     {
-        return solids[ink] ? &solids[ink]->patch : nullptr;
+        return solids[ink] ? &solids[ink]->all.patch : nullptr;
     }
-    std::size_t count_of_solids(std::size_t ink) const
-    {
-        return solids[ink] ? solids[ink]->count : 0;
-    }
+
+    // With the solid of each zone; nothing where there is none.
+    const std::optional<Zones> &solids_of(std::size_t ink) const { return solids[ink]; }
 
     // The ink of which a patch is a solid; nothing where it is none.
     std::optional<std::size_t> ink_of_solid(const Patch &patch) const;
@@ -73,7 +72,7 @@ private:
     bool ramp = false; // by the names of the patches
     std::vector<std::string> fields;
     std::map<std::string, std::size_t> numbers; // of the fields, in the order of printing
-    std::vector<std::optional<Repeats>> solids; // of each ink
+    std::vector<std::optional<Zones>> solids;   // of each ink
 };
 
 } // namespace vantrel::sheets

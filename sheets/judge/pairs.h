@@ -5,6 +5,7 @@
 
 #include <array>
 #include <cstddef>
+#include <set>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -27,6 +28,23 @@ struct PairingRequest {
 // An aim and what was measured for it: places in the two sheets, of several their mean.
 struct Pair {
     std::vector<std::size_t> reference, sample;
+
+    friend auto operator<=>(const Pair &, const Pair &) = default;
+};
+
+// The places of several pairs, each once.
+struct JoinedPairs {
+    std::set<std::size_t> reference, sample;
+
+    void add(const Pair &pair)
+    {
+        reference.insert(pair.reference.begin(), pair.reference.end());
+        sample.insert(pair.sample.begin(), pair.sample.end());
+    }
+    Pair pair() const
+    {
+        return {{reference.begin(), reference.end()}, {sample.begin(), sample.end()}};
+    }
 };
 
 // What came of a key.

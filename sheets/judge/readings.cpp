@@ -5,6 +5,7 @@
 #include "judge/inks.h"
 #include "judge/repeats.h"
 #include "judge/tone_value.h"
+#include "judge/zones.h"
 #include "read/labels.h"
 
 #include <fmt/format.h>
@@ -42,8 +43,7 @@ const Row &row_of(Attribute attribute) { return kAttributes[static_cast<std::siz
 // The patches of one combination of inks.
 struct Printed {
     std::vector<std::size_t> places;
-    Spectrum mean{};
-    std::map<int, Spectrum> zones;
+    Zones zones{};
     const ControlPatch *control = nullptr; // the mean beside its aim
     std::optional<int> response;           // that reads it
 };
@@ -101,11 +101,8 @@ AllPrinted printed_on(const Zoned &zoned, const Inks &inks, const Comparison &co
         if (const auto tints = inks.tints_of(sheet.patches[i]))
             out[*tints].places.push_back(i);
     for (auto &[tints, printed] : out) {
-        printed.mean = mean_of(sheet, printed.places, comparison.illuminant).patch.refl;
-        printed.response = densitometer.response(printed.mean);
-        for (const std::size_t place : printed.places)
-            if (zoned.zones[place] > 0)
-                printed.zones.emplace(zoned.zones[place], sheet.patches[place].refl);
+        printed.zones = by_zone(sheet, printed.places, zoned.zones, comparison.illuminant);
+        printed.response = densitometer.response(printed.zones.all.patch.refl);
     }
     for (std::size_t i = 0; i < controls.size(); ++i) {
         const auto tints = inks.tints_of(sheet.patches[zoned.pairs.matched[i].sample.front()]);
@@ -113,7 +110,7 @@ AllPrinted printed_on(const Zoned &zoned, const Inks &inks, const Comparison &co
             continue;
         Printed &printed = out[*tints];
         printed.control = &controls[i];
-        printed.mean = comparison.pairs[i].sample.refl.value();
+        printed.zones.all.patch.refl = comparison.pairs[i].sample.refl.value();
         if (comparison.pairs[i].response)
             printed.response = comparison.pairs[i].response;
     }
@@ -152,29 +149,57 @@ public:
     std::vector<ZoneReading> readings;
 
 private:
-    // Of the mean where the sheet has no such patch in this zone, null where it has none at all.
+    // Null where the sheet has no such patch, or the zone lacks the one that others have.
     const Spectrum *find(const Tints &tints, int zone) const
     {
         const auto found = all.find(tints);
-        if (found == all.end())
-            return nullptr;
-        const auto in_zone = found->second.zones.find(zone);
-        return in_zone == found->second.zones.end() ? &found->second.mean : &in_zone->second;
+        const Patch *patch = found == all.end() ? nullptr : found->second.zones.in(zone);
+        return patch ? &patch->refl : nullptr;
     }
 
-    // `read` gives what a spectrum reads in a zone, 0 for the mean of all.
+    // `read` gives what a spectrum reads in a zone, 0 for the mean of all, which is the value.
     template <typename Read>
     void add(const Measurand &measurand, const Printed &printed, std::optional<double> aim,
              Read read)
     {
-        const std::optional<double> value = read(printed.mean, 0);
+        const std::optional<double> value = read(printed.zones.all.patch.refl, 0);
         if (!value || !std::isfinite(*value))
             return;
         ZoneReading reading{.measurand = measurand, .value = *value, .aim = aim};
-        for (const auto &[zone, refl] : printed.zones)
-            if (const std::optional<double> own = read(refl, zone); own && std::isfinite(*own))
+        for (const auto &[zone, patch] : printed.zones.each)
+            if (const std::optional<double> own = read(patch.refl, zone);
+                own && std::isfinite(*own))
                 reading.zones[zone] = *own;
         readings.push_back(std::move(reading));
+    }
+
+    using Beside = std::vector<const Spectrum *>;
+
+    // The same of what is read beside the solid of the zone: the value is the mean over the zones.
+    // `read` takes the solids of these inks, and gives nothing where one is null.
+    template <typename Read>
+    void add_beside(const std::vector<Tints> &solids, const Measurand &measurand,
+                    const Printed &printed, std::optional<double> aim, Read read)
+    {
+        const std::size_t before = readings.size();
+        add(measurand, printed, aim, [&](const Spectrum &refl, int zone) -> std::optional<double> {
+            Beside beside;
+            for (const Tints &solid : solids)
+                if (const Spectrum *found = find(solid, zone))
+                    beside.push_back(found);
+            return beside.size() == solids.size() ? read(refl, beside) : std::nullopt;
+        });
+        if (readings.size() == before || printed.zones.each.empty())
+            return;
+        ZoneReading &reading = readings.back();
+        if (reading.zones.empty()) { // no zone has a solid
+            readings.pop_back();
+            return;
+        }
+        double sum = 0;
+        for (const auto &[zone, value] : reading.zones)
+            sum += value;
+        reading.value = sum / static_cast<double>(reading.zones.size());
     }
 
     void add_solid(const Tints &tints, const Printed &printed)
@@ -189,8 +214,8 @@ private:
 
     void add_tint(const Tints &tints, const Printed &printed)
     {
-        const Tints solid = {{tints[0].ink, 100}};
-        if (!find(solid, 0) || !is_shown(tints[0]))
+        const std::vector<Tints> solid = {{{tints[0].ink, 100}}};
+        if (!is_shown(tints[0]))
             return;
         const std::string ink = title_of(tints[0]);
         const double nominal = tints[0].percent;
@@ -198,24 +223,24 @@ private:
             std::optional<double> aim;
             if (printed.control && printed.control->aim_gain)
                 aim = nominal + *printed.control->aim_gain;
-            add({Attribute::tone_value, ink, nominal}, printed, aim,
-                [&](const Spectrum &refl, int zone) {
-                    return densitometer.dot_area(*find(solid, zone), refl, 1);
-                });
+            add_beside(solid, {Attribute::tone_value, ink, nominal}, printed, aim,
+                       [&](const Spectrum &refl, const Beside &beside) {
+                           return densitometer.dot_area(*beside[0], refl, 1);
+                       });
         } else {
-            add({Attribute::tone_value, ink, nominal, true}, printed,
-                printed.control ? printed.control->aim_sctv : std::nullopt,
-                [&](const Spectrum &refl, int zone) {
-                    return spot_colour_tone_value(lab_of(paper, illuminant),
-                                                  lab_of(*find(solid, zone), illuminant),
-                                                  lab_of(refl, illuminant));
-                });
+            add_beside(solid, {Attribute::tone_value, ink, nominal, true}, printed,
+                       printed.control ? printed.control->aim_sctv : std::nullopt,
+                       [&](const Spectrum &refl, const Beside &beside) {
+                           return spot_colour_tone_value(lab_of(paper, illuminant),
+                                                         lab_of(*beside[0], illuminant),
+                                                         lab_of(refl, illuminant));
+                       });
         }
         if (nominal >= 75 && nominal <= 80)
-            add({Attribute::contrast, ink, nominal}, printed, {},
-                [&](const Spectrum &refl, int zone) {
-                    return densitometer.print_contrast(*find(solid, zone), refl);
-                });
+            add_beside(solid, {Attribute::contrast, ink, nominal}, printed, {},
+                       [&](const Spectrum &refl, const Beside &beside) {
+                           return densitometer.print_contrast(*beside[0], refl);
+                       });
     }
 
     // Of a ramp with 25, 50 and 75 % these.
@@ -228,12 +253,11 @@ private:
 
     void add_trap(const Tints &tints, const Printed &printed)
     {
-        const Tints first = {tints[0]}, second = {tints[1]};
-        if (find(first, 0) && find(second, 0))
-            add({Attribute::trap, title_of(tints[0]) + " + " + title_of(tints[1])}, printed, {},
-                [&](const Spectrum &refl, int zone) {
-                    return densitometer.trap(*find(first, zone), *find(second, zone), refl);
-                });
+        add_beside({{tints[0]}, {tints[1]}},
+                   {Attribute::trap, title_of(tints[0]) + " + " + title_of(tints[1])}, printed, {},
+                   [&](const Spectrum &refl, const Beside &beside) {
+                       return densitometer.trap(*beside[0], *beside[1], refl);
+                   });
     }
 
     void add_distances(const Tints &tints, const Printed &printed)
@@ -285,9 +309,9 @@ void add_statistics(std::vector<ZoneReading> &readings, const AllPrinted &all,
     std::map<int, std::vector<double>> zones;
     for (const auto &[tints, printed] : all)
         if (printed.control)
-            for (const auto &[zone, refl] : printed.zones)
+            for (const auto &[zone, patch] : printed.zones.each)
                 zones[zone].push_back(
-                    delta_e00(printed.control->aim, lab_of(refl, comparison.illuminant)));
+                    delta_e00(printed.control->aim, lab_of(patch.refl, comparison.illuminant)));
     ZoneReading mean{.measurand = {.attribute = Attribute::mean_de00, .subject = {}},
                      .value = comparison.statistics[0].mean},
         largest{.measurand = {.attribute = Attribute::max_de00, .subject = {}},
@@ -331,30 +355,31 @@ SheetReadings readings_of(const Measurement &aims, Measurement measured, Compare
     request.pairing.zones = true;
     const Zoned zoned(aims, std::move(measured), request);
     const Measurement &sheet = zoned.sheet;
-    Comparison comparison = compare(aims, sheet, request);
-    require_paper(comparison.sample_paper, sheet.file, "a press run");
     std::vector<std::string> told; // by compare() too
-    const Paper paper = paper_of(sheet, request.paper, comparison.illuminant, told),
-                aim_paper = paper_of(aims, request.paper, comparison.illuminant, told);
-    const std::vector<ControlPatch> controls = control_patches(
-        comparison.pairs, aim_paper, paper, comparison.illuminant, request.status, aims.collection);
+    const ILLUM_OBS illuminant = request.illuminant.value();
+    const JudgedSheet references{aims, paper_of(aims, request.paper, illuminant, told),
+                                 zones_of(aims)},
+        samples{sheet, paper_of(sheet, request.paper, illuminant, told), zoned.zones};
+    const Paper &paper = samples.paper;
+    require_paper(paper.choice, sheet.file, "a press run");
+    request.sample_zones = zoned.zones;
+    Comparison comparison = compare(aims, sheet, request);
+    const std::vector<ControlPatch> controls =
+        control_patches(comparison.pairs, zoned.pairs.matched, references, samples, illuminant,
+                        request.status, told);
     const Inks inks(sheet, order);
     const AllPrinted all =
         printed_on(zoned, inks, comparison, controls, Densitometer(paper.refl, request.status));
     Reader reader(paper, inks, all, comparison.illuminant, request.status);
     SheetReadings out;
-    for (const auto &[tints, printed] : all) {
+    for (const auto &[tints, printed] : all)
         reader.read(tints, printed);
-        if (const auto ink = Inks::ink_of_solid(tints); ink && printed.control)
-            out.solids.push_back(
-                {ink_title(inks.names()[*ink]), printed.mean, printed.control->aim});
-    }
     add_statistics(reader.readings, all, comparison);
     out.readings = std::move(reader.readings);
     out.coverage = comparison.coverage;
     out.limits = std::move(comparison.limits);
     out.verdict = comparison.verdict;
-    out.paper = paper.refl;
+    out.advice = std::move(comparison.advice);
     out.warnings = std::move(comparison.warnings);
     if (zoned.by_place)
         out.warnings.push_back(sheet.file + ": no names tell the zones; their order in the file is "

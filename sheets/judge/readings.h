@@ -62,13 +62,7 @@ struct SheetReadings {
     Coverage coverage;
     std::vector<LimitResult> limits; // on the means of the zones
     std::optional<Verdict> verdict;  // of compare()
-    Spectrum paper{};
-    struct Solid {
-        std::string ink;
-        Spectrum refl;
-        CIELABCOORD aim;
-    };
-    std::vector<Solid> solids; // that have an aim
+    std::vector<SolidAdvice> advice;
     std::vector<std::string> warnings;
 };
 
@@ -77,7 +71,8 @@ int take_zone(Patch &patch);
 
 // The patches that an aim serves are its zones: their numbers end the names, or are those of their
 // places where most aims have the same number of patches. The names of the aims are without zones.
-// `request` is as compare() takes it; `order` is that of printing. Throws RequestError.
+// `request` is as compare() takes it, with an illuminant; `order` is that of printing. Throws
+// RequestError.
 SheetReadings readings_of(const Measurement &aims, Measurement measured, CompareRequest request,
                           const std::vector<std::string> &order);
 

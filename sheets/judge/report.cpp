@@ -4,6 +4,8 @@
 #include "judge/densitometer.h"
 #include "judge/names.h"
 #include "judge/tone_value.h"
+#include "judge/zones.h"
+#include "read/labels.h"
 #include "read/text.h"
 
 #include <fmt/format.h>
@@ -50,15 +52,28 @@ void measure_inks(PatchReport &row, const Patch &patch, const Conditions &condit
             row.hue_error = measured->hue_error;
             row.grayness = measured->grayness;
         }
-    } else if (tints->size() == 1) {
-        if (const Patch *solid = inks.solid((*tints)[0].ink))
-            measure_tint(row, patch, *solid, (*tints)[0].percent, conditions, densitometer);
-    } else if (tints->size() == 2 && (*tints)[0].percent == 100 && (*tints)[1].percent == 100) {
-        const Patch *first = inks.solid((*tints)[0].ink);
-        const Patch *second = inks.solid((*tints)[1].ink);
-        if (first && second)
-            row.trap = densitometer.trap(first->refl, second->refl, patch.refl);
+        return;
     }
+    const bool overprint =
+        tints->size() == 2 && (*tints)[0].percent == 100 && (*tints)[1].percent == 100;
+    if (tints->size() != 1 && !overprint)
+        return;
+    std::vector<const Patch *> beside; // the solids in the zone of the patch
+    for (const Tint &tint : *tints) {
+        const auto &solids = inks.solids_of(tint.ink);
+        if (!solids)
+            return;
+        if (const Patch *solid = solids->in(zoned_name(patch.name).zone))
+            beside.push_back(solid);
+        else
+            row.lacking.push_back(tint.ink);
+    }
+    if (!row.lacking.empty())
+        return;
+    if (overprint)
+        row.trap = densitometer.trap(beside[0]->refl, beside[1]->refl, patch.refl);
+    else
+        measure_tint(row, patch, *beside[0], (*tints)[0].percent, conditions, densitometer);
 }
 
 MetamerismReport metamerism_of(const Measurement &sheet, const Paper &paper, ILLUM_OBS illuminant,
@@ -115,8 +130,10 @@ std::vector<ToneCurve> tone_curves(const Inks &inks, const std::vector<PatchRepo
         ToneCurve &curve = curves.emplace_back();
         curve.ink = inks.names()[ink];
         curve.solid = inks.solid(ink)->name;
-        if (const std::size_t count = inks.count_of_solids(ink); count > 1)
-            curve.solid += fmt::format(" (mean of {})", count);
+        const Zones &solids = *inks.solids_of(ink);
+        curve.solid = solids.each.empty()
+                          ? name_of_mean(curve.solid, solids.all.count)
+                          : fmt::format("{} (of each zone its own)", zoned_name(curve.solid).name);
         curve.spot = !is_process_ink(ink_title(curve.ink));
         for (auto &[nominal, sum] : sums[ink]) {
             sum.dot_area /= static_cast<double>(sum.patches);
@@ -273,6 +290,7 @@ Report report_of(Measurement measurement, const ReportRequest &request)
                   .paper = paper_report(paper, illuminant),
                   .metamerism = std::move(metamerism),
                   .patches = {},
+                  .left_out = {},
                   .tone_curves = {},
                   .greys = {},
                   .advice = {},
@@ -289,6 +307,11 @@ Report report_of(Measurement measurement, const ReportRequest &request)
         densities.push_back(patch.density);
     warn_of_paper(sheet.file, paper.choice, densities, report.warnings);
     warn_of_lost_repeats(sheet, inks, report.warnings);
+    LackingSolids lacking;
+    for (const PatchReport &patch : report.patches)
+        for (const std::size_t ink : patch.lacking)
+            lacking[inks.names()[ink]].insert(zoned_name(patch.patch->name).zone);
+    warn_of_solids(sheet.file, lacking, report.warnings);
     report.tone_curves = tone_curves(inks, report.patches);
     if (paper.choice.exists())
         report.greys = neutral_steps(report.patches, paper, request.status);

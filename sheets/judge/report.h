@@ -46,6 +46,7 @@ struct PatchReport {
     std::optional<double> print_contrast;      // of a tint of 75 to 80 %
     std::optional<double> hue_error, grayness; // of a solid
     std::optional<double> trap;                // of an overprint of two solids
+    std::vector<std::size_t> lacking; // inks of which other zones have a solid, this one not
 };
 
 struct PaperReport {

@@ -163,6 +163,7 @@ void RunJudge::add(const Measurement &sheet)
         beside.illuminant = illuminant->illuminant;
         beside.status = request.status;
         beside.tolerances = request.tolerances;
+        beside.advice = true;
         beside.paper = request.paper;
         // Before the entry: GCC 12 destroys twice what an aggregate holds when a member throws.
         SheetReadings readings = readings_of(aims, sheet, beside, request.order);
@@ -382,13 +383,7 @@ void RunJudge::warn_of_few(Run &run) const
                         zones, kFewestOfOutliers));
 }
 
-void RunJudge::add_advice(Run &run) const
-{
-    const SheetReadings &last = entries.back().readings;
-    for (const auto &[ink, solid, aim] : last.solids)
-        if (const auto advice = advise(solid, last.paper, aim, *illuminant, request.status))
-            run.advice.push_back({ink, *advice, {}});
-}
+void RunJudge::add_advice(Run &run) const { run.advice = entries.back().readings.advice; }
 
 // Sheets of one run are of one job, read by one instrument in one way, and no two are one.
 void RunJudge::compare_origins(Run &run) const

@@ -280,16 +280,22 @@ void Flat::warnings(std::vector<std::string> texts)
         });
 }
 
-void Flat::advice(const std::string &note, const std::function<const Advice *(std::size_t)> &get)
+void Flat::advice(const std::string &note,
+                  const std::function<const SolidAdvice *(std::size_t)> &get)
 {
     for (const auto &[name, value] : {std::pair{"dE00_aim", &Advice::de00},
                                       {"density_change", &Advice::density_change},
                                       {"dE00_after", &Advice::de00_after}})
         number(name, upper(name), [get, value = value](std::size_t i) {
-            return get(i) ? std::optional(get(i)->*value) : std::nullopt;
+            return get(i) ? std::optional(get(i)->advice.*value) : std::nullopt;
         });
-    text(note, upper(note),
-         [get](std::size_t i) { return std::string(get(i) ? words_of(*get(i)) : ""); });
+    text(note, upper(note), [get](std::size_t i) {
+        const SolidAdvice *solid = get(i);
+        if (!solid)
+            return std::string();
+        return fmt::format("{}{}", solid->count > 1 ? name_of(*solid) + ": " : "",
+                           words_of(solid->advice));
+    });
 }
 
 void Flat::colour(const std::string &prefix, const std::function<const Colour *(std::size_t)> &get)
@@ -337,10 +343,9 @@ Flat flat_of(const std::vector<SolidAdvice> &advice, const std::string &descript
     Flat flat;
     flat.description = description;
     flat.rows = advice.size();
-    flat.text("name", "SOLID", [&advice](std::size_t i) {
-        return "Advice for " + (advice[i].patch.empty() ? advice[i].ink : advice[i].patch);
-    });
-    flat.advice("note", [&advice](std::size_t i) { return &advice[i].advice; });
+    flat.text("name", "SOLID",
+              [&advice](std::size_t i) { return "Advice for " + name_of(advice[i]); });
+    flat.advice("note", [&advice](std::size_t i) { return &advice[i]; });
     return flat;
 }
 

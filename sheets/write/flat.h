@@ -44,8 +44,9 @@ struct Flat {
                std::function<std::optional<double>(std::size_t)> get);
     // All in the first row; no column where there are none.
     void warnings(std::vector<std::string> texts);
-    // A null pointer makes empty cells; its words stand under `note`.
-    void advice(const std::string &note, const std::function<const Advice *(std::size_t)> &get);
+    // Its words stand under `note`; a null pointer makes empty cells.
+    void advice(const std::string &note,
+                const std::function<const SolidAdvice *(std::size_t)> &get);
     // Preview and L*a*b*; a null pointer makes empty cells.
     void colour(const std::string &prefix, const std::function<const Colour *(std::size_t)> &get);
     void spectrum(const std::function<const Spectrum &(std::size_t)> &get);

@@ -54,14 +54,14 @@ Json patch_json(const PatchReport &patch, int status)
 void add_advice(Json &object, const std::vector<SolidAdvice> &advice)
 {
     Json rows = Json::array();
-    for (const auto &[ink, one, patch] : advice) {
-        rows.push_back({{"ink", ink},
+    for (const SolidAdvice &solid : advice) {
+        const Advice &one = solid.advice;
+        rows.push_back({{"ink", solid.ink},
                         {"de00", one.de00},
                         {"density_change", one.density_change},
                         {"de00_after", one.de00_after},
-                        {"words", words_of(one)}});
-        if (!patch.empty())
-            rows.back()["patch"] = patch;
+                        {"words", words_of(one)},
+                        {"patch", name_of(solid)}});
     }
     object["advice"] = rows;
     if (!advice.empty())

@@ -350,11 +350,10 @@ Flat flat_of(const Report &report)
         flat.warnings(report.warnings);
         return flat;
     }
-    std::map<std::size_t, const Advice *> advice; // by patch, the first of its name
+    std::map<std::size_t, const SolidAdvice *> advice; // by patch, the first of its name
     for (const SolidAdvice &solid : report.advice)
         for (std::size_t i = 0; i < patches.size(); ++i)
-            if (patches[i].patch->name == solid.patch &&
-                advice.try_emplace(i, &solid.advice).second)
+            if (patches[i].patch->name == solid.patch && advice.try_emplace(i, &solid).second)
                 break;
     flat.advice("advice", [advice = std::move(advice)](std::size_t i) {
         const auto found = advice.find(i);

@@ -17,9 +17,10 @@ void add_tones(Lines &lines, const std::vector<ToneStep> &tones)
     lines.add(fmt::format("\n{:<22}{:>8}{:>8}{:>8}{}", "Tone values", "nominal", "aim", "sample",
                           spots ? fmt::format("{:>10}{:>8}", "SCTV aim", "SCTV") : ""));
     for (const ToneStep &step : tones)
-        lines.add(fmt::format("{:<22}{:>8g}{:>8}{:>8}{:>10}{:>8}", cut(step.ink, 21), step.nominal,
-                              fixed(step.aim), fixed(step.area), fixed(step.aim_sctv),
-                              fixed(step.sctv)));
+        lines.add(fmt::format("{:<22}{:>8g}{:>8}{:>8}{:>10}{:>8}{}", cut(step.ink, 21),
+                              step.nominal, fixed(step.aim), fixed(step.area), fixed(step.aim_sctv),
+                              fixed(step.sctv),
+                              step.patches > 1 ? fmt::format("  mean of {}", step.patches) : ""));
 }
 
 void add_greys(Lines &lines, const std::vector<GreyStep> &greys)
@@ -42,7 +43,8 @@ Json tones_json(const std::vector<ToneStep> &tones)
                        {"reference", or_null(step.aim)},
                        {"sample", or_null(step.area)},
                        {"reference_sctv", or_null(step.aim_sctv)},
-                       {"sample_sctv", or_null(step.sctv)}});
+                       {"sample_sctv", or_null(step.sctv)},
+                       {"patches", step.patches}});
     return out;
 }
 
@@ -76,6 +78,8 @@ Flat flat_of(const std::vector<ToneStep> &tones)
     number("reference_dot_area", "REFERENCE_DOT_AREA", &ToneStep::aim);
     number("sctv", "SCTV", &ToneStep::sctv);
     number("reference_sctv", "REFERENCE_SCTV", &ToneStep::aim_sctv);
+    flat.exact("repeats", "REPEATS",
+               [&tones](std::size_t i) { return static_cast<double>(tones[i].patches); });
     return flat;
 }
 

@@ -57,11 +57,13 @@ void add_advice(Lines &lines, const std::string &title, const std::vector<SolidA
         return;
     lines.add(
         fmt::format("\n{:<24}{:>8}{:>16}{:>12}", title, "ΔE00", "density change", "ΔE00 after"));
-    for (const auto &[ink, one, patch] : advice)
+    for (const SolidAdvice &solid : advice) {
+        const Advice &one = solid.advice;
         lines.add(fmt::format(
-            "{:<24}{:>8}{:>16}{:>12}  {}", cut(patch.empty() ? ink : patch, 23), fixed(one.de00),
+            "{:<24}{:>8}{:>16}{:>12}  {}", cut(name_of(solid), 23), fixed(one.de00),
             fmt::format("{}{}", one.density_change > 0 ? "+" : "", fixed(one.density_change, 3)),
             fixed(one.de00_after), words_of(one)));
+    }
     lines.add(std::string(kAdviceFrom));
     lines.add(std::string(kAdviceElse));
 }

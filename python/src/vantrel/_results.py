@@ -308,7 +308,10 @@ class Means:
 
 @dataclass(frozen=True)
 class ToneStep:
-    """The dot areas of a tint of `ink`, in percent, of aim and sample; of spot inks by ISO 20654 too."""
+    """The dot areas of tints of `ink`, in percent, of aim and sample; of spot inks by ISO 20654 too.
+
+    They are the means of so many `patches` of the sample.
+    """
 
     ink: str
     nominal: float
@@ -316,6 +319,7 @@ class ToneStep:
     sample: Optional[float]
     reference_sctv: Optional[float]
     sample_sctv: Optional[float]
+    patches: int
 
 
 @dataclass(frozen=True)
@@ -340,7 +344,7 @@ class Advice:
     density_change: float
     de00_after: float
     words: str
-    patch: Optional[str] = None
+    patch: str
 
 
 @dataclass(frozen=True, repr=False)
