@@ -158,18 +158,18 @@ void add_verdicts(Lines &lines, const Comparison &comparison)
         lines.add('\n' + sentence);
 }
 
-Json side_json(const Side &side)
+ObjectText side_text(const Side &side)
 {
-    Members out;
+    ObjectText out;
     out.add("id", side.id);
     out.add("name", side.name);
     out.add("rgb", hex(side.colour.rgb));
-    out.add("lab", lab_json(side.colour.lab));
-    out.add("density", or_null(side.density));
-    out.add("refl", or_null(side.refl));
+    out.add("lab", side.colour.lab);
+    out.add("density", side.density);
+    out.add("refl", side.refl);
     out.add("repeats", side.repeats);
-    out.add("spread", or_null(side.spread));
-    return std::move(out.members);
+    out.add("spread", side.spread);
+    return out;
 }
 
 Json means_json(const std::optional<Means> &means)
@@ -205,28 +205,28 @@ Json tries_json(const std::vector<PairingTry> &tries)
     return out;
 }
 
-Json pair_json(const PairReport &pair, const Comparison &comparison)
+ObjectText pair_text(const PairReport &pair, const Comparison &comparison)
 {
     const auto formula = [&](std::size_t i) { return names_of(comparison.metrics[i].formula).key; };
-    Members out;
+    ObjectText out;
     out.add("name", pair.name());
-    out.add("reference", side_json(pair.reference));
-    out.add("sample", side_json(pair.sample));
+    out.add("reference", side_text(pair.reference));
+    out.add("sample", side_text(pair.sample));
     for (std::size_t i = 0; i < pair.delta_e.size(); ++i)
         out.add(formula(i), pair.delta_e[i]);
-    out.add("verbal", or_null(pair.verbal));
-    out.add("metamerism", or_null(pair.metamerism));
-    out.add("din6172", or_null(pair.din6172));
-    out.add("response", response_json(pair.response, comparison.status));
-    out.add("density_difference", or_null(pair.density_difference));
+    out.add("verbal", pair.verbal);
+    out.add("metamerism", pair.metamerism);
+    out.add("din6172", pair.din6172);
+    out.add("response", response_text(pair.response, comparison.status));
+    out.add("density_difference", pair.density_difference);
     if (pair.corrected_aim) {
-        Members corrected;
-        corrected.add("lab", lab_json(*pair.corrected_aim));
+        ObjectText corrected;
+        corrected.add("lab", *pair.corrected_aim);
         for (std::size_t i = 0; i < pair.corrected_delta_e.size(); ++i)
             corrected.add(formula(i), pair.corrected_delta_e[i]);
-        out.add("corrected", std::move(corrected.members));
+        out.add("corrected", corrected);
     }
-    return std::move(out.members);
+    return out;
 }
 
 Json statistics_json(const Comparison &comparison, const std::vector<Statistics> &statistics)
@@ -344,7 +344,7 @@ void write_json(const Comparison &comparison, const Sink &sink)
     add_left_out(head, comparison.left_out);
     write_with_array(
         head, "pairs", comparison.pairs.size(),
-        [&](std::size_t i) { return pair_json(comparison.pairs[i], comparison); }, sink);
+        [&](std::size_t i) { return pair_text(comparison.pairs[i], comparison).whole(); }, sink);
     sink.write("\n");
 }
 

@@ -259,7 +259,7 @@ void write_json(const PatchStudy &study, const Sink &sink)
     for (int status = 0; status < NUM_STATUSES; ++status)
         statuses.push_back(status_json(status, study.statuses[status]));
     if (study.against) {
-        against = patch_json(study.against->patch, study.status);
+        against = Json::parse(patch_text(study.against->patch, study.status).whole());
         against["de00"] = study.against->de00;
         against["a_weights"] = study.against->a;
         against["b_weights"] = study.against->b;
@@ -272,7 +272,7 @@ void write_json(const PatchStudy &study, const Sink &sink)
                 {"warnings", study.warnings},
                 {"paper", name_json(study.paper)},
                 {"paper_chosen", study.paper.reason},
-                {"patch", patch_json(study.patch, study.status)},
+                {"patch", Json::parse(patch_text(study.patch, study.status).whole())},
                 {"brightness", or_null(study.as_paper.brightness)},
                 {"whiteness", or_null(study.as_paper.whiteness)}};
     if (!study.as_paper.whiteness)

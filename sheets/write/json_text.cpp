@@ -5,7 +5,9 @@
 
 #include <fmt/format.h>
 
-#include <utility>
+#include <algorithm>
+#include <cmath>
+#include <iterator>
 
 namespace vantrel::sheets {
 
@@ -13,42 +15,66 @@ Json lab_json(const CIELABCOORD &lab) { return {lab.L, lab.a, lab.b}; }
 
 Json name_json(const PaperChoice &paper) { return paper.exists() ? Json(paper.name) : Json(); }
 
-Json response_json(const std::optional<int> &response, int status)
+std::optional<std::string> response_text(const std::optional<int> &response, int status)
 {
-    return response ? Json(response_name(status, *response)) : Json();
+    return response ? std::optional(response_name(status, *response)) : std::nullopt;
 }
 
 void add_reading(Json &object, const DensityReading &reading, int status)
 {
-    object["response"] = response_json(reading.response, status);
+    object["response"] = or_null(response_text(reading.response, status));
     object["density"] = or_null(reading.density);
 }
 
-Json patch_json(const PatchReport &patch, int status)
+void ObjectText::append(double value)
 {
-    Members out;
-    Json::object_t device;
-    for (const auto &[field, value] : patch.patch->device)
-        device[field] = value;
+    if (!std::isfinite(value)) {
+        text += "null";
+        return;
+    }
+    char digits[32];
+    text.append(digits, nlohmann::detail::to_chars(digits, std::end(digits), value));
+}
+
+void ObjectText::append(std::string_view value)
+{
+    const bool plain = std::all_of(value.begin(), value.end(), [](char c) {
+        return c >= ' ' && c <= '~' && c != '"' && c != '\\';
+    });
+    if (plain)
+        (text += '"').append(value) += '"';
+    else
+        text += Json(value).dump();
+}
+
+ObjectText patch_text(const PatchReport &patch, int status)
+{
+    ObjectText out, device;
+    const auto &values = patch.patch->device;
+    for (auto value = values.begin(); value != values.end(); ++value) {
+        const auto same = [&](const auto &other) { return other.first == value->first; };
+        if (std::none_of(values.begin(), value, same)) // the last of a name holds
+            device.add(value->first, std::find_if(values.rbegin(), values.rend(), same)->second);
+    }
     out.add("id", patch.patch->id);
     out.add("name", patch.patch->name);
-    out.add("device", std::move(device));
+    out.add("device", device);
     out.add("rgb", hex(patch.colour.rgb));
-    out.add("lab", lab_json(patch.colour.lab));
-    out.add("lch", {patch.lch.L, patch.lch.C, patch.lch.h});
-    out.add("de00_to_paper", or_null(patch.to_paper));
-    out.add("response", response_json(patch.response, status));
-    out.add("response_id", or_null(patch.response));
-    out.add("density", or_null(patch.density));
-    out.add("dot_area", or_null(patch.dot_area));
-    out.add("dot_gain", or_null(patch.dot_gain));
-    out.add("sctv", or_null(patch.sctv));
-    out.add("print_contrast", or_null(patch.print_contrast));
-    out.add("hue_error", or_null(patch.hue_error));
-    out.add("grayness", or_null(patch.grayness));
-    out.add("trap", or_null(patch.trap));
-    out.add("refl", patch.refl ? Json(*patch.refl) : Json());
-    return std::move(out.members);
+    out.add("lab", patch.colour.lab);
+    out.add("lch", patch.lch);
+    out.add("de00_to_paper", patch.to_paper);
+    out.add("response", response_text(patch.response, status));
+    out.add("response_id", patch.response);
+    out.add("density", patch.density);
+    out.add("dot_area", patch.dot_area);
+    out.add("dot_gain", patch.dot_gain);
+    out.add("sctv", patch.sctv);
+    out.add("print_contrast", patch.print_contrast);
+    out.add("hue_error", patch.hue_error);
+    out.add("grayness", patch.grayness);
+    out.add("trap", patch.trap);
+    out.add("refl", patch.refl);
+    return out;
 }
 
 void add_advice(Json &object, const std::vector<SolidAdvice> &advice)
@@ -77,14 +103,14 @@ void add_left_out(Json &object, const LeftOut &left_out)
 }
 
 void write_with_array(const Json &object, std::string_view name, std::size_t count,
-                      const std::function<Json(std::size_t)> &element, const Sink &sink)
+                      const std::function<std::string(std::size_t)> &element, const Sink &sink)
 {
     std::string head = object.dump(2);
     head.erase(head.rfind("\n}"));
     sink.write(fmt::format("{},\n  \"{}\": [", head, name));
     const Work work{sink.tell, "Writing", count};
     for (std::size_t i = 0; i < count; ++i) {
-        sink.write((i ? ",\n" : "\n") + element(i).dump());
+        sink.write((i ? ",\n" : "\n") + element(i));
         work.done(i + 1);
     }
     sink.write("\n  ]\n}");

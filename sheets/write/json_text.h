@@ -10,6 +10,7 @@
 
 #include <nlohmann/json.hpp>
 
+#include <array>
 #include <cstddef>
 #include <functional>
 #include <optional>
@@ -27,13 +28,52 @@ template <typename Value> Json or_null(const std::optional<Value> &value)
     return value ? Json(*value) : Json();
 }
 
-// An object of a row, member by member: braces would make an array of every pair first, and a
-// search for its name goes through all.
-struct Members {
-    Json::object_t members;
+// An object on one line, its text as Json::dump() writes it: a tree of values for each of a million
+// patches would take three times as long.
+class ObjectText {
+public:
+    template <typename Value> void add(std::string_view name, const Value &value)
+    {
+        text += text.empty() ? '{' : ',';
+        append(name);
+        text += ':';
+        append(value);
+    }
+    std::string whole() const { return text.empty() ? "{}" : text + '}'; }
 
-    Members() { members.reserve(20); }
-    void add(std::string_view name, Json value) { members.emplace_back(name, std::move(value)); }
+private:
+    void append(double value);
+    void append(std::string_view value);
+    void append(int value) { text += std::to_string(value); }
+    void append(std::size_t value) { text += std::to_string(value); }
+    void append(const CIELABCOORD &lab) { append(std::array{lab.L, lab.a, lab.b}); }
+    void append(const CIELCHCOORD &lch) { append(std::array{lch.L, lch.C, lch.h}); }
+    void append(const ObjectText &object) { text += object.whole(); }
+    template <std::size_t Count> void append(const std::array<double, Count> &values)
+    {
+        text += '[';
+        for (const double value : values) {
+            append(value);
+            text += ',';
+        }
+        text.back() = ']';
+    }
+    void append(const Spectrum *refl)
+    {
+        if (refl)
+            append(*refl);
+        else
+            text += "null";
+    }
+    template <typename Value> void append(const std::optional<Value> &value)
+    {
+        if (value)
+            append(*value);
+        else
+            text += "null";
+    }
+
+    std::string text; // without the brace at its end
 };
 
 struct PatchReport; // judge/report.h
@@ -42,12 +82,13 @@ Json lab_json(const CIELABCOORD &lab);
 
 Json name_json(const PaperChoice &paper); // null where there is none
 
-Json response_json(const std::optional<int> &response, int status); // its name
+// Its name.
+std::optional<std::string> response_text(const std::optional<int> &response, int status);
 
 // Adds `response` and `density`.
 void add_reading(Json &object, const DensityReading &reading, int status);
 
-Json patch_json(const PatchReport &patch, int status);
+ObjectText patch_text(const PatchReport &patch, int status);
 
 // Adds `advice` and, where there is any, `advice_from`.
 void add_advice(Json &object, const std::vector<SolidAdvice> &advice);
@@ -56,8 +97,8 @@ void add_advice(Json &object, const std::vector<SolidAdvice> &advice);
 void add_left_out(Json &object, const LeftOut &left_out);
 
 // Writes the object with one more member, an array whose elements never stand in memory together:
-// each is a line.
+// each is a line of text.
 void write_with_array(const Json &object, std::string_view name, std::size_t count,
-                      const std::function<Json(std::size_t)> &element, const Sink &sink);
+                      const std::function<std::string(std::size_t)> &element, const Sink &sink);
 
 } // namespace vantrel::sheets

@@ -71,7 +71,7 @@ void write_json(const List &list, const Sink &sink)
             out[column.name] =
                 column.text ? Json(cell) : Json::parse(cell); // whole numbers as such
         }
-        return out;
+        return out.dump();
     };
     write_with_array(head, "rows", table.rows, row_json, sink);
     sink.write("\n");

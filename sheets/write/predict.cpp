@@ -227,7 +227,9 @@ void write_json(const Predictions &predictions, const Sink &sink)
     };
     write_with_array(
         head, "predictions", predictions.all.size(),
-        [&](std::size_t i) { return prediction_json(predictions.all[i], predictions.status); },
+        [&](std::size_t i) {
+            return prediction_json(predictions.all[i], predictions.status).dump();
+        },
         sink);
     sink.write("\n");
 }

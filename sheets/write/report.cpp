@@ -280,7 +280,7 @@ void write_sheet(const Report &report, const Sink &sink)
     add_left_out(head, report.left_out);
     write_with_array(
         head, "patches", report.patches.size(),
-        [&](std::size_t i) { return patch_json(report.patches[i], report.status); }, sink);
+        [&](std::size_t i) { return patch_text(report.patches[i], report.status).whole(); }, sink);
 }
 
 constexpr std::size_t kMostCells = 50'000'000; // of device values: bounds what empty ones take

@@ -395,7 +395,7 @@ void write_json(const Run &run, const Sink &sink)
     add_advice(head, run.advice);
     write_with_array(
         head, "series", run.series.size(),
-        [&](std::size_t i) { return series_json(run.series[i]); }, sink);
+        [&](std::size_t i) { return series_json(run.series[i]).dump(); }, sink);
     sink.write("\n");
 }
 
