@@ -1,6 +1,7 @@
 #include "write/flat.h"
 
 #include "read/text.h"
+#include "write/decimal.h"
 
 #include <fmt/compile.h>
 #include <fmt/format.h>
@@ -182,31 +183,12 @@ void write_cgats_table(const Flat &table, const Sink &sink)
     sink.write("END_DATA\n");
 }
 
-constexpr double kTenThousand = 1e4;
-constexpr double kFarthest = 1e11; // up to which products with it are right to 0.0001
-
-// The number k / 10,000, with four decimals or without the zeros at their end.
-void append_ten_thousandths(long long k, bool zeros, std::string &out)
-{
-    if (k < 0)
-        out += '-';
-    const auto size = static_cast<unsigned long long>(k < 0 ? -k : k);
-    const fmt::format_int whole(size / 10000);
-    out.append(whole.data(), whole.size());
-    const fmt::format_int decimals(10000 + size % 10000); // behind a 1
-    std::string_view rest(decimals.data() + 1, 4);
-    if (!zeros)
-        rest = rest.substr(0, rest.find_last_not_of('0') + 1);
-    if (!rest.empty())
-        out.append(1, '.').append(rest);
-}
-
 void append_four_decimals(const std::optional<double> &value, std::string &out)
 {
     if (!value)
         return;
-    const double scaled = std::abs(*value * kTenThousand);
-    if (scaled < kFarthest) {
+    const double scaled = std::abs(*value * 1e4);
+    if (scaled < kMostTenThousandths) {
         const auto k = static_cast<long long>(scaled);
         const double rest = scaled - static_cast<double>(k);
         if (std::abs(rest - 0.5) > 0.001) { // otherwise the product does not tell where it rounds
@@ -227,13 +209,9 @@ void append_all_digits(const std::optional<double> &value, std::string &out)
 {
     if (!value)
         return;
-    const double scaled = *value * kTenThousand;
-    if (std::abs(scaled) < kFarthest) {
-        const auto k = static_cast<long long>(scaled + (scaled < 0 ? -0.5 : 0.5));
-        if (k != 0 && static_cast<double>(k) / kTenThousand == *value) {
-            append_ten_thousandths(k, false, out);
-            return;
-        }
+    if (const auto k = ten_thousandths(*value)) {
+        append_ten_thousandths(*k, false, out);
+        return;
     }
     fmt::memory_buffer text;
     fmt::format_to(fmt::appender(text), FMT_COMPILE("{}"), *value);

@@ -2,6 +2,7 @@
 
 #include "judge/names.h"
 #include "judge/report.h"
+#include "write/decimal.h"
 
 #include <fmt/format.h>
 
@@ -30,6 +31,13 @@ void ObjectText::append(double value)
 {
     if (!std::isfinite(value)) {
         text += "null";
+        return;
+    }
+    // to_chars() writes all of these alike, but takes longer
+    if (const auto k = ten_thousandths(value); k && std::abs(value) < 2000) {
+        append_ten_thousandths(*k, false, text);
+        if (*k % 10000 == 0)
+            text += ".0";
         return;
     }
     char digits[32];
