@@ -1,5 +1,6 @@
 #include "judge/colour.h"
 
+#include <fmt/compile.h>
 #include <fmt/format.h>
 
 #include <algorithm>
@@ -109,7 +110,7 @@ double delta_e00(const CIELABCOORD &first, const CIELABCOORD &second)
 
 std::string hex(const Rgb &rgb)
 {
-    return fmt::format("#{:02x}{:02x}{:02x}", rgb.red, rgb.green, rgb.blue);
+    return fmt::format(FMT_COMPILE("#{:02x}{:02x}{:02x}"), rgb.red, rgb.green, rgb.blue);
 }
 
 } // namespace vantrel::sheets

@@ -94,7 +94,8 @@ std::string upper(std::string_view text)
 
 bool equal_ignoring_case(std::string_view first, std::string_view second)
 {
-    return upper(first) == upper(second);
+    return std::equal(first.begin(), first.end(), second.begin(), second.end(),
+                      [](char a, char b) { return upper_letter(a) == upper_letter(b); });
 }
 
 std::string letters(std::string_view field)
