@@ -141,7 +141,7 @@ def test_a_refused_row_is_nan_without_a_warning():
         (lambda: vantrel.refl_to_density(SPECTRA, None, -1, 1), "status: -1"),
         (lambda: vantrel.refl_to_hue_gray(SPECTRA, None, "SPECTRALX"), "status: 5 is not"),
         (lambda: vantrel.refl_to_white_e313_98(SPECTRA, "A_2DEG"), "illum_obs: 0 is not"),
-        (lambda: vantrel.estimate_refls(SPECTRA[0], [1] * 5, PAPER), "inks: one to three"),
+        (lambda: vantrel.estimate_refls(SPECTRA[0, :4], [1] * 4, PAPER), "inks: one to three"),
         (lambda: vantrel.estimate_refls(SPECTRA[0, :2], [50, 5.5], PAPER), "percent: whole"),
         (lambda: vantrel.lab_to_de_lab(SPECTRA[..., :3], np.ones((4, 3))), "broadcast"),
         (lambda: vantrel.set_spectralx_constants(2, 84, 1.5, 0.5, 0.1), "centre must be 1"),

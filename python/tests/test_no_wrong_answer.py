@@ -61,6 +61,10 @@ def test_wavelengths_count():
         for given in labelled, labelled.chunk({"patch": 2}), frame, frame.astype("Float64"):
             density = vantrel.refl_to_density(given, None, "E", "GREEN")
             assert np.array_equal(density, expected) and not getattr(density, "attrs", None)
+    halves = np.arange(380, 731, 2.5)
+    waves = pd.DataFrame([50 + 40 * np.sin(halves / 20)], columns=[f"R{w}" for w in halves])
+    at_bands = vantrel.resample(waves.to_numpy(), halves)
+    assert np.array_equal(vantrel.refl_to_xyz(waves), vantrel.refl_to_xyz(at_bands))
     numbered = xr.DataArray(SPECTRA, {"band": np.arange(31)}, ("patch", "band"), name="refl")
     assert vantrel.refl_to_density(numbered, None, "E", "GREEN").name == "density"
 
@@ -76,7 +80,9 @@ SQUARE = np.resize(SPECTRA, (31, 31))
         (pd.DataFrame(SQUARE, index=NM), "along 'index'.*transpose"),
         (xr.DataArray(SPECTRA, {"nm": NM + 10}, ("patch", "nm")), "range is too short"),
         (xr.DataArray(SPECTRA[:, :16], {"nm": NM[:16] * 2 - 400}, ("p", "nm")), "between 400 and 4"),
-        (pd.DataFrame(SPECTRA, columns=NM + 5), "range is too short"),
+        (pd.DataFrame(SPECTRA, columns=NM - 5), "range is too short"),
+        (pd.DataFrame(np.resize(SPECTRA, (2, 32)), columns=np.arange(395, 706, 10)), "at 395 and 405"),
+        (pd.DataFrame(np.resize(SPECTRA, (2, 46)), columns=[*range(400, 550, 5), *NM[15:]]), "5 to 10"),
         (da.from_array(np.ma.masked_greater(SPECTRA, 90), chunks=3), "masked"),
         (type("Quantity", (), {"__module__": "pint.registry"})(), "magnitude"),
     ],
@@ -99,6 +105,7 @@ def test_fractions_are_warned_of():
         warnings.simplefilter("error")
         vantrel.refl_to_xyz(np.zeros(31))
         vantrel.refl_to_density(SPECTRA / 100, PAPER, "E", 1)
+        vantrel.refl_to_density(da.from_array(SPECTRA, chunks=3), PAPER / 100, "E", 1)
 
 
 def test_any_name_of_a_dimension_will_do():
@@ -154,6 +161,8 @@ def test_settings_travel_with_the_blocks():
         assert np.array_equal(lazy_default.compute(), default)
     assert vantrel.get_spectralx_constants()[3] == 0.5 and np.array_equal(hifi(image), default)
     assert not np.allclose(changed, default) and lazy.name != lazy_default.name
+    assert np.array_equal(lazy.compute(scheduler="synchronous"), changed)
+    assert np.array_equal(hifi(image), default)
     # both at once, in threads, beside calls that no block stands behind
     with ThreadPoolExecutor(4) as pool:
         direct = [pool.submit(hifi, image) for _ in range(50)]

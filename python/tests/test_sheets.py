@@ -12,6 +12,7 @@ from pathlib import Path
 
 import matplotlib
 import numpy as np
+import pandas as pd
 import pytest
 
 import vantrel
@@ -78,11 +79,13 @@ def test_colours_alone_are_a_sheet_too():
     assert "L*a*b* for F7_2DEG" in replace(sheet, lab_illuminant=vantrel.IllumObs.F7_2DEG)._repr_html_()
 
 
-def test_a_library_of_spots_has_no_paper_and_two_conditions():
+def test_a_library_of_spots_has_no_paper_and_two_conditions(tmp_path):
+    file = tmp_path / "spots.cxf"
+    file.write_text(LIBRARY_OF_SPOTS)
     with warnings.catch_warnings():
         warnings.simplefilter("ignore")
-        sheets = [vantrel.reads(LIBRARY_OF_SPOTS.encode(), condition=c) for c in ("M0", "M1")]
-        comparison = vantrel.compare(*[replace(sheet, file="spots.cxf") for sheet in sheets])
+        sheets = [vantrel.read(file, condition=c) for c in ("M0", "M1")]
+        comparison = vantrel.compare(*sheets)
     assert [(s.collection, s.source.condition, s["Spot"][0]) for s in sheets] == [
         (True, "M0", 40),
         (True, "M1", 50),
@@ -259,8 +262,22 @@ def test_results_are_those_of_the_program(call, command, sheet, darker, tmp_path
     assert document.pop("command") == command.split()[0]
     agree(result, document["sheets"][0] if command.startswith("report") else document)
     assert pickle.loads(pickle.dumps(result)) == result
+    assert "<pre>" in result._repr_html_()
+
     frame = result.to_pandas()
-    assert len(frame) > 1 and frame.shape[1] > 6 and "<pre>" in result._repr_html_()
+    frame.to_csv("frame.csv", index=False)
+    ours, theirs = pd.read_csv("frame.csv"), pd.read_csv("result.csv", nrows=len(frame))
+    theirs.columns = theirs.columns.str.removeprefix("nm")
+    if command.startswith("ink"):
+        theirs = pd.read_csv("result.csv").query("table == 'densities'").reset_index()
+    if command.startswith("run"):
+        readings = pd.read_csv("result.csv", index_col="name").loc[ours.columns[1:]]
+        theirs = readings.filter(regex=r"^\d+ (?!zones)").T.reset_index(drop=True)
+    both = [column for column in ours if column in theirs]
+    assert len(both) > 2 and len(ours) > 1
+    pd.testing.assert_frame_equal(
+        ours[both], theirs[both], rtol=0, atol=6e-5, check_dtype=False, check_names=False
+    )
 
 
 @pytest.mark.filterwarnings("ignore:.*(transmission, not reflectance|largest reflectance is 0.904|a green density of)")
@@ -273,11 +290,11 @@ def test_what_is_written_reads_back(sheet, tmp_path):
         lab=np.linspace(1, 90, 93).reshape(31, 3),
         lab_illuminant=vantrel.IllumObs.D65_10DEG,
         source=replace(sheet.source, condition="M2"),
-        origin=vantrel.Origin("me", "a sheet; of two", "2026-03-02", "reader", "job 7"),
+        origin=vantrel.Origin("me", 'a "sheet";\nof two', "2026-03-02", "reader", "job 7"),
         kind="transmission",
     )
     plain = replace(odd, kind="reflectance", spectra=sheet.spectra / 7)
-    for name, written in ("sheet.txt", odd), ("sheet.csv", plain):
+    for name, written in ("sheet.TXT", odd), ("sheet.csv", plain):
         written.write(tmp_path / name)
         back = vantrel.read(tmp_path / name)
         for field in "spectra", "lab":
@@ -285,8 +302,13 @@ def test_what_is_written_reads_back(sheet, tmp_path):
         for field in "names", "ids", "kind":
             assert getattr(back, field) == getattr(written, field)
         assert back.source.condition == "M2" and back.device["CMYK_C"][4] == 4 / 7
-    back = vantrel.read(tmp_path / "sheet.txt")
-    assert (back.origin, back.lab_illuminant) == (odd.origin, odd.lab_illuminant)
+    back = vantrel.read(tmp_path / "sheet.TXT")
+    assert (back.origin, back.lab_illuminant) == (
+        replace(odd.origin, descriptor="a 'sheet'; of two"),
+        odd.lab_illuminant,
+    )
+    replace(odd, lab_illuminant=None, lab_stated="D93, 2 degree").write(tmp_path / "stated.txt")
+    assert vantrel.read(tmp_path / "stated.txt").lab_stated == "D93, 2 degree"
     assert np.array_equal(back.device["CMYK_C"], odd.device["CMYK_C"], equal_nan=True)
     for refused, reason in (odd, "transmittance"), (replace(sheet, spectra=sheet.spectra / 50), "scale"):
         with pytest.raises(ValueError, match=reason):
@@ -298,7 +320,9 @@ def test_a_sheet_shows_what_it_is(sheet):
     assert page.count("rgb(243, 242, 240)") == 1 and "<td>95.48</td><td>0.04</td><td>1.11</td>" in page
     assert "L*a*b* for D50_2DEG" in page
     assert "two_ink_halftone.txt: 31 patches, reflectance" in repr(sheet)
-    library = vantrel.report(replace(sheet, collection=True, device={}))
+    many = vantrel.reads(COLOURS.encode() + b"yellow,90,-5,92\n" * 201)
+    assert "<p>3 more patches are not shown</p>" in many._repr_html_()
+    library = vantrel.report(replace(sheet, collection=True, device={}, lab=np.full((31, 3), np.nan)))
     assert (library.paper.name, library.paper.chosen) == (None, "a collection of colours")
 
 
@@ -311,7 +335,7 @@ def test_a_sheet_shows_what_it_is(sheet):
         (lambda s: vantrel.compare(s, s, force_pairs=True), "force_pairs"),
         (lambda s: vantrel.compare(s, s, weights={"de76": (1, 1)}), "de76 has no weights"),
         (lambda s: vantrel.compare(s, s, formula=["de2000"] * 2), "named twice"),
-        (lambda s: vantrel.compare(s, s, tolerances=EXAMPLE), "two_ink_halftone.txt:1: "),
+        (lambda s: vantrel.compare(s, s, tolerances=EXAMPLE), "examples/two_ink_halftone.txt:1: "),
         (lambda s: vantrel.predict(s, inks={"CMYK_M": 40.5}), "whole percentage"),
         (lambda s: vantrel.predict(replace(s, device={})), "name inks with inks="),
         (lambda s: vantrel.report(replace(s, spectra=s.spectra[:, :30])), "spectra: the shape"),
@@ -350,6 +374,7 @@ def test_figures_show_what_the_sheet_has(sheet, darker):
 
     report = vantrel.report(sheet)
     _, magenta, yellow = vantrel.plot.tone_curves(report).get_lines()
+    assert (magenta.get_color(), yellow.get_color()) == ("#e0007a", "#d8b800")
     assert magenta.get_label() == "CMYK_M" and yellow.get_xydata()[0].tolist() == [0, 0]
     assert magenta.get_xydata()[5] == pytest.approx([50, 68.62], abs=0.005)
 
@@ -367,6 +392,8 @@ def test_figures_show_what_the_sheet_has(sheet, darker):
         comparison = vantrel.compare(sheet, darker, formula=["cmc", "de2000"], tolerance=1.5)
     ax = vantrel.plot.ab_plane(comparison)
     assert len(ax.get_lines()) == len(comparison.pairs) + 3
+    sides = [comparison.pairs[0].reference, comparison.pairs[0].sample]
+    assert np.array_equal(ax.get_lines()[0].get_xydata(), [side.lab[1:] for side in sides])
     ax = vantrel.plot.differences(comparison)
     heights = [bar.get_height() for bar in ax.patches]
     assert heights == sorted((pair.delta_e["cmc"] for pair in comparison.pairs), reverse=True)
