@@ -57,8 +57,10 @@ def test_wavelengths_count():
     padded = np.pad(SPECTRA, ((0, 0), (2, 3)), constant_values=1e9)
     for values, nm in (SPECTRA, NM), (SPECTRA[:, ::-1], NM[::-1]), (padded, wide):
         labelled = xr.DataArray(values, {"nm": nm}, ("patch", "nm"), attrs={"units": "%"})
+        beside = xr.DataArray(values, {"wl": ("bands", nm), "line": ("patch", 400 + np.arange(len(values)))},
+                              ("patch", "bands"))
         frame = pd.DataFrame(values, columns=[f"SPECTRAL_NM{w}" for w in nm])
-        for given in labelled, labelled.chunk({"patch": 2}), frame, frame.astype("Float64"):
+        for given in labelled, beside, labelled.chunk({"patch": 2}), frame, frame.astype("Float64"):
             density = vantrel.refl_to_density(given, None, "E", "GREEN")
             assert np.array_equal(density, expected) and not getattr(density, "attrs", None)
     halves = np.arange(380, 731, 2.5)
@@ -79,6 +81,8 @@ SQUARE = np.resize(SPECTRA, (31, 31))
         (xr.DataArray(SQUARE, {"f": NM}, ("f", "patch")), "along 'f'.*transpose"),
         (pd.DataFrame(SQUARE, index=NM), "along 'index'.*transpose"),
         (xr.DataArray(SPECTRA, {"nm": NM + 10}, ("patch", "nm")), "range is too short"),
+        (xr.DataArray(SPECTRA, {"wl": ("b", NM + 10)}, ("patch", "b")), "range is too short"),
+        (xr.DataArray(SQUARE, {"wl": ("f", NM)}, ("f", "patch")), "along 'f'.*transpose"),
         (xr.DataArray(SPECTRA[:, :16], {"nm": NM[:16] * 2 - 400}, ("p", "nm")), "between 400 and 4"),
         (pd.DataFrame(SPECTRA, columns=NM - 5), "range is too short"),
         (pd.DataFrame(np.resize(SPECTRA, (2, 32)), columns=np.arange(395, 706, 10)), "at 395 and 405"),

@@ -5,6 +5,7 @@ import os
 import pickle
 import re
 import shlex
+import shutil
 import subprocess
 import warnings
 from dataclasses import replace
@@ -313,6 +314,45 @@ def test_what_is_written_reads_back(sheet, tmp_path):
     for refused, reason in (odd, "transmittance"), (replace(sheet, spectra=sheet.spectra / 50), "scale"):
         with pytest.raises(ValueError, match=reason):
             refused.write(tmp_path / "refused.csv")
+
+
+@pytest.mark.filterwarnings("ignore:.*would agree")
+def test_what_is_written_over_stays_whole(sheet, tmp_path, monkeypatch):
+    for name in "measured.txt", "again.csv":
+        shutil.copy(EXAMPLE, tmp_path / name)
+    os.link(tmp_path / "measured.txt", tmp_path / "linked.txt")
+    measured, again = (vantrel.read(tmp_path / name) for name in ("measured.txt", "again.csv"))
+    for result in measured, vantrel.report(measured), vantrel.predict(measured):
+        with pytest.raises(ValueError, match="linked.txt is the measurement itself"):
+            result.write(tmp_path / "linked.txt")
+    with pytest.raises(ValueError, match="again.csv is the measurement itself"):
+        vantrel.compare(measured, replace(again, spectra=again.spectra * 0.9)).write(tmp_path / "again.csv")
+
+    written = tmp_path / "written.txt"
+    written.write_text("old")
+    written.chmod(0o640)
+    with monkeypatch.context() as full:
+        full.setattr(os, "replace", lambda *_: (_ for _ in ()).throw(OSError(28, "No space left on device")))
+        with pytest.raises(OSError, match="No space"):
+            vantrel.report(measured).write(written)
+    assert written.read_text() == "old"
+    unreadable = replace(sheet, spectra=np.where(np.arange(31)[:, None] == 2, np.nan, sheet.spectra))
+    with pytest.raises(ValueError, match=f"{sheet.names[2]!r} holds what is no number"):
+        unreadable.write(written)
+    measured.write(written)
+    assert written.stat().st_mode & 0o777 == 0o640 and np.array_equal(vantrel.read(written).spectra, sheet.spectra)
+    assert sorted(path.name for path in tmp_path.iterdir()) == [
+        "again.csv", "linked.txt", "measured.txt", "written.txt"
+    ]
+
+
+def test_spectra_that_are_put_in_are_judged_with_their_scale_in_doubt(sheet):
+    doubts = {1 / 100: "all reflectances are at most 1.5 %: multiply fractions by 100",
+              4: f"the largest reflectance is {4 * sheet.spectra.max():.4g} %"}
+    for factor, doubt in doubts.items():
+        other = replace(sheet, spectra=sheet.spectra * factor, file="other")
+        with pytest.warns(UserWarning, match=re.escape(f"other: {doubt}")):
+            assert f"other: {doubt}" in vantrel.report(other).to_html()
 
 
 def test_a_sheet_shows_what_it_is(sheet):

@@ -9,7 +9,7 @@ from typing import Any, Dict, List, Literal, Mapping, Optional, Sequence, Tuple,
 
 import numpy as np
 
-from ._arguments import INDICES
+from ._arguments import FRACTION, INDICES
 from ._enums import IllumObs, Status
 from ._ink import Ink
 from ._predictions import Predictions
@@ -36,6 +36,7 @@ StatusName = Union[
 Formula = Literal["de2000", "cmc", "de94", "de76"]
 Inks = Union[Mapping[str, float], Sequence[Tuple[str, float]], None]
 Path = Union[str, "os.PathLike[str]"]
+_BRIGHTEST = 200  # percent; papers with much brightener come to 150
 _LARGEST = 1e6  # of reflectances in percent and of colours, as the readers take them
 
 
@@ -48,6 +49,17 @@ def _doubles(values: Any, shape: Tuple[int, ...], name: str, missing: bool = Fal
     return array
 
 
+def _scale_doubts(sheet: Sheet) -> List[str]:
+    """What read() would say of the scale, of spectra that were put into a sheet."""
+    known = any("--scale" in warning for warning in sheet._warnings)
+    if sheet.spectra is None or sheet.kind != "reflectance" or known:
+        return []
+    largest = np.max(sheet.spectra, initial=0)
+    if largest <= FRACTION:
+        return [f" all reflectances are at most {FRACTION} %: multiply fractions by 100"]
+    return [f" the largest reflectance is {largest:.4g} %"] if largest > _BRIGHTEST else []
+
+
 def _fields(sheet: Sheet) -> Dict[str, Any]:
     """A sheet as the extension takes it."""
     patches = len(sheet)
@@ -57,7 +69,7 @@ def _fields(sheet: Sheet) -> Dict[str, Any]:
         raise ValueError(f"sheet: a sheet of kind {sheet.kind!r} with spectra {sheet.spectra}")
     lines = sheet.lines if len(sheet.lines) == patches else np.zeros(patches)
     taken: Dict[str, Any] = {name: getattr(sheet, name) for name in vars(sheet)}
-    taken["warnings"] = [*sheet._warnings]
+    taken["warnings"] = [*sheet._warnings, *_scale_doubts(sheet)]
     taken["lines"] = _doubles(lines, (patches,), "lines")
     taken["device"] = {
         field: _doubles(column, (patches,), field, missing=True)
@@ -83,7 +95,8 @@ def _answer(command: str, sheets: Sequence[Sheet], options: Dict[str, Any], form
 
 def _result(kind: Any, command: str, sheets: Sequence[Sheet], options: Dict[str, Any]) -> Any:
     names = {key: value for key, value in options.items() if value is not None}
-    result = kind._of(functools.partial(_answer, command, sheets, names))
+    read_from = [sheet._read_from for sheet in sheets if sheet._read_from]
+    result = kind._of(functools.partial(_answer, command, sheets, names), read_from)
     told = {f"{s.file}:{line}" for s in sheets for line in s._warnings}
     not_judged = [f"not judged: {reason}" for reason in getattr(result, "unread", ())]
     for line in [*result.warnings, *not_judged]:

@@ -5,7 +5,9 @@ import html
 import json
 import os
 from dataclasses import fields, is_dataclass
-from typing import Any, Callable, Dict, Union, get_args, get_origin, get_type_hints
+from typing import Any, Callable, Dict, Sequence, Union, get_args, get_origin, get_type_hints
+
+from ._file import write_text
 
 FORMULAS = ("de2000", "cmc", "de94", "de76")
 
@@ -41,13 +43,15 @@ class Result:
     json: str
     """The document that `vantrel --format json` prints, byte for byte."""
     _answer: Callable[[str], str]
+    _read_from: Sequence[str]
 
     @classmethod
-    def _of(cls, answer: Callable[[str], str]) -> Any:
+    def _of(cls, answer: Callable[[str], str], read_from: Sequence[str]) -> Any:
         text = answer("json")
         result = made(cls, cls._body(json.loads(text)))
         object.__setattr__(result, "json", text)
         object.__setattr__(result, "_answer", answer)
+        object.__setattr__(result, "_read_from", read_from)
         return result
 
     @staticmethod
@@ -64,14 +68,15 @@ class Result:
         return self._answer("html")
 
     def write(self, file: Union[str, "os.PathLike[str]"]) -> None:
-        """Writes .json, .html, .csv, or CGATS text as .txt, which the ending of the name chooses."""
+        """Writes .json, .html, .csv, or CGATS text as .txt, which the ending of the name chooses.
+
+        The file is replaced as a whole; that of a measurement is refused.
+        """
         ending = os.path.splitext(os.fspath(file))[1].lower()
         formats = {".json": "json", ".html": "html", ".csv": "csv", ".txt": "cgats"}
         if ending not in formats:
             raise ValueError(f"file: its name ends in {', '.join(formats)}, not {ending!r}")
-        text = self._answer(formats[ending])
-        with open(file, "w", encoding="utf-8", newline="") as opened:
-            opened.write(text)
+        write_text(file, self._answer(formats[ending]), self._read_from)
 
     def __str__(self) -> str:
         return self._answer("table")

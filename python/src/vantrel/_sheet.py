@@ -4,7 +4,7 @@ import html
 import os
 import re
 import warnings
-from dataclasses import dataclass, field
+from dataclasses import dataclass, field, replace
 from typing import Any, Dict, List, Literal, Optional, Sequence, Union
 
 import numpy as np
@@ -12,6 +12,7 @@ from numpy.typing import NDArray
 
 from ._colour import refl_to_cielab
 from ._enums import IllumObs
+from ._file import write_text
 from ._text import cgats_text, csv_text
 from ._wavelengths import NM
 
@@ -121,6 +122,7 @@ class Sheet:
     has_ids: bool = True
     lines: Sequence[int] = ()
     _warnings: Sequence[str] = ()  # in the words of the program
+    _read_from: str = ""
 
     def __repr__(self) -> str:
         return f"<Sheet of {self.file}: {len(self)} patches, {self.kind}>"
@@ -166,14 +168,17 @@ class Sheet:
     def write(self, file: Union[str, "os.PathLike[str]"]) -> None:
         """Writes CSV to a name that ends in .csv, CGATS text (ISO 28178) to one in .txt.
 
-        read() gives the same doubles back; CSV has no room for the origin.
+        read() gives the same doubles back; CSV has no room for the origin. The file is replaced as a
+        whole; the one that the sheet was read from is refused.
         """
         ending = os.path.splitext(os.fspath(file))[1].lower()
         if ending not in (".csv", ".txt"):
             raise ValueError(f"file: its name ends in .csv or .txt, not {ending!r}")
+        if self.spectra is not None and not np.all(np.isfinite(self.spectra)):
+            row = int(np.argmin(np.isfinite(self.spectra).all(-1)))
+            raise ValueError(f"spectra: {self.names[row]!r} holds what is no number")
         text = csv_text(self) if ending == ".csv" else cgats_text(self)
-        with open(file, "w", encoding="utf-8", newline="") as opened:
-            opened.write(text)
+        write_text(file, text, [self._read_from] if self._read_from else [])
 
     def _colours(self) -> Any:
         """(L*a*b*, what it is for) of the patches that a notebook shows."""
@@ -301,7 +306,8 @@ def read(
     """
     with open(file, "rb") as opened:
         content = opened.read()
-    return _sheet(content, os.fspath(file), scale, condition, 3)
+    sheet = _sheet(content, os.fspath(file), scale, condition, 3)
+    return replace(sheet, _read_from=os.path.abspath(file))
 
 
 def reads(content: bytes, *, scale: Scale = "automatic", condition: Condition = None) -> Sheet:

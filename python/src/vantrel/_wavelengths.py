@@ -101,9 +101,21 @@ def _refuse_turned(dims, last, name):
                 )
 
 
+def _labels_along(value, dim):
+    """The labels of a dimension: its wavelengths, should another coordinate along it hold these.
+
+    Along patches numbers may look like wavelengths; there the name counts.
+    """
+    for name, coordinate in value.coords.items():
+        known = dim == value.dims[-1] or str(name).lower() in _NAMES
+        if known and coordinate.dims == (dim,) and _is_spectral(None, coordinate.values):
+            return coordinate.values
+    return value.coords[dim].values if dim in value.coords else None
+
+
 def bands_of_xarray(value, name):
     """A labelled array of spectra, at 400, 410, ... 700 nm where it has wavelengths."""
-    labels = [(d, value.coords[d].values if d in value.coords else None) for d in value.dims]
+    labels = [(d, _labels_along(value, d)) for d in value.dims]
     if not labels:
         return value
     _refuse_turned(labels[:-1], labels[-1], name)
