@@ -1,6 +1,7 @@
 // Text out. What is of the system is in output_file_posix.cpp and system_windows.cpp.
 #pragma once
 
+#include <optional>
 #include <string>
 #include <string_view>
 #include <sys/stat.h>
@@ -18,8 +19,9 @@ OutputError not_made_in(const std::string &folder);
 
 // Takes text for a file, or for standard output where the path is empty or "-". A file has either
 // its old content or all of the new one, also when a signal ends the program: it is written under a
-// temporary name beside its own, with the rights, owner and group of the old one, and renamed. What
-// is no regular file (a device, a pipe) is written straight. There is one at a time.
+// temporary name beside its own, with the rights, access list, attributes, owner and group of the
+// old one, and renamed. What is no regular file (a device, a pipe) is written straight. There is
+// one at a time.
 class OutputFile {
 public:
     explicit OutputFile(std::string path) : path(std::move(path)) {}
@@ -45,7 +47,7 @@ private:
     std::string buffer;
     int file = -1;
     std::string temporary, replaced; // both empty where the file is written straight
-    unsigned mode = 0;               // that the file will have
+    std::optional<unsigned> mode;    // that of the old file
 };
 
 } // namespace vantrel::program

@@ -4,6 +4,8 @@
 #include "read/measurement.h"
 #include "read/text.h"
 
+#include <fmt/format.h>
+
 #include <cerrno>
 #include <climits>
 #include <csignal>
@@ -13,6 +15,11 @@
 #include <memory>
 #include <sys/stat.h>
 #include <unistd.h>
+
+#ifdef __linux__
+#include <linux/limits.h>
+#include <sys/xattr.h>
+#endif
 
 namespace vantrel::program {
 namespace {
@@ -30,15 +37,22 @@ extern "C" void remove_and_end(int signal)
     static_cast<void>(raise(signal)); // as if there were no handler, by SA_RESETHAND
 }
 
-// Makes the temporary file and has signals remove it, without a moment between.
-int make_temporary(std::string &name)
+// Makes the temporary file and has signals remove it, without a moment between. Its name has a
+// number for "XXXXXX".
+int make_temporary(std::string &name, mode_t mode)
 {
     sigset_t ending, before;
     sigemptyset(&ending);
     for (const int signal : kEnding)
         sigaddset(&ending, signal);
     sigprocmask(SIG_BLOCK, &ending, &before);
-    const int file = mkostemp(name.data(), O_CLOEXEC);
+    int file = -1;
+    for (unsigned number = static_cast<unsigned>(getpid());; ++number) {
+        fmt::format_to(name.end() - 6, "{:06x}", number & 0xFFFFFF);
+        file = open(name.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, mode);
+        if (file >= 0 || errno != EEXIST)
+            break;
+    }
     const int error = errno;
     if (file >= 0) {
         doomed[name.copy(doomed, sizeof doomed - 1)] = '\0';
@@ -62,12 +76,25 @@ void refuse_what_was_read(const struct stat &target, const std::string &name)
         throw sheets::RequestError{name + " has been read; the output would write over it"};
 }
 
-// The permissions of a new file.
-mode_t usual_mode()
+// Access lists and what users attach to a file, from the old one to the new.
+bool copy_attributes(const std::string &from, int to)
 {
-    const mode_t mask = umask(0);
-    umask(mask);
-    return 0666 & ~mask;
+#ifdef __linux__
+    static_cast<void>(fremovexattr(to, "system.posix_acl_access")); // which the folder may give
+    std::string names(XATTR_LIST_MAX, '\0'), value(XATTR_SIZE_MAX, '\0');
+    const ssize_t size = listxattr(from.c_str(), names.data(), names.size());
+    for (ssize_t at = 0; at < size;) {
+        const std::string name = names.c_str() + at;
+        at += static_cast<ssize_t>(name.size()) + 1;
+        if (name != "system.posix_acl_access" && !name.starts_with("user."))
+            continue;
+        const ssize_t got = getxattr(from.c_str(), name.c_str(), value.data(), value.size());
+        if (got < 0 ||
+            fsetxattr(to, name.c_str(), value.data(), static_cast<std::size_t>(got), 0) != 0)
+            return false;
+    }
+#endif
+    return true;
 }
 
 } // namespace
@@ -87,7 +114,7 @@ void OutputFile::finish()
     if (file == STDOUT_FILENO)
         return;
     // On the disk before it takes the name, so that a crash of the machine leaves no empty file.
-    if (!temporary.empty() && (fchmod(file, mode) != 0 || fsync(file) != 0))
+    if (!temporary.empty() && ((mode && fchmod(file, *mode) != 0) || fsync(file) != 0))
         throw output_error_now();
     if (close(std::exchange(file, -1)) != 0)
         throw output_error_now();
@@ -125,7 +152,6 @@ void OutputFile::open()
         if (errno != ENOENT || lstat(path.c_str(), &target) == 0)
             throw output_error_now();
         open_beside(path);
-        mode = usual_mode();
     } else if (!S_ISREG(target.st_mode)) {
         file = ::open(path.c_str(), O_WRONLY | O_NOCTTY | O_CLOEXEC);
     } else {
@@ -150,13 +176,16 @@ void OutputFile::open_to_replace(const struct stat &target)
     }
     if (access(path.c_str(), W_OK) != 0)
         throw output_error_now();
+    mode = target.st_mode & 07777;
     open_beside(real);
     if (fstat(file, &made) != 0)
         throw output_error_now();
     if ((made.st_uid != target.st_uid || made.st_gid != target.st_gid) &&
         fchown(file, target.st_uid, target.st_gid) != 0)
         throw OutputError{"a new file cannot be given its owner and group; choose another name"};
-    mode = target.st_mode & 07777;
+    if (!copy_attributes(real, file))
+        throw OutputError{
+            "a new file cannot be given its access list or attributes; choose another name"};
 }
 
 void OutputFile::open_beside(const std::string &target)
@@ -165,7 +194,8 @@ void OutputFile::open_beside(const std::string &target)
     const auto slash = target.rfind('/');
     const std::string folder = slash == std::string::npos ? "" : target.substr(0, slash + 1);
     std::string name = folder + ".vantrel.XXXXXX"; // of no more characters where the name has 255
-    file = make_temporary(name);
+    // A new file has the usual rights, less the user's mask, or those that the folder gives.
+    file = make_temporary(name, mode ? 0600 : 0666);
     if (file < 0)
         throw not_made_in(folder);
     temporary = name;
