@@ -99,7 +99,17 @@ test('a table pasted by the keyboard, inks to predict, a result saved', async ()
   const waiting = page.waitForEvent('download');
   await page.getByLabel('Save as').first().selectOption('CSV');
   await page.getByRole('button', { name: 'Save as' }).click();
+  assert.equal((await waiting).suggestedFilename(), 'report.csv');
   assert.match(readFileSync(await (await waiting).path(), 'utf8'), /^file,.*nm700,warnings\r?\nPasted table 1,/);
+  const sheet = page.locator('label', { hasText: /^Sheet/ }).locator('select');
+  await sheet.selectOption('Pasted table 1');
+  await page.getByLabel(/^Or paste a table/).fill(rows);
+  await page.getByRole('button', { name: 'Read the table' }).click();
+  await page.getByText('Pasted table 2 · ').waitFor();
+  assert.equal(await sheet.locator('option:checked').innerText(), 'Pasted table 1');
+  await page.getByLabel(/^Inks/).fill('Magenta 100:40, Gelb: 70');
+  await press(page, 'Predict overprints');
+  assert.match(await page.innerText('#result'), /Magenta 100 40 % \+ .* 70 %/);
   assert.deepEqual(page.complaints, []);
   await page.close();
 });

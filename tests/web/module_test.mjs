@@ -61,7 +61,9 @@ test('spectra in memory are a sheet', () => {
     .map((sheet) => vantrel.report(sheet, { paper: 'Paper' }).sheets[0].patches);
   assert.deepEqual(b.map(({ name, lab, density }) => [name, lab, density]),
     a.map(({ name, lab, density }) => [name, lab, density]));
+  assert.deepEqual([file.ids, names], [a.map(({ id }) => id), a.map(({ name }) => name)]);
   assert.throws(() => vantrel.readSpectra(spectra.subarray(1)), /rows of 31/);
+  assert.throws(() => vantrel.readSpectra(spectra, { names: names.slice(1) }), /with a name each/);
   file.close();
   assert.throws(() => vantrel.report(file), /press\.txt is closed/);
 });

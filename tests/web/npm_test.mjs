@@ -144,6 +144,7 @@ test('rows are what single calls are', () => {
   rows.forEach((value, i) => assert.equal(value,
     vantrel.labToDE2000(first.subarray(i * 3, i * 3 + 3), second.subarray(i * 3, i * 3 + 3), 1, 1)));
   assert.deepEqual(vantrel.densityToDotArea(1.5, [0.3, 0.7], 1)[1], vantrel.densityToDotArea(1.5, 0.7, 1));
+  assert.throws(() => vantrel.labToDE2000(first, second.subarray(3), 1, 1), /equally many rows, or of one/);
   assert.throws(() => vantrel.reflToCIELAB(lab, 'D50_2DEG'), /reflToCIELAB\(\) takes rows of 31 numbers/);
   assert.throws(() => vantrel.reflToCIELAB(new Float64Array(31), 'D51'), /illumObs of reflToCIELAB\(\) is D51/);
   assert.throws(() => vantrel.reflToDensity(new Float64Array(62), null, 99, 1), /row 0: for /);
