@@ -9,6 +9,7 @@
 #include <algorithm>
 #include <cmath>
 #include <iterator>
+#include <map>
 
 namespace vantrel::sheets {
 
@@ -58,12 +59,12 @@ void ObjectText::append(std::string_view value)
 ObjectText patch_text(const PatchReport &patch, int status)
 {
     ObjectText out, device;
-    const auto &values = patch.patch->device;
-    for (auto value = values.begin(); value != values.end(); ++value) {
-        const auto same = [&](const auto &other) { return other.first == value->first; };
-        if (std::none_of(values.begin(), value, same)) // the last of a name holds
-            device.add(value->first, std::find_if(values.rbegin(), values.rend(), same)->second);
-    }
+    std::map<std::string_view, double> last; // of a name that stands twice
+    for (const auto &[field, value] : patch.patch->device)
+        last[field] = value;
+    for (const auto &[field, value] : patch.patch->device)
+        if (const auto found = last.extract(field))
+            device.add(field, found.mapped());
     out.add("id", patch.patch->id);
     out.add("name", patch.patch->name);
     out.add("device", device);
