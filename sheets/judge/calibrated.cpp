@@ -308,7 +308,13 @@ void CalibratedModel::fit(ILLUM_OBS illuminant)
         (sums - de00.row(i).transpose()).minCoeff(&without);
         errors.push_back(de00(i, without));
     }
-    left_out = {errors.size(), statistics_of(errors)};
+    const auto solids =
+        std::count_if(measured.begin(), measured.end(), [this](const auto &overprint) {
+            const Tints &tints = overprint.first;
+            return tints.size() > 1 && knows(tints) && all_solid(tints);
+        });
+    left_out = {errors.size(), statistics_of(errors), static_cast<std::size_t>(solids),
+                all.size() - count};
 }
 
 std::optional<Spectrum> CalibratedModel::predict(const Tints &tints) const

@@ -36,10 +36,12 @@ public:
     static bool ends_range(double n_factor); // of those that are tried
 
     // ΔE00 of the sheet's overprints with tints, each predicted without it, n chosen without it
-    // too; nothing where there are none.
+    // too; nothing where there are none. Overprints of solids alone are not among them, nor are
+    // those passed over by an even choice of very many.
     struct Error {
         std::size_t patches;
         Statistics de00;
+        std::size_t solids, passed_over;
     };
     const std::optional<Error> &error() const { return left_out; }
 

@@ -74,11 +74,17 @@ std::string fit_of(const Predictions &predictions)
                         : "");
     if (!predictions.error)
         return out + "no overprints of tints tell its error";
-    return out + fmt::format("on {} overprints that it was not shown, each in turn, mean ΔE00 {}, "
-                             "95 % {}, largest {}",
-                             predictions.error->patches, fixed(predictions.error->de00.mean),
-                             fixed(predictions.error->de00.p95),
-                             fixed(predictions.error->de00.max));
+    const CalibratedModel::Error &error = *predictions.error;
+    out += fmt::format("on {} overprint{} with tints that it was not shown, each in turn, mean "
+                       "ΔE00 {}, 95 % {}, largest {}",
+                       error.patches, error.patches == 1 ? "" : "s", fixed(error.de00.mean),
+                       fixed(error.de00.p95), fixed(error.de00.max));
+    if (error.solids)
+        out += fmt::format("; not on {} of solids alone", error.solids);
+    if (error.passed_over)
+        out += fmt::format("{} {} beyond an even choice", error.solids ? ", nor on" : "; not on",
+                           error.passed_over);
+    return out;
 }
 
 // What the sheet lacks, each once.
@@ -109,7 +115,9 @@ Json calibration_json(const Predictions &predictions)
         error = {{"patches", predictions.error->patches},
                  {"mean", predictions.error->de00.mean},
                  {"p95", predictions.error->de00.p95},
-                 {"max", predictions.error->de00.max}};
+                 {"max", predictions.error->de00.max},
+                 {"solids", predictions.error->solids},
+                 {"passed_over", predictions.error->passed_over}};
     return {{"n", or_null(predictions.n_factor)},
             {"left_out_error", error},
             {"missing", predictions.n_factor ? Json() : Json(predictions.not_calibrated)},

@@ -59,12 +59,17 @@ class Prediction:
 
 @dataclass(frozen=True)
 class LeftOutError:
-    """Of the calibrated model, ΔE00 on so many `patches`, each predicted without itself."""
+    """Of the calibrated model, ΔE00 on so many `patches`, each predicted without itself.
+
+    Not among them are the overprints of `solids` alone, and those `passed_over` of very many.
+    """
 
     patches: int
     mean: float
     p95: float
     max: float
+    solids: int
+    passed_over: int
 
 
 @dataclass(frozen=True)
