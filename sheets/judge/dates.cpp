@@ -212,9 +212,10 @@ std::array<std::optional<Date>, 2> dates_in(std::string_view text)
                                                std::chrono::month(day->month),
                                                std::chrono::day(day->day)};
         if (date.ok())
-            out[i] =
-                Date{time.kind, 86400.0 * std::chrono::sys_days(date).time_since_epoch().count() +
-                                    time.seconds};
+            out[i] = Date{time.kind,
+                          86400.0 * static_cast<double>(
+                                        std::chrono::sys_days(date).time_since_epoch().count()) +
+                              time.seconds};
     }
     for (std::size_t i = 0; i < out.size(); ++i)
         if (!out[i])

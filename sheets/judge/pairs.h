@@ -8,6 +8,7 @@
 #include <set>
 #include <string>
 #include <string_view>
+#include <tuple>
 #include <vector>
 
 namespace vantrel::sheets {
@@ -29,7 +30,10 @@ struct PairingRequest {
 struct Pair {
     std::vector<std::size_t> reference, sample;
 
-    friend auto operator<=>(const Pair &, const Pair &) = default;
+    friend bool operator<(const Pair &first, const Pair &second)
+    {
+        return std::tie(first.reference, first.sample) < std::tie(second.reference, second.sample);
+    }
 };
 
 // The places of several pairs, each once.

@@ -377,6 +377,8 @@ SheetReadings readings_of(const Measurement &aims, Measurement measured, Compare
     add_statistics(reader.readings, all, comparison);
     out.readings = std::move(reader.readings);
     out.coverage = comparison.coverage;
+    for (const Unpaired &aim : comparison.only_reference)
+        out.unserved.push_back(aim.name);
     out.limits = std::move(comparison.limits);
     out.verdict = comparison.verdict;
     out.advice = std::move(comparison.advice);

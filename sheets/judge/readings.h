@@ -60,8 +60,9 @@ struct ZoneReading {
 struct SheetReadings {
     std::vector<ZoneReading> readings;
     Coverage coverage;
-    std::vector<LimitResult> limits; // on the means of the zones
-    std::optional<Verdict> verdict;  // of compare()
+    std::vector<std::string> unserved; // aims without a patch
+    std::vector<LimitResult> limits;   // on the means of the zones
+    std::optional<Verdict> verdict;    // of compare()
     std::vector<SolidAdvice> advice;
     std::vector<std::string> warnings;
 };

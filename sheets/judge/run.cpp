@@ -1,6 +1,7 @@
 #include "judge/run.h"
 
 #include "judge/dates.h"
+#include "judge/run_limits.h"
 #include "read/text.h"
 
 #include <fmt/format.h>
@@ -17,77 +18,6 @@ namespace vantrel::sheets {
 namespace {
 
 constexpr std::size_t kAhead = 10; // sheets for which the drift is followed
-
-// The reading of a single patch that a limit bounds on each sheet; nothing where it bounds none.
-std::optional<Attribute> attribute_of(const Tolerance &limit)
-{
-    using enum Quantity;
-    const bool solids = limit.group == Group::solids || limit.group == Group::spots;
-    const Metric &metric = limit.metric;
-    const bool de00 = limit.quantity == colour_difference && metric.formula == Formula::de2000 &&
-                      metric.lightness == 1 && metric.chroma == 1;
-    if (de00 && limit.group == Group::all && limit.statistic == Statistic::mean)
-        return Attribute::mean_de00;
-    if (limit.statistic != Statistic::maximum)
-        return std::nullopt;
-    if (limit.quantity == density && solids)
-        return Attribute::density;
-    if (limit.quantity == gain && limit.group == Group::tints)
-        return Attribute::tone_value;
-    if (limit.group == Group::neutrals && limit.quantity == neutral_chroma)
-        return Attribute::delta_ch;
-    if (limit.group == Group::neutrals && limit.quantity == lightness)
-        return Attribute::delta_l;
-    if (!de00)
-        return std::nullopt;
-    return limit.group == Group::paper ? std::optional(Attribute::paper)
-           : solids                    ? std::optional(Attribute::solid)
-           : limit.group == Group::all ? std::optional(Attribute::max_de00)
-                                       : std::nullopt;
-}
-
-bool is_about(const Tolerance &limit, const Measurand &measurand)
-{
-    return attribute_of(limit) == measurand.attribute &&
-           (limit.ink.empty() || ink_title(limit.ink) == measurand.subject) &&
-           (limit.group != Group::spots || !is_process_ink(measurand.subject)) &&
-           (!limit.nominal || *limit.nominal == measurand.nominal);
-}
-
-// The aim of a gain is over the nominal value.
-std::optional<double> aim_of(const Tolerance &limit, const Measurand &measurand)
-{
-    if (!limit.aim)
-        return std::nullopt;
-    return measurand.attribute == Attribute::tone_value ? measurand.nominal + *limit.aim
-                                                        : *limit.aim;
-}
-
-// Nothing where there is no aim to stay by.
-std::optional<Limits> limits_of(const Measurand &measurand, const std::optional<double> &aim,
-                                double limit)
-{
-    switch (measurand.attribute) {
-    case Attribute::density:
-    case Attribute::tone_value:
-        return aim ? std::optional(Limits{*aim - limit, *aim + limit}) : std::nullopt;
-    case Attribute::delta_l:
-        return Limits{-limit, limit};
-    default: // differences
-        return Limits{{}, limit};
-    }
-}
-
-// The stricter on each side.
-Limits both(const Limits &first, const Limits &second)
-{
-    Limits out = first;
-    if (second.low && (!out.low || *second.low > *out.low))
-        out.low = second.low;
-    if (second.high && (!out.high || *second.high < *out.high))
-        out.high = second.high;
-    return out;
-}
 
 OverZones over_zones(const ZoneReading &reading)
 {
@@ -178,6 +108,12 @@ void RunJudge::add(const Measurement &sheet)
             for (const auto &[zone, value] : reading.zones)
                 zones.insert(zone);
         entry.sheet.zones.assign(zones.begin(), zones.end());
+        if (entries.empty())
+            unserved = entry.readings.unserved;
+        std::erase_if(unserved, [&own = entry.readings.unserved](const std::string &aim) {
+            return std::find(own.begin(), own.end(), aim) == own.end();
+        });
+        entry.readings.unserved = {};
         entries.push_back(std::move(entry));
     } catch (const RequestError &error) {
         add_unread(error.message.starts_with(sheet.file)
@@ -265,12 +201,7 @@ void RunJudge::add_series(Run &run) const
 void RunJudge::judge(RunSeries &series) const
 {
     for (const Tolerance &limit : request.tolerances.limits)
-        if (is_about(limit, series.measurand)) {
-            if (const auto aim = aim_of(limit, series.measurand))
-                series.aim = aim;
-            if (const auto limits = limits_of(series.measurand, series.aim, limit.limit))
-                series.limits = series.limits ? both(*series.limits, *limits) : *limits;
-        }
+        bound(series, limit);
     Series values;
     for (const auto &sheet : series.sheets)
         values.push_back(sheet ? std::optional(sheet->value) : std::nullopt);
@@ -383,7 +314,21 @@ void RunJudge::warn_of_few(Run &run) const
                         zones, kFewestOfOutliers));
 }
 
-void RunJudge::add_advice(Run &run) const { run.advice = entries.back().readings.advice; }
+// For the last sheet, even if that is unlike the others.
+void RunJudge::add_advice(Run &run) const
+{
+    run.advice = entries.back().readings.advice;
+    const std::size_t last = entries.size() - 1;
+    const bool apart =
+        std::any_of(run.series.begin(), run.series.end(), [last](const RunSeries &series) {
+            return std::find(series.outliers.begin(), series.outliers.end(), last) !=
+                   series.outliers.end();
+        });
+    if (apart && !run.advice.empty())
+        run.warnings.push_back(fmt::format("the advice is for the last sheet, {}, which stands "
+                                           "apart from the others",
+                                           entries[last].sheet.file));
+}
 
 // Sheets of one run are of one job, read by one instrument in one way, and no two are one.
 void RunJudge::compare_origins(Run &run) const
@@ -450,8 +395,11 @@ void RunJudge::add_warnings(Run &run) const
 Run RunJudge::result()
 {
     if (entries.empty())
-        throw RequestError{fmt::format("none of the {} sheets can be judged; {}", unread.size(),
-                                       unread.empty() ? "there is none" : unread[0])};
+        throw RequestError{unread.empty() ? "there is no sheet"
+                           : unread.size() == 1
+                               ? "the sheet cannot be judged; " + unread[0]
+                               : fmt::format("none of the {} sheets can be judged; {}",
+                                             unread.size(), listed(unread, "; "))};
     Run run{.aims = aims.file,
             .illuminant = *illuminant,
             .status = request.status,
@@ -474,6 +422,8 @@ Run RunJudge::result()
     find_gaps(run);
     add_limits(run);
     add_advice(run);
+    if (!unserved.empty())
+        run.warnings.push_back(fmt::format("{}: no sheet has {}", aims.file, listed(unserved)));
     warn_of_few(run);
     compare_origins(run);
     add_warnings(run);

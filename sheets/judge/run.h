@@ -117,6 +117,7 @@ private:
     std::optional<IlluminantChoice> illuminant; // by the aims and the first sheet
     std::vector<Entry> entries;
     std::vector<std::string> unread;
+    std::vector<std::string> unserved; // aims of which no sheet has a patch
 };
 
 } // namespace vantrel::sheets

@@ -20,6 +20,9 @@ struct TableStyle {
     bool all_pairs = false; // of a comparison, not only the worst
 };
 
+// Behind a table that is read without them.
+void write_warnings(const std::vector<std::string> &warnings, const Sink &sink);
+
 void write_table(const std::vector<Report> &sheets, const Sink &sink, const TableStyle &style);
 void write_table(const Comparison &comparison, const Sink &sink, const TableStyle &style);
 void write_table(const Predictions &predictions, const Sink &sink, const TableStyle &style);

@@ -173,6 +173,8 @@ std::string head_of(const Run &run)
         out += fmt::format(", {} to {}", run.sheets.front().created, run.sheets.back().created);
     else if (run.sheets.size() > 1)
         out += ", as they were named";
+    else if (const std::string &created = run.sheets[0].created; !created.empty())
+        out += ", " + created;
     out += fmt::format("\n{}, {}", said(run.illuminant), status_name(run.status));
     for (const auto &[what, text] : {std::pair{"job", &run.job},
                                      {"instrument", &run.instrument},

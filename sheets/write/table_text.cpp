@@ -2,6 +2,7 @@
 
 #include "read/illuminant.h"
 #include "read/text.h"
+#include "write/result.h"
 
 #include <fmt/format.h>
 
@@ -66,6 +67,16 @@ void add_advice(Lines &lines, const std::string &title, const std::vector<SolidA
     }
     lines.add(std::string(kAdviceFrom));
     lines.add(std::string(kAdviceElse));
+}
+
+void write_warnings(const std::vector<std::string> &warnings, const Sink &sink)
+{
+    if (warnings.empty())
+        return;
+    Lines lines(sink);
+    lines.add("\nWarnings");
+    for (const std::string &warning : warnings)
+        lines.add("- " + warning);
 }
 
 void Lines::add(std::string line)

@@ -34,6 +34,17 @@ TEST(Trend, AnscombesFirstSet)
     EXPECT_FALSE(leaves_at(*trend.drift, {.low = 4, .high = {}}, anscombe, 10));
 }
 
+// Four times over, 44 readings: Student's t of 42 degrees of freedom is 2.0181.
+TEST(Trend, BeyondTheTableOfStudentsT)
+{
+    Series series;
+    for (int i = 0; i < 4; ++i)
+        series.insert(series.end(), anscombe.begin(), anscombe.end());
+    const Drift drift = trend_of(series)->drift.value();
+    EXPECT_NEAR(drift.slope, 0.0310134, 1e-7);
+    EXPECT_NEAR(drift.uncertainty, 0.0230459 * 2.0181, 1e-3 * drift.uncertainty);
+}
+
 TEST(Trend, SheetsWithoutTheReadingLeaveGaps)
 {
     const Trend trend = trend_of({{}, 2, {}, 6, 8, {}}).value();

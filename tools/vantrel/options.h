@@ -85,8 +85,11 @@ Outcome outcome_of(Result result, std::vector<std::string> warnings, const Optio
     if (options.format == "html")
         choose_for_page(result);
     const auto kept = std::make_shared<const Result>(std::move(result)); // std::function copies
-    const auto write = [kept, format = options.format, style](const Sink &sink) {
+    const bool to_file = !options.output.empty() && options.output != "-";
+    const auto write = [kept, format = options.format, style, to_file, warnings](const Sink &sink) {
         write_as(format, *kept, sink, style);
+        if (to_file && format == "table") // whose readers do not see standard error
+            write_warnings(warnings, sink);
     };
     return {write, options.output, std::move(warnings)};
 }

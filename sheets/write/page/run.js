@@ -74,7 +74,8 @@ const statistics = (result) => smallTable('Readings over the sheets', [
 export function runPage(result) {
   const about = [count(result.sheets.length, 'sheet'), result.job, result.instrument,
     result.condition, result.illuminant, result.status,
-    result.by_date ? `${result.sheets[0].created} to ${result.sheets.at(-1).created}` : '',
+    result.by_date ? `${result.sheets[0].created} to ${result.sheets.at(-1).created}`
+      : result.sheets.length === 1 ? result.sheets[0].created : '',
     `aims ${result.aims}`];
   return h('div', { class: 'sheet run' },
     h('header', {}, h('h1', {}, 'Press run'),
