@@ -87,54 +87,6 @@ bool is_own_report(const std::vector<std::string> &fields)
            std::find(fields.begin(), fields.end(), "dE00_paper") != fields.end();
 }
 
-// CMYK_M, CMYKOG_O, CMY_C, RGB_R, 6CLR_1: what the printer was asked for, by the standard's names.
-bool is_standard_device_field(std::string_view field)
-{
-    const std::string name = upper(field);
-    const auto end = std::min(name.find('_'), name.size());
-    const std::string_view space = std::string_view(name).substr(0, end);
-    return end + 1 < name.size() &&
-           (space == "RGB" || space == "CMY" ||
-            (space.starts_with("CMYK") &&
-             space.find_first_not_of("ABCDEFGHIJKLMNOPQRSTUVWXYZ") == std::string_view::npos) ||
-            (space.size() > 3 && space.ends_with("CLR") &&
-             space.find_first_not_of("0123456789") == space.size() - 3));
-}
-
-// The ink of a column such as cyan, magenta_pct, Yellow %, Orange (percent); empty where it is
-// kNone.
-// A lone C, Y or K may be chroma or a tristimulus value; initials say whether all four are there.
-std::string ink_of(std::string key, bool initials)
-{
-    std::erase_if(key, [](char c) { return c == '(' || c == ')' || c == '[' || c == ']'; });
-    bool percent = false;
-    for (const std::string_view unit : {"PERCENT", "PCT", "%"})
-        if (key.ends_with(unit)) {
-            key.erase(key.size() - unit.size());
-            percent = true;
-            break;
-        }
-    constexpr std::array process = {"CYAN", "MAGENTA", "YELLOW", "BLACK"};
-    constexpr std::string_view letters = "CMYK";
-    for (std::size_t i = 0; i < process.size(); ++i)
-        if (key == process[i] || (key.size() == 1 && key[0] == letters[i] && (percent || initials)))
-            return fmt::format("CMYK_{}", letters[i]);
-    if (percent)
-        for (const std::string_view other : {"ORANGE", "GREEN", "VIOLET", "RED", "BLUE", "WHITE"})
-            if (key == other)
-                return key;
-    return percent && (key.starts_with("SPOT") || key.starts_with("INK")) ? key : "";
-}
-
-// Whether a column that is none known may be that of an ink: a percentage, or SPOT_1, PC6_5, HEX_O.
-bool may_be_ink(std::string_view key)
-{
-    return key.ends_with('%') || key.ends_with("%)") || key.ends_with("%]") ||
-           key.ends_with("PCT") || key.find("PERCENT") != std::string_view::npos ||
-           key.starts_with("SPOT") || key.starts_with("HEX") ||
-           (key.size() > 2 && key.starts_with("PC") && key[2] >= '0' && key[2] <= '9');
-}
-
 [[noreturn]] void throw_twice(std::string_view field, std::size_t first, std::size_t second,
                               std::size_t line)
 {
@@ -273,18 +225,14 @@ void Table::find_spectra(std::size_t line)
 
 void Table::find_devices(const std::vector<std::string> &keys, std::size_t line)
 {
-    bool initials = true;
-    for (const char *initial : {"C", "M", "Y", "K"})
-        initials = initials && column_of(keys, {initial}) != kNone;
+    const std::vector<std::string> inks = inks_of(keys);
     const bool own = is_own_report(fields);
     const std::size_t swatch = column_of(keys, {"RGB"});
     std::map<std::string, std::size_t> seen;
     for (std::size_t i = 0; i < fields.size(); ++i) {
         const bool free = own && i > 2 && i < swatch; // a name of any kind, in percent
         const bool standard = is_standard_device_field(fields[i]);
-        std::string device = standard ? upper(fields[i])
-                             : free   ? fields[i]
-                                      : ink_of(keys[i], initials);
+        std::string device = standard ? upper(fields[i]) : free ? fields[i] : inks[i];
         if (device.empty())
             continue;
         free_names = free_names || !(standard || free);
@@ -293,21 +241,31 @@ void Table::find_devices(const std::vector<std::string> &keys, std::size_t line)
             throw_twice(fields[i], before->second, i, line);
         devices.push_back({i, std::move(device)});
     }
-    warn_of_inks(keys, line);
+    for (std::size_t i = 0; i < fields.size() && !own; ++i)
+        if (!reads(i))
+            doubtful.emplace_back(i, keys[i]);
+    heading = line;
 }
 
-void Table::warn_of_inks(const std::vector<std::string> &keys, std::size_t line)
+bool Table::reads(std::size_t column) const
+{
+    const std::array<std::size_t, 7> single = {id, name, condition, tint, lab[0], lab[1], lab[2]};
+    const auto is_it = [column](std::size_t known) { return known == column; };
+    return std::any_of(single.begin(), single.end(), is_it) ||
+           std::any_of(values.begin(), values.end(), is_it) ||
+           std::any_of(at_nm.begin(), at_nm.end(), is_it) ||
+           std::any_of(devices.begin(), devices.end(),
+                       [&](const Device &device) { return is_it(device.column); });
+}
+
+void Table::warn_of_inks()
 {
     std::vector<std::string> unknown;
-    for (std::size_t i = 0; i < fields.size(); ++i) {
-        const bool device = std::any_of(devices.begin(), devices.end(),
-                                        [i](const Device &known) { return known.column == i; });
-        const bool spectral = std::find(values.begin(), values.end(), i) != values.end();
-        if (!device && !spectral && i != tint && may_be_ink(keys[i]))
-            unknown.push_back(in_quotes(fields[i]));
-    }
+    for (const DoubtfulColumn &doubt : doubtful)
+        if (doubt.may_be_ink())
+            unknown.push_back(in_quotes(fields[doubt.column]));
     if (!unknown.empty())
-        sheet.warn(line,
+        sheet.warn(heading,
                    fmt::format("{} left out, no name of an ink; \"Spot 1 %\" is one, and columns "
                                "Ink and Tint take any",
                                listed(unknown)));
@@ -431,12 +389,15 @@ void Table::add(const Row &row, Condition given, std::size_t line)
     percent_signs = false;
     patch.device = device_values(row, line);
     free_names = free_names && !percent_signs;
+    for (DoubtfulColumn &doubt : doubtful)
+        doubt.take(row.values[doubt.column]);
     const Condition own = condition == kNone ? std::nullopt : condition_in(row.values[condition]);
     sheet.add(std::move(patch), own ? own : given, line);
 }
 
 void Table::finish()
 {
+    warn_of_inks();
     std::vector<Patch> &patches = sheet.patches;
     double largest = 0;
     for (const Patch &patch : patches)

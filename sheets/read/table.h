@@ -1,6 +1,7 @@
 // Rows of named columns, as CGATS text and CSV hold them, and the patches that they are.
 #pragma once
 
+#include "read/ink_columns.h"
 #include "read/lines.h"
 #include "read/sheet.h"
 
@@ -45,7 +46,8 @@ private:
     void find_spectra(std::size_t line);
     void find_colours(const std::vector<std::string> &keys);
     void find_devices(const std::vector<std::string> &keys, std::size_t line);
-    void warn_of_inks(const std::vector<std::string> &keys, std::size_t line);
+    bool reads(std::size_t column) const;
+    void warn_of_inks();
     const Bands &bands(const Row &row, std::size_t line);
     std::optional<CIELABCOORD> colour(const Row &row, std::size_t line) const;
     std::vector<std::pair<std::string, double>> device_values(const Row &row, std::size_t line);
@@ -65,6 +67,8 @@ private:
     std::size_t id, name, condition, ink, tint;
     std::array<std::size_t, 3> lab; // L*, a*, b*, or X, Y, Z where the sheet says so
     std::vector<Device> devices;
+    std::vector<DoubtfulColumn> doubtful;
+    std::size_t heading = 0;    // its line
     bool free_names = false;    // of a field that no standard names, and so gives no scale
     bool percent_signs = false; // behind values of the row
 };

@@ -1,0 +1,34 @@
+// Which columns of a table tell inks, by their names and by their values.
+#pragma once
+
+#include <cstddef>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace vantrel::sheets {
+
+// CMYK_M, CMYKOG_O, CMY_C, RGB_R, 6CLR_1: what the printer was asked for, by the standard's names.
+bool is_standard_device_field(std::string_view field);
+
+// The inks of the columns with these keys (letters()), such as cyan, magenta_pct, Yellow %, Orange
+// (percent); empty where a column is none.
+std::vector<std::string> inks_of(const std::vector<std::string> &keys);
+
+// A column that nothing reads and that may hold percentages of an ink.
+class DoubtfulColumn {
+public:
+    DoubtfulColumn(std::size_t column, std::string_view key);
+    void take(std::string_view cell);
+    bool may_be_ink() const;
+
+    const std::size_t column;
+
+private:
+    bool named;    // like an ink
+    bool measured; // or placed: not by its values
+    std::size_t numbers = 0, others = 0;
+    double least = 0, most = 0;
+};
+
+} // namespace vantrel::sheets
