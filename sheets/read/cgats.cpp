@@ -251,6 +251,7 @@ void CgatsReader::row(std::string_view text)
 void CgatsReader::end_rows()
 {
     place = Place::header;
+    sheet.header.take("END_DATA", "");
     if (wanted) {
         check(field_count, fields.size());
         check(row_count, rows);

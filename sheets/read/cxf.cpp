@@ -359,7 +359,12 @@ void CxfReader::read()
     read_about(root);
     tints = tint_steps(child(root, "CustomResources"));
 
-    const std::vector<Node> all = objects(child(resources, "ObjectCollection"));
+    std::vector<Node> all;
+    for (const Node &collection : resources.children())
+        if (is(collection, "ObjectCollection")) {
+            const std::vector<Node> more = objects(collection);
+            all.insert(all.end(), more.begin(), more.end());
+        }
     for (const Node &object : all)
         read_target(object);
     const Work work{sheet.tell(), "Reading", all.size()};

@@ -79,6 +79,73 @@ Condition condition_in(std::string_view text)
     return std::nullopt;
 }
 
+Condition condition_of_filter(std::string_view text)
+{
+    if (const Condition named = condition_in(text))
+        return named;
+    const std::string key = letters(text);
+    if (key.starts_with("POL") || key.starts_with("CROSSPOL"))
+        return 3;
+    constexpr std::array without_uv = {"UVCUT",     "UVEXCLUDED", "UVEXCLUDE",  "UVEX", "UVFILTER",
+                                       "UVBARRIER", "UVBLOCK",    "UVFREE",     "NOUV", "WITHOUTUV",
+                                       "OHNEUV",    "SANSUV",     "UVCUTFILTER"};
+    if (std::find(without_uv.begin(), without_uv.end(), key) != without_uv.end())
+        return 2;
+    return std::nullopt;
+}
+
+namespace {
+
+bool tells_no_filter(std::string_view text)
+{
+    constexpr std::array words = {"",     "NONE",       "NO",    "NOFILTER", "OFF",       "FALSE",
+                                  "0",    "UNFILTERED", "OPEN",  "NA",       "N/A",       "OHNE",
+                                  "KEIN", "KEINER",     "AUCUN", "SANS",     "UVINCLUDED"};
+    return std::find(words.begin(), words.end(), letters(text)) != words.end();
+}
+
+bool names_condition(std::string_view key)
+{
+    constexpr std::array parts = {"MEASUREMENT", "ILLUMINATION", "CONDITION", "FILTER", "TESTMODE"};
+    return std::any_of(parts.begin(), parts.end(),
+                       [&](std::string_view part) { return contains(key, part); });
+}
+
+bool affirms(std::string_view text)
+{
+    const std::string key = letters(text);
+    return key == "YES" || key == "ON" || key == "TRUE" || key == "1" || key == "CROSSED";
+}
+
+} // namespace
+
+// A later table may name another condition; two keywords of one header contradict each other.
+void Header::keep_condition(const std::string &key, std::string_view value)
+{
+    if (key == "ENDDATA")
+        condition_key.clear();
+    const bool polarisation = key.starts_with("POLARI");
+    const bool filter = contains(key, "FILTER");
+    if (!polarisation && !names_condition(key))
+        return;
+    const std::string_view text = trimmed(value);
+    const Condition named = polarisation && affirms(text) ? Condition(3)
+                            : filter || polarisation || contains(key, "CONDITION")
+                                ? condition_of_filter(text)
+                                : condition_in(value);
+    if (!named && (filter || polarisation) && !tells_no_filter(text) &&
+        !upper(text).starts_with("STATUS"))
+        unknown_filter = text;
+    if (!named)
+        return;
+    if (condition && condition != named && !condition_key.empty() && condition_key != key) {
+        other_condition = text;
+        return;
+    }
+    condition = named;
+    condition_key = key;
+}
+
 void Header::take(std::string_view keyword, std::string_view value)
 {
     const std::string key = letters(keyword);
@@ -110,14 +177,9 @@ void Header::take(std::string_view keyword, std::string_view value)
     if (key == "QUANTITY" || key == "MEASTYPE" || key == "MEASUREMENTTYPE")
         keep(quantity, upper(value));
 
-    for (const std::string_view part :
-         {"MEASUREMENT", "ILLUMINATION", "CONDITION", "FILTER", "TESTMODE"})
-        if (contains(key, part))
-            if (const Condition named = condition_in(value)) {
-                condition = named;
-                return;
-            }
-
+    keep_condition(key, value);
+    if (names_condition(key) && condition_in(value))
+        return;
     const std::string words = upper(value);
     if (key == "WEIGHTINGFUNCTION" && words.starts_with("ILLUMINANT"))
         keep_illuminant(value.substr(std::min(value.find_first_not_of(" ,", 10), value.size())));

@@ -15,12 +15,17 @@ using Condition = std::optional<int>;
 // The condition that a text names as a word: "M1", "M1_Daylight", "CS_M1".
 Condition condition_in(std::string_view text);
 
+// The condition of a filter: M2 without ultraviolet, M3 through polarisers ("UV cut", "Pol").
+Condition condition_of_filter(std::string_view text);
+
 struct Header {
     Origin origin;
     std::string quantity; // what was measured: "REFLECTIVE", "TRANSMITTANCE", "EMISSION"
     std::string illuminant, observer;             // of the file's own colours
     std::string other_illuminant, other_observer; // that the file states too
     Condition condition;                          // the one that was named last
+    std::string other_condition;                  // and one under another keyword
+    std::string unknown_filter;
 
     // The first to say something is believed, but for the condition.
     void take(std::string_view keyword, std::string_view value);
@@ -33,8 +38,11 @@ struct Header {
     Colours colours() const;
 
 private:
+    void keep_condition(const std::string &key, std::string_view value);
     void keep_illuminant(std::string_view value);
     void keep_observer(std::string_view value);
+
+    std::string condition_key; // that named the condition
 };
 
 } // namespace vantrel::sheets

@@ -8,6 +8,7 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
+#include <map>
 #include <set>
 #include <utility>
 
@@ -231,10 +232,19 @@ void Sheet::bring_to_lab(const Colours &colours)
 void Sheet::check_inks()
 {
     double largest = 0;
+    std::map<std::string_view, double> most; // of each ink
     for (const Patch &patch : patches)
         for (const auto &[field, percent] : patch.device)
-            if (is_ink(field))
+            if (is_ink(field)) {
                 largest = std::max(largest, percent);
+                most[field] = std::max(most[field], percent);
+            }
+    constexpr double kPercentages = 20; // no fractions
+    for (const auto &[ink, percent] : most)
+        if (largest >= kPercentages && percent > 0 && percent <= 1)
+            warn(0, fmt::format("the largest value of {} is {:g}, and of another ink {:g}; they "
+                                "are taken for percentages",
+                                ink, percent, largest));
     if (largest > 100 || (largest > 0 && largest <= 1))
         warn(0,
              fmt::format("the largest ink value is {:g}; they are taken for percentages", largest));
@@ -260,6 +270,12 @@ Measurement Sheet::measurement()
     if (!header.other_observer.empty())
         warn(0, fmt::format("the observer is said to be {}, and {} elsewhere: the first is taken",
                             in_quotes(header.observer), in_quotes(header.other_observer)));
+    if (!header.other_condition.empty())
+        warn(0, fmt::format("the condition is said to be {}, and {} elsewhere: the first is taken",
+                            name_of(header.condition), in_quotes(header.other_condition)));
+    if (!header.unknown_filter.empty())
+        warn(0, fmt::format("the filter {} tells no condition known here (M0 to M3)",
+                            in_quotes(header.unknown_filter)));
     if (xyz)
         bring_to_lab(colours);
     check_inks();

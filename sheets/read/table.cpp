@@ -391,7 +391,8 @@ void Table::add(const Row &row, Condition given, std::size_t line)
     free_names = free_names && !percent_signs;
     for (DoubtfulColumn &doubt : doubtful)
         doubt.take(row.values[doubt.column]);
-    const Condition own = condition == kNone ? std::nullopt : condition_in(row.values[condition]);
+    const Condition own =
+        condition == kNone ? std::nullopt : condition_of_filter(row.values[condition]);
     sheet.add(std::move(patch), own ? own : given, line);
 }
 
