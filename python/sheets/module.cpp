@@ -3,6 +3,7 @@
 
 #include "boundary/calls.h"
 #include "judge/colour.h"
+#include "read/bands.h"
 #include "read/reader.h"
 
 #include <cstdint>
@@ -119,6 +120,29 @@ Object srgb(PyObject *arguments)
     return checked(PyBytes_FromStringAndSize(levels.data(), Py_ssize_t(levels.size())));
 }
 
+/// bands(wavelengths): what each of 31 bands takes of the value at each wavelength, as the reader
+/// of files does; the wavelengths are doubles, the answer 31 doubles for each.
+Object bands(PyObject *arguments)
+{
+    Py_buffer buffer{};
+    if (!PyArg_ParseTuple(arguments, "y*", &buffer))
+        throw PythonError{};
+    const std::unique_ptr<Py_buffer, void (*)(Py_buffer *)> held(&buffer, PyBuffer_Release);
+    const auto *nm = static_cast<const double *>(buffer.buf);
+    const std::size_t count = size_t(buffer.len) / sizeof(double);
+    std::string weights;
+    unlocked([&] {
+        const Bands taken({nm, nm + count}, 0);
+        for (std::size_t i = 0; i < count; ++i) {
+            std::vector<double> one(count);
+            one[i] = 1;
+            const Spectrum shares = taken.of(one);
+            weights.append(reinterpret_cast<const char *>(shares.data()), sizeof shares);
+        }
+    });
+    return checked(PyBytes_FromStringAndSize(weights.data(), Py_ssize_t(weights.size())));
+}
+
 /// A function of the module; what Python has set an error for leaves it as null.
 template <Object (*function)(PyObject *)> PyObject *method(PyObject *, PyObject *arguments) noexcept
 {
@@ -137,6 +161,7 @@ template <Object (*function)(PyObject *)> PyObject *method(PyObject *, PyObject 
 PyMethodDef methods[] = {
     {"read", method<read>, METH_VARARGS, "What a measurement file holds."},
     {"answer", method<answer>, METH_VARARGS, "What a command of the program says of sheets."},
+    {"bands", method<bands>, METH_VARARGS, "How values at wavelengths make the bands."},
     {"srgb", method<srgb>, METH_VARARGS, "The colours of a display for L*a*b*."},
     {nullptr, nullptr, 0, nullptr},
 };

@@ -189,6 +189,10 @@ def check_inks(value, name):
         raise ValueError(f"{name}: one to three inks are needed, not {value.shape[-2]}")
 
 
+def _is_labelled(value):
+    return library_of(value) in ("pandas", "xarray") or isinstance(value, np.ma.MaskedArray)
+
+
 def is_spectral(kind, core):
     return kind in ("Spectra", "OptionalSpectra") or kind == "Inks" and core[-1] == str(BANDS)
 
@@ -209,6 +213,11 @@ def convert(kind, core, value, name):
     if kind == "Integers":
         return as_integers(value, name)
     if is_spectral(kind, core):
+        if isinstance(value, (list, tuple)) and any(map(_is_labelled, value)):
+            raise ValueError(
+                f"{name}: labels and masks of arrays are lost in a list; make one array of them, by "
+                "pandas.DataFrame, xarray.concat or numpy.ma.stack"
+            )
         by_wavelength = {"xarray": bands_of_xarray, "pandas": bands_of_pandas}
         bands = by_wavelength.get(library_of(value))
         value = bands(value, name) if bands else value

@@ -12,6 +12,7 @@ from numpy.typing import NDArray
 
 from ._colour import refl_to_cielab
 from ._enums import IllumObs
+from ._extension import extension
 from ._file import write_text
 from ._text import cgats_text, csv_text
 from ._wavelengths import NM
@@ -209,15 +210,6 @@ class Sheet:
             + f"</tr>{''.join(rows)}</table>"
             + (f"<p>{left_out} more patches are not shown</p>" if left_out else "")
         )
-
-
-def extension() -> Any:
-    """The extension module of measurement files."""
-    try:
-        from . import _sheets  # type: ignore[attr-defined]
-    except ImportError:
-        raise NotImplementedError("vantrel was built without the reader of measurement files")
-    return _sheets
 
 
 def srgb(lab: Any) -> NDArray[np.uint8]:

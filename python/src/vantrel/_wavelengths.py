@@ -1,71 +1,55 @@
 """Spectra at wavelengths of their own, brought to 400, 410, ... 700 nm."""
 
+import functools
 import re
 
 import numpy as np
 
+from ._extension import extension
+
 NM = np.arange(400.0, 701.0, 10.0)
-_HALF_WIDTH = 10  # of the triangle that a band is
+_WIDEST = 10  # step, in nm
 _TOLERANCE = 0.001  # of a wavelength, in nm
 _NAMES = {"nm", "wavelength", "wavelengths", "wl", "lambda", "band", "bands"}
 _LABEL = re.compile(r"(?:[A-Za-z_ ]*[A-Za-z_ ])?(\d{3,4}(?:\.\d+)?) ?(?:nm)?", re.IGNORECASE)
 
 
-def _fault(nm):
-    """Why ascending wavelengths do not give every band; None where they do."""
-    if not len(nm) or nm[0] > 400 + _TOLERANCE or nm[-1] < 700 - _TOLERANCE:
-        return "the range is too short"
-    steps = np.diff(nm)
-    wide = int(np.argmax(steps))
-    if steps[wide] > _HALF_WIDTH + _TOLERANCE:
-        return f"no value between {nm[wide]:g} and {nm[wide + 1]:g} nm"
-    if steps.max() - steps.min() > 1 + _TOLERANCE:  # names may be rounded: 380, 383, 387, 390 nm
-        return f"the steps are uneven, {steps.min():g} to {steps.max():g} nm"
-    off = nm[0] % 10
-    if steps.max() > _HALF_WIDTH - _TOLERANCE and min(off, 10 - off) > _TOLERANCE:
-        return f"no value at 400 nm, but at {nm[0]:g} and {nm[1]:g} nm"
-    return None
-
-
-def _parts(wavelengths, name):
-    """For each band the values that it is a mean of and their weights: two arrays (parts, 31)."""
-    nm = np.asarray(wavelengths, dtype=np.float64)
-    if nm.ndim != 1:
-        raise ValueError(f"{name}: wavelengths are a list of numbers, not of shape {nm.shape}")
-    order = np.argsort(nm, kind="stable")
-    twice = np.diff(nm[order]) < _TOLERANCE
-    if np.any(twice):
-        raise ValueError(f"{name}: {nm[order][1:][twice][0]:g} nm occurs twice")
-    reach = _HALF_WIDTH - _TOLERANCE
-    order = order[(nm[order] > 400 - reach) & (nm[order] < 700 + reach)]
-    fault = _fault(nm[order])
-    if fault or not np.all(np.isfinite(nm)):
-        raise ValueError(
-            f"{name}: {fault or 'a wavelength is not a number'} among the {nm.size} wavelengths; "
-            "every 10 nm from 400 to 700 is needed, or finer steps"
-        )
-    weights = 1 - np.abs(nm[order, None] - NM) / _HALF_WIDTH
-    weights[weights > 1 - _TOLERANCE / _HALF_WIDTH] = 1
-    weights[weights < _TOLERANCE / _HALF_WIDTH] = 0
-    taken = [np.flatnonzero(w) for w in weights.T]
-    count = max(len(t) for t in taken)
-    indices = np.array([np.pad(order[t], (0, count - len(t)), "edge") for t in taken]).T
-    shares = np.array(
-        [np.pad(w[t] / np.sum(w[t]), (0, count - len(t))) for t, w in zip(taken, weights.T)]
-    ).T
-    return indices, shares
+@functools.lru_cache(maxsize=64)
+def _weights(wavelengths):
+    """Which of the values at wavelengths make the bands, and what each band takes of them."""
+    nm = np.frombuffer(wavelengths)
+    if not np.all(np.isfinite(nm)):
+        raise ValueError("a wavelength is not a number")
+    weights = np.frombuffer(extension().bands(wavelengths)).reshape(-1, 31)
+    ascending = np.sort(nm)
+    wide = np.diff(ascending) > _WIDEST + _TOLERANCE
+    if np.any(wide):  # of files too: the cubics between steps of 20 nm
+        first, last = ascending[:-1][wide][0], ascending[1:][wide][0]
+        raise ValueError(f"no value between {first:g} and {last:g} nm")
+    if ascending[0] > 400 + _TOLERANCE or ascending[-1] < 700 - _TOLERANCE:
+        raise ValueError("the range is too short")
+    taken = np.flatnonzero(weights.any(-1))
+    return taken, weights[taken]
 
 
 def to_bands(values, wavelengths, name):
     """The bands of an array whose last dimension lies at these wavelengths."""
-    if np.shape(values)[-1:] != np.shape(wavelengths):
+    nm = np.ascontiguousarray(wavelengths, dtype=np.float64)
+    if nm.ndim != 1:
+        raise ValueError(f"{name}: wavelengths are a list of numbers, not of shape {nm.shape}")
+    if np.shape(values)[-1:] != nm.shape:
         raise ValueError(
-            f"{name}: {np.shape(values)[-1:]} values do not lie at {np.size(wavelengths)} wavelengths"
+            f"{name}: {np.shape(values)[-1:]} values do not lie at {nm.size} wavelengths"
         )
-    indices, shares = _parts(wavelengths, name)
-    if len(indices) == 1:
-        return values[..., indices[0]]
-    return sum(values[..., i] * share for i, share in zip(indices, shares))
+    try:
+        taken, weights = _weights(nm.tobytes())
+    except ValueError as error:
+        reason = str(error).partition(" in spectra of ")[0]
+        raise ValueError(
+            f"{name}: {reason}, of {nm.size} wavelengths; every 10 nm from 400 to 700 is needed, or "
+            "finer steps"
+        ) from None
+    return values[..., taken] @ weights
 
 
 def wavelengths_of(labels):
