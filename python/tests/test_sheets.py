@@ -355,6 +355,24 @@ def test_spectra_that_are_put_in_are_judged_with_their_scale_in_doubt(sheet):
             assert f"other: {doubt}" in vantrel.report(other).to_html()
 
 
+def test_a_result_stays_what_it_was(sheet):
+    live = replace(sheet, spectra=sheet.spectra.copy())
+    report = vantrel.report(live, n_factor=np.float64(1.5))
+    page = report.to_html()
+    live.spectra[:] *= 0.5
+    assert report.to_html() == page and report.json == vantrel.report(sheet, n_factor=1.5).json
+    with vantrel.settings(achromatic=(90, 10, 40, 50)):
+        with pytest.warns(UserWarning, match="constants of the program"):
+            assert vantrel.report(sheet, n_factor=1.5).json == report.json
+
+
+@pytest.mark.filterwarnings("ignore")
+def test_a_run_names_what_is_not_there(sheet, darker):
+    with pytest.warns(UserWarning, match="not judged: nowhere.txt: No such file"):
+        run = vantrel.run([darker, "nowhere.txt"], sheet)
+    assert run.unread == ("nowhere.txt: No such file or directory",)
+
+
 def test_a_sheet_shows_what_it_is(sheet):
     page = sheet._repr_html_()
     assert page.count("rgb(243, 242, 240)") == 1 and "<td>95.48</td><td>0.04</td><td>1.11</td>" in page
@@ -381,6 +399,8 @@ def test_a_sheet_shows_what_it_is(sheet):
         (lambda s: vantrel.report(replace(s, spectra=s.spectra[:, :30])), "spectra: the shape"),
         (lambda s: vantrel.report(replace(s, spectra=s.spectra * np.nan)), "spectra: numbers"),
         (lambda s: vantrel.report(replace(s, ids=[])), "31 names, 0 ids"),
+        (lambda s: vantrel.compare(s, s, tolerance=np.nan), "an argument is not finite"),
+        (lambda s: vantrel.report(replace(s, spectra=None, kind="colours")), "neither spectra nor lab"),
         (lambda s: vantrel.report(replace(s, spectra=None)), "kind 'reflectance'"),
         (lambda s: s.write("sheet.cxf"), "ends in .csv or .txt, not '.cxf'"),
         (lambda s: vantrel.report(s).write("report.doc"), "not '.doc'"),

@@ -11,7 +11,7 @@ from ._declared import evaluate
 _DEFAULTS = _ufuncs.get_settings()
 
 
-def _settings():
+def settings_in_force():
     """The settings that a block is made under; b"" for the defaults."""
     now = _ufuncs.get_settings()
     return b"" if now == _DEFAULTS else now
@@ -53,7 +53,7 @@ def on_dask(declared, values, ok):
     names = [f"loop{d}" for d in range(depth)]
     indices = [(*names[depth - loop :], *core) for loop, core in zip(loops, cores)]
     tuples = da.blockwise(
-        functools.partial(_on_block, declared.name, ok, missing, _settings()),
+        functools.partial(_on_block, declared.name, ok, missing, settings_in_force()),
         names,
         *(part for pair in zip(arrays, indices) for part in pair),
         concatenate=False,

@@ -10,12 +10,14 @@ from typing import Any, Dict, List, Literal, Mapping, Optional, Sequence, Tuple,
 import numpy as np
 
 from ._arguments import FRACTION, INDICES
+from ._dask import settings_in_force
 from ._enums import IllumObs, Status
+from ._extension import extension
 from ._ink import Ink
 from ._predictions import Predictions
 from ._results import Comparison, Report
 from ._run import Run
-from ._sheet import Sheet, extension, in_python, read
+from ._sheet import Sheet, in_python, read
 
 Illuminant = Union[
     IllumObs,
@@ -41,7 +43,7 @@ _LARGEST = 1e6  # of reflectances in percent and of colours, as the readers take
 
 
 def _doubles(values: Any, shape: Tuple[int, ...], name: str, missing: bool = False) -> Any:
-    array = np.ascontiguousarray(values, dtype=np.float64)
+    array = np.array(values, dtype=np.float64, order="C")
     if array.shape != shape:
         raise ValueError(f"{name}: the shape {shape} is needed, not {array.shape}")
     if not np.all((np.abs(array) <= _LARGEST) | (missing & np.isnan(array))):
@@ -61,12 +63,16 @@ def _scale_doubts(sheet: Sheet) -> List[str]:
 
 
 def _fields(sheet: Sheet) -> Dict[str, Any]:
-    """A sheet as the extension takes it."""
+    """A sheet as the extension takes it, in copies of its numbers."""
+    if not isinstance(sheet, Sheet):
+        raise TypeError(f"a Sheet is needed, as vantrel.read() gives, not {type(sheet).__name__}")
     patches = len(sheet)
     if not patches or len(sheet.ids) != patches:
         raise ValueError(f"sheet: {patches} names, {len(sheet.ids)} ids; a patch at least has both")
     if (sheet.spectra is None) != (sheet.kind == "colours"):
         raise ValueError(f"sheet: a sheet of kind {sheet.kind!r} with spectra {sheet.spectra}")
+    if sheet.spectra is None and sheet.lab is None:
+        raise ValueError("sheet: neither spectra nor lab")
     lines = sheet.lines if len(sheet.lines) == patches else np.zeros(patches)
     taken: Dict[str, Any] = {name: getattr(sheet, name) for name in vars(sheet)}
     taken["warnings"] = [*sheet._warnings, *_scale_doubts(sheet)]
@@ -78,16 +84,28 @@ def _fields(sheet: Sheet) -> Dict[str, Any]:
     if sheet.spectra is not None:
         taken["spectra"] = _doubles(sheet.spectra, (patches, 31), "spectra")
     if sheet.lab is not None:
-        taken["lab"] = _doubles(sheet.lab, (patches, 3), "lab", missing=True)
+        taken["lab"] = _doubles(sheet.lab, (patches, 3), "lab", sheet.kind != "colours")
     taken["origin"] = asdict(sheet.origin)
     taken["source"] = None if sheet.source is None else asdict(sheet.source)
     return taken
 
 
-def _answer(command: str, sheets: Sequence[Sheet], options: Dict[str, Any], form: str) -> str:
-    wishes = json.dumps({**options, "format": form})
+def _plain(value: Any) -> Any:
+    """What NumPy holds, as JSON does."""
+    if isinstance(value, (np.generic, np.ndarray)):
+        return value.tolist()
+    raise TypeError(f"{value!r} is no number, text or list of these")
+
+
+def _answer(
+    command: str, sheets: Sequence[Dict[str, Any]], options: Dict[str, Any], form: str
+) -> str:
     try:
-        text: str = extension().answer(command, [_fields(sheet) for sheet in sheets], wishes)
+        wishes = json.dumps({**options, "format": form}, default=_plain, allow_nan=False)
+    except ValueError:
+        raise ValueError(f"{command}: an argument is not finite") from None
+    try:
+        text: str = extension().answer(command, sheets, wishes)
     except ValueError as error:
         raise ValueError(in_python(str(error))) from None
     return text
@@ -95,8 +113,15 @@ def _answer(command: str, sheets: Sequence[Sheet], options: Dict[str, Any], form
 
 def _result(kind: Any, command: str, sheets: Sequence[Sheet], options: Dict[str, Any]) -> Any:
     names = {key: value for key, value in options.items() if value is not None}
+    given = [_fields(sheet) for sheet in sheets]
     read_from = [sheet._read_from for sheet in sheets if sheet._read_from]
-    result = kind._of(functools.partial(_answer, command, sheets, names), read_from)
+    result = kind._of(functools.partial(_answer, command, given, names), read_from)
+    if settings_in_force():
+        warnings.warn(
+            f"{command}() takes the constants of the program, not those that are set: these hold for "
+            "functions over arrays",
+            stacklevel=3,
+        )
     told = {f"{s.file}:{line}" for s in sheets for line in s._warnings}
     not_judged = [f"not judged: {reason}" for reason in getattr(result, "unread", ())]
     for line in [*result.warnings, *not_judged]:
@@ -114,6 +139,12 @@ def _name(kind: str, value: Any, argument: str) -> Optional[str]:
     index.check(number, argument)
     name: str = index.members(number).name
     return name
+
+
+def _inks(order: Optional[Sequence[str]]) -> Optional[List[str]]:
+    if isinstance(order, str):
+        raise TypeError("order: a list of inks is needed")
+    return None if order is None else [*order]
 
 
 def _usual(illuminant: Any, status: Any, paper: Optional[str]) -> Dict[str, Any]:
@@ -176,7 +207,7 @@ def report(
     options = {
         **_usual(illuminant, status, paper),
         "n_factor": n_factor,
-        "order": None if order is None else [*order],
+        "order": _inks(order),
         "second_paper": second_paper,
         "second_illuminant": _name("Illuminant", second_illuminant, "second_illuminant"),
     }
@@ -328,7 +359,7 @@ def predict(
     >>> prediction.calibrated.rgb, round(prediction.halftone.density, 2)
     ('#e2c282', 0.37)
     """
-    options = {**_usual(illuminant, status, paper), "order": None if order is None else [*order]}
+    options = {**_usual(illuminant, status, paper), "order": _inks(order)}
     if inks is not None:
         pairs: List[Tuple[str, float]] = [*(inks.items() if isinstance(inks, Mapping) else inks)]
         options["ink"] = [[name, percent] for name, percent in pairs]
@@ -379,7 +410,7 @@ def ink(
         **_usual(illuminant, status, paper),
         "patch": patch,
         "against": against,
-        "order": None if order is None else [*order],
+        "order": _inks(order),
     }
     result: Ink = _result(Ink, "ink", [sheet], options)
     return result
@@ -417,8 +448,6 @@ def run(
     ------
     ValueError
         Where no sheet can be judged.
-    OSError
-        Where there is no such file.
 
     Examples
     --------
@@ -431,15 +460,19 @@ def run(
     >>> print(run.series[-1].title, np.round(run.series[-1].values, 2))
     largest ΔE00 [0.27 0.53 0.79 1.06 1.32]
     """
+    if isinstance(sheets, (str, os.PathLike, Sheet)):
+        raise TypeError("sheets: a list of them is needed")
     taken, unread = [], []
     for sheet in sheets:
         try:
             taken.append(sheet if isinstance(sheet, Sheet) else read(sheet))
         except ValueError as error:
             unread.append(str(error))
+        except OSError as error:
+            unread.append(f"{sheet}: {error.strerror}")
     options = {
         **_usual(illuminant, status, paper),
-        "order": None if order is None else [*order],
+        "order": _inks(order),
         **_tolerances(tolerances),
         "unread": unread,
     }
