@@ -110,6 +110,26 @@ std::string finding_of(const Run &run, const LimitResult &worst, const LimitPlac
     return fmt::format("{}: {} on {}", title, reason, sheet_of(run, places.worst));
 }
 
+// Zones that leave the limits of the mean before it does; empty where none does.
+std::string zones_outside(const Run &run, const RunSeries &series)
+{
+    std::size_t first = series.first_outside.value_or(series.sheets.size());
+    std::vector<std::string> zones;
+    for (std::size_t i = 0; series.limits && i < first; ++i)
+        if (series.sheets[i])
+            for (const auto &[zone, value] : series.sheets[i]->zones)
+                if (!series.limits->hold(value)) {
+                    zones.push_back(fmt::format("zone {} with {}", zone, shown(series, value)));
+                    first = i;
+                }
+    if (zones.empty())
+        return "";
+    return fmt::format("{}: outside {} at {}: {}; the limit is for the mean of zones",
+                       series.measurand.title(),
+                       series.limits->low ? limits_of(series) : shown(series, series.limits->high),
+                       sheet_of(run, first), listed(zones));
+}
+
 // Sheets and zones that stand apart, each with its readings.
 void add_oddities(const Run &run, std::vector<std::string> &out)
 {
@@ -147,8 +167,10 @@ std::vector<std::string> findings_of(const Run &run)
         if (!finding.empty())
             out.push_back(std::move(finding));
     };
-    for (const RunSeries &series : run.series)
+    for (const RunSeries &series : run.series) {
         add(finding_of(run, series));
+        add(zones_outside(run, series));
+    }
     for (std::size_t i = 0; i < run.limits.size(); ++i)
         if (!run.limit_places[i].is_told)
             add(finding_of(run, run.limits[i], run.limit_places[i]));
@@ -197,10 +219,13 @@ std::string coverage_of(const Run &run)
                std::pair(other.coverage.aims, other.coverage.patches);
     };
     const auto [least, most] = std::minmax_element(run.sheets.begin(), run.sheets.end(), fewer);
-    return fmt::format("{}{}", told(least->coverage),
+    const bool zoned = std::any_of(run.sheets.begin(), run.sheets.end(),
+                                   [](const RunSheet &sheet) { return sheet.zones.size() > 1; });
+    return fmt::format("{}{}{}", told(least->coverage),
                        fewer(*least, *most) ? fmt::format(" on sheet {}, more on others",
                                                           least - run.sheets.begin() + 1)
-                                            : " on each sheet");
+                                            : " on each sheet",
+                       zoned ? ", zones by their mean" : "");
 }
 
 // "failed: 2 of 5 limits failed on 9 sheets; 1 sheet could not be judged; 1 gap; judged …"
