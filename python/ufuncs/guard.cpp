@@ -9,7 +9,7 @@
 namespace {
 
 /// Rows that are looked at, and stay near, before they are computed.
-constexpr npy_intp kTogether = 128;
+constexpr npy_intp kTogether = 64;
 
 struct Rows {
     std::bitset<kTogether> unknown, infinite; ///< those with a not-a-number, with an infinity

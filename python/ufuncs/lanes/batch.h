@@ -118,7 +118,7 @@ Bands spectra(const Operand &o, const Batch &batch)
             bands[i] = V(spectrum(o)[i]);
         return bands;
     }
-    constexpr npy_intp kAhead = 128, kLine = 64; // rows, bytes that come from memory together
+    constexpr npy_intp kAhead = 64, kLine = 64; // rows, bytes that come from memory together
     const char *at[N];
     for (int lane = 0; lane < N; ++lane) {
         at[lane] = o.row + batch.row(lane) * o.step;
