@@ -19,7 +19,7 @@ PAPER = np.linspace(80, 90, 31)
 NM = np.arange(400, 701, 10)
 
 
-@pytest.mark.parametrize("rows", [6, 600], ids=["a few", "many"])
+@pytest.mark.parametrize("rows", [6, 1600], ids=["a few", "many"])
 @pytest.mark.parametrize("bad", [np.nan, np.inf, -np.inf])
 def test_what_is_no_reading_has_no_result(bad, rows):
     spectra = np.resize(SPECTRA, (rows, 31))
@@ -37,8 +37,14 @@ def test_what_is_no_reading_has_no_result(bad, rows):
         assert np.isnan(density[rows - 2]) and band[rows - 2] == -1 and np.isnan(density).sum() == 1
         grayness, hue_error = vantrel.refl_to_hue_gray(given, None, "E")
         assert np.isnan([grayness[rows - 2], hue_error[rows - 2]]).all()
-    all_bad = vantrel.refl_to_density(spectra, spectra[rows - 2], "E", [[1], [2]])
-    assert not np.isfinite(all_bad).any() and all_bad.shape == (2, rows)
+    worse = np.where(np.arange(31) == 12, bad, PAPER)
+    for all_bad in (
+        vantrel.refl_to_density(SPECTRA, worse, "E", [[1], [2]]),
+        vantrel.refl_to_densities(SPECTRA, worse, "E")[:, [0, 1]].T,
+        vantrel.refl_to_dot_gain(worse, SPECTRA, PAPER, "E", "GREEN", [[1], [2]], 50),
+        vantrel.refl_to_dot_area(PAPER / 9, SPECTRA, PAPER, "E", "GREEN", [[bad], [bad]]),
+    ):
+        assert not np.isfinite(all_bad).any() and all_bad.shape == (2, len(SPECTRA))
     inplace = np.array([3.0, bad, 40.0])
     vantrel.saunderson(inplace, 0.04, 0.6, out=inplace)
     assert np.array_equal(np.isfinite(inplace), [True, False, True])

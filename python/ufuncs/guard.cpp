@@ -8,8 +8,10 @@
 
 namespace {
 
-/// Rows that are looked at, and stay near, before they are computed.
+/// Rows that are looked at while they are near.
 constexpr npy_intp kTogether = 64;
+/// Rows of a loop that finds by itself that all are finite.
+constexpr npy_intp kFinite = 1024;
 
 struct Rows {
     std::bitset<kTogether> unknown, infinite; ///< those with a not-a-number, with an infinity
@@ -56,7 +58,7 @@ template <class Element> void fill(const Operand &operand, Element missing)
     operand.each([&](npy_intp, char *value) { *reinterpret_cast<Element *>(value) = missing; });
 }
 
-void make_missing(const Operand &operand, int type)
+void fill_missing(const Operand &operand, int type)
 {
     switch (type) {
     case NPY_DOUBLE:
@@ -70,61 +72,96 @@ void make_missing(const Operand &operand, int type)
     }
 }
 
-/// Whether several rows at a time have been computed; they all succeed then.
-bool side_by_side(const Guard &guard, char **rows, const npy_intp *dimensions,
-                  const npy_intp *steps)
-{
-    if (!guard.lanes)
-        return false;
-    Operand operands[Layout::kOperands];
-    const int count = static_cast<int>(guard.types.size());
-    for (int i = 0; i < count; ++i)
-        place(operands[i], guard.layout, i, rows, dimensions, steps);
-    if (!guard.lanes(operands, dimensions[0]))
-        return false;
-    if (guard.layout.flags)
-        for (npy_intp n = 0; n < dimensions[0]; ++n)
-            *reinterpret_cast<npy_bool *>(rows[count - 1] + n * steps[count - 1]) = true;
-    return true;
-}
+/// A call of a ufunc's loop: its rows, some after the others.
+class Call {
+public:
+    Call(Guard &guard_of, char **first, const npy_intp *dimensions, const npy_intp *between)
+        : guard(guard_of), steps(between)
+    {
+        std::copy_n(first, count(), at);
+        std::copy_n(dimensions, 1 + guard.core_dimensions, sizes);
+    }
+
+    /// Computes the next rows. Where the loop of lanes has not seen that all inputs are finite, they
+    /// are looked at: before a loop of single rows, whose output may lie over its input.
+    void operator()(npy_intp rows)
+    {
+        sizes[0] = rows;
+        const Done done = side_by_side();
+        if (done == Done::finite_rows)
+            return go_on(rows);
+        for (npy_intp left = rows; left > 0; left -= sizes[0]) {
+            sizes[0] = std::min(left, kTogether);
+            Rows found;
+            for (int i = 0; i < guard.inputs; ++i)
+                if (guard.types[i] == NPY_DOUBLE)
+                    look_at(guard, operand(i), sizes[0], found);
+            if (done == Done::nothing)
+                guard.loop(at, sizes, steps, &guard.layout);
+            if (found.any)
+                make_missing(found);
+            go_on(sizes[0]);
+        }
+    }
+
+private:
+    int count() const { return static_cast<int>(guard.types.size()); }
+
+    Operand operand(int i, npy_intp row = 0)
+    {
+        Operand operand;
+        place(operand, guard.layout, i, at, sizes, steps);
+        operand.row += row * steps[i];
+        return operand;
+    }
+
+    /// Computes several rows at a time, where it can; they all succeed then.
+    Done side_by_side()
+    {
+        if (!guard.lanes)
+            return Done::nothing;
+        Operand operands[Layout::kOperands];
+        for (int i = 0; i < count(); ++i)
+            operands[i] = operand(i);
+        const Done done = guard.lanes->run(operands, sizes[0]);
+        for (npy_intp n = 0; done != Done::nothing && guard.layout.flags && n < sizes[0]; ++n)
+            *reinterpret_cast<npy_bool *>(at[count() - 1] + n * steps[count() - 1]) = true;
+        return done;
+    }
+
+    void make_missing(const Rows &found)
+    {
+        for (npy_intp n = 0; n < sizes[0]; ++n) {
+            bool missing = found.unknown[n];
+            for (int i = guard.inputs; i < count(); ++i)
+                missing = missing || (found.infinite[n] && finite(operand(i, n), guard.types[i]));
+            for (int i = guard.inputs; missing && i < count(); ++i)
+                fill_missing(operand(i, n), guard.types[i]);
+        }
+    }
+
+    void go_on(npy_intp rows)
+    {
+        for (int i = 0; i < count(); ++i)
+            at[i] += rows * steps[i];
+    }
+
+    Guard &guard;
+    char *at[Layout::kOperands]; ///< the next row of each operand
+    npy_intp sizes[1 + Layout::kOperands];
+    const npy_intp *steps;
+};
 
 } // namespace
 
 void guarded(char **rows, const npy_intp *dimensions, const npy_intp *steps, void *data)
 {
     auto &guard = *static_cast<Guard *>(data);
-    const int operands = static_cast<int>(guard.types.size());
     const Running running;
-
-    char *at[Layout::kOperands];
-    std::copy_n(rows, operands, at);
-    npy_intp sizes[1 + Layout::kOperands];
-    std::copy_n(dimensions, 1 + guard.core_dimensions, sizes);
-    const auto operand = [&](int i, npy_intp row) {
-        Operand place_of_it;
-        place(place_of_it, guard.layout, i, at, sizes, steps);
-        place_of_it.row += row * steps[i];
-        return place_of_it;
-    };
-
-    for (npy_intp left = dimensions[0]; left > 0; left -= sizes[0]) {
-        sizes[0] = std::min(left, kTogether);
-        Rows found;
-        for (int i = 0; i < guard.inputs; ++i)
-            if (guard.types[i] == NPY_DOUBLE)
-                look_at(guard, operand(i, 0), sizes[0], found);
-        if (!side_by_side(guard, at, sizes, steps))
-            guard.loop(at, sizes, steps, &guard.layout);
-        for (npy_intp n = 0; found.any && n < sizes[0]; ++n) {
-            bool missing = found.unknown[n];
-            for (int i = guard.inputs; i < operands; ++i)
-                missing = missing || (found.infinite[n] && finite(operand(i, n), guard.types[i]));
-            for (int i = guard.inputs; missing && i < operands; ++i)
-                make_missing(operand(i, n), guard.types[i]);
-        }
-        for (int i = 0; i < operands; ++i)
-            at[i] += sizes[0] * steps[i];
-    }
+    const npy_intp together = guard.lanes && guard.lanes->finds_finite ? kFinite : kTogether;
+    Call compute(guard, rows, dimensions, steps);
+    for (npy_intp left = dimensions[0]; left > 0; left -= together)
+        compute(std::min(left, together));
     // What a row divides by or overflows is its result, not a fault to warn of.
     std::feclearexcept(FE_ALL_EXCEPT);
 }

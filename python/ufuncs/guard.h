@@ -9,7 +9,7 @@
 
 struct Guard {
     decltype(Row::loop) loop = nullptr;
-    decltype(LaneLoop::run) lanes = nullptr; ///< several rows side by side, where it can
+    const LaneLoop *lanes = nullptr; ///< several rows side by side, where it can
     decltype(LaneLoops::all_finite) all_finite = nullptr;
     Layout layout = {};
     int inputs = 0;

@@ -122,7 +122,7 @@ bool add_ufunc(PyObject *module, const Row &row, bool flags, const LaneLoops &la
     guard.all_finite = lanes.all_finite;
     for (const LaneLoop &loop : lanes.loops)
         if (std::strcmp(loop.name, row.name) == 0)
-            guard.lanes = loop.run;
+            guard.lanes = &loop;
     guard.inputs = row.inputs;
     guard.types = {row.types, size_t(row.inputs + row.outputs)};
     if (flags) {

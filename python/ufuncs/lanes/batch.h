@@ -4,7 +4,7 @@
 // is shared between object files, and nothing is computed but in lanes.
 #pragma once
 
-#include "operand.h"
+#include "lanes.h"
 
 #include "base/elementary.h"
 #include "base/spectrum.h"
@@ -49,6 +49,17 @@ template <class First, class Then> void each_batch(npy_intp rows, First first, T
             then(Batch{at + i * N, rows - 1}, results[i]);
     }
 }
+
+/// Whether sums over all bands are finite, and so each band is: a not-a-number or an infinity in
+/// one of them stays in its sum, whatever its weight.
+class Finite {
+public:
+    void operator()(V sum) { zeros += sum - sum; }
+    Done done() const { return any(zeros != 0) ? Done::rows : Done::finite_rows; }
+
+private:
+    V zeros = 0;
+};
 
 bool is_spectrum(const Operand &o)
 {

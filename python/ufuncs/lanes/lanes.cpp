@@ -1,6 +1,4 @@
 // The formulas of the library over batches of rows; compiled once for each width.
-#include "lanes.h"
-
 #include "batch.h"
 
 #include "colorimetry/illuminants.h"
@@ -44,67 +42,71 @@ public:
     Labs(const Operand &spectra_of, ILLUM_OBS combination)
         : refl(spectra_of), illum_obs(combination)
     {
-        if (!is_same(refl))
-            return;
-        const auto [L, a, b] = vantrel::lab_from_spectrum(spectrum(refl), illum_obs);
-        same = {L, a, b};
-    }
-    Lab operator()(const Batch &batch) const
-    {
         if (is_same(refl))
-            return same;
-        return vantrel::lab_from_xyz(xyzs(refl, batch, illum_obs), vantrel::white_point(illum_obs));
+            same = of({0, 0});
     }
+    Lab operator()(const Batch &batch) { return is_same(refl) ? same : of(batch); }
+
+    Finite finite;
 
 private:
+    Lab of(const Batch &batch)
+    {
+        const Xyz xyz = xyzs(refl, batch, illum_obs);
+        finite(xyz.x);
+        return vantrel::lab_from_xyz(xyz, vantrel::white_point(illum_obs));
+    }
+
     const Operand &refl;
     ILLUM_OBS illum_obs;
-    Lab same;
+    Lab same = {0, 0, 0};
 };
 
-[[gnu::flatten]] bool refl_to_xyz(const Operand *o, npy_intp rows)
+[[gnu::flatten]] Done refl_to_xyz(const Operand *o, npy_intp rows)
 {
     if (!is_spectrum(o[0]) || !is_same_illum_obs(o[1]))
-        return false;
+        return Done::nothing;
+    Finite finite;
     each_batch(rows, [&](const Batch &batch) {
         const Xyz xyz = xyzs(o[0], batch, illum_obs(o[1]));
+        finite(xyz.x);
         store(o[2], batch, xyz.x, xyz.y, xyz.z);
     });
-    return true;
+    return finite.done();
 }
 
-[[gnu::flatten]] bool refl_to_cielab(const Operand *o, npy_intp rows)
+[[gnu::flatten]] Done refl_to_cielab(const Operand *o, npy_intp rows)
 {
     if (!is_spectrum(o[0]) || !is_same_illum_obs(o[1]))
-        return false;
-    const Labs labs(o[0], illum_obs(o[1]));
+        return Done::nothing;
+    Labs labs(o[0], illum_obs(o[1]));
     each_batch(rows, [&](const Batch &batch) {
         const Lab lab = labs(batch);
         store(o[2], batch, lab.L, lab.a, lab.b);
     });
-    return true;
+    return labs.finite.done();
 }
 
-[[gnu::flatten]] bool xyz_to_cielab(const Operand *o, npy_intp rows)
+[[gnu::flatten]] Done xyz_to_cielab(const Operand *o, npy_intp rows)
 {
     if (!is_same_illum_obs(o[1]))
-        return false;
+        return Done::nothing;
     const vantrel::Xyz &white = vantrel::white_point(illum_obs(o[1]));
     each_batch(rows, [&](const Batch &batch) {
         const Xyz xyz = {values(o[0], batch, 0), values(o[0], batch, 1), values(o[0], batch, 2)};
         const Lab lab = vantrel::lab_from_xyz(xyz, white);
         store(o[2], batch, lab.L, lab.a, lab.b);
     });
-    return true;
+    return Done::rows;
 }
 
-[[gnu::flatten]] bool metamerism(const Operand *o, npy_intp rows)
+[[gnu::flatten]] Done metamerism(const Operand *o, npy_intp rows)
 {
     if (!is_spectrum(o[0]) || !is_spectrum(o[1]) || !is_same_illum_obs(o[2]) ||
         !is_same_illum_obs(o[3]))
-        return false;
+        return Done::nothing;
     const ILLUM_OBS first = illum_obs(o[2]), second = illum_obs(o[3]);
-    const Labs standards1(o[0], first), standards2(o[0], second);
+    Labs standards1(o[0], first), standards2(o[0], second);
     each_batch(rows, [&](const Batch &batch) {
         const Bands refl = spectra(o[1], batch);
         const auto lab = [&](ILLUM_OBS k) {
@@ -116,7 +118,7 @@ private:
               vantrel::delta_e76(lab(first), standards1(batch)) +
                   vantrel::delta_e76(lab(second), standards2(batch)));
     });
-    return true;
+    return Done::rows;
 }
 
 /// L*, a*, b*, C*, h of each lane.
@@ -136,11 +138,11 @@ struct Labchs {
     V L, a, b, C, h;
 };
 
-[[gnu::flatten]] bool verbal_color_difference(const Operand *o, npy_intp rows)
+[[gnu::flatten]] Done verbal_color_difference(const Operand *o, npy_intp rows)
 {
     if (!is_spectrum(o[0]) || !is_spectrum(o[1]) || !is_same_illum_obs(o[2]) || !is_same(o[3]))
-        return false;
-    const Labs standards(o[0], illum_obs(o[2])), samples(o[1], illum_obs(o[2]));
+        return Done::nothing;
+    Labs standards(o[0], illum_obs(o[2])), samples(o[1], illum_obs(o[2]));
     const npy_int64 selector = integer(o[3]);
     each_batch(rows, [&](const Batch &batch) {
         const Labchs standard(standards(batch)), sample(samples(batch));
@@ -160,45 +162,45 @@ struct Labchs {
                                       : Word::none);
         }
     });
-    return true;
+    return Done::rows;
 }
 
 // Colour differences.
 
-[[gnu::flatten]] bool lab_to_de94(const Operand *o, npy_intp rows)
+[[gnu::flatten]] Done lab_to_de94(const Operand *o, npy_intp rows)
 {
     if (!is_same(o[2]) || !is_same(o[3]))
-        return false;
+        return Done::nothing;
     each_batch(rows, [&](const Batch &batch) {
         store(o[4], batch,
               vantrel::delta_e94(labs(o[0], batch), labs(o[1], batch), number(o[2]), number(o[3])));
     });
-    return true;
+    return Done::rows;
 }
 
-[[gnu::flatten]] bool lab_to_de2000(const Operand *o, npy_intp rows)
+[[gnu::flatten]] Done lab_to_de2000(const Operand *o, npy_intp rows)
 {
     if (!is_same(o[2]) || !is_same(o[3]))
-        return false;
+        return Done::nothing;
     each_batch(rows, [&](const Batch &batch) {
         store(o[4], batch,
               vantrel::delta_e2000(labs(o[0], batch), labs(o[1], batch),
                                    {number(o[2]), number(o[3]), 1}, vantrel::kPow25To7));
     });
-    return true;
+    return Done::rows;
 }
 
-[[gnu::flatten]] bool lab_to_de_cmc(const Operand *o, npy_intp rows)
+[[gnu::flatten]] Done lab_to_de_cmc(const Operand *o, npy_intp rows)
 {
     if (!is_same(o[2]) || !is_same(o[3]) || !is_same(o[4]) || number(o[2]) == 0 ||
         number(o[3]) == 0)
-        return false;
+        return Done::nothing;
     each_batch(rows, [&](const Batch &batch) {
         store(o[5], batch,
               vantrel::delta_e_cmc(labs(o[0], batch), labs(o[1], batch), number(o[2]), number(o[3]),
                                    integer(o[4]) != 0));
     });
-    return true;
+    return Done::rows;
 }
 
 // Densities.
@@ -223,13 +225,13 @@ public:
         for (int i = 0; i < kBands; ++i)
             weights[i] = static_cast<double>(vantrel::weights_of(status, response)[i]);
         if (paper.size() && is_same(paper))
-            same = vantrel::weighted_density(spectrum(paper), std::nullopt, status, response);
+            same = vantrel::density_of_sum(sum(spectra(paper, {0, 0})));
     }
     /// Σ R w of a patch and of its paper.
     struct Sums {
         V patch, paper;
     };
-    Sums sums(const Bands &refl, const Batch &batch) const
+    Sums sums(const Bands &refl, const Batch &batch)
     {
         const bool each = paper.size() && !is_same(paper);
         return {sum(refl), each ? sum(spectra(paper, batch)) : V(0)};
@@ -239,33 +241,40 @@ public:
         const V density = vantrel::density_of_sum(sums.patch);
         if (!paper.size())
             return density;
-        return density - (is_same(paper) ? V(same) : vantrel::density_of_sum(sums.paper));
+        return density - (is_same(paper) ? same : vantrel::density_of_sum(sums.paper));
     }
 
+    Finite finite;
+
 private:
-    V sum(const Bands &refl) const { return vantrel::weighted_sum(refl, weights); }
+    V sum(const Bands &refl)
+    {
+        const V sum = vantrel::weighted_sum(refl, weights);
+        finite(sum);
+        return sum;
+    }
 
     const Operand &paper;
     vantrel::Bands weights;
-    double same = 0;
+    V same = 0;
 };
 
-[[gnu::flatten]] bool refl_to_density(const Operand *o, npy_intp rows)
+[[gnu::flatten]] Done refl_to_density(const Operand *o, npy_intp rows)
 {
     if (!is_spectrum(o[0]) || !is_paper(o[1]) || !is_same_filter(o[2], o[3]))
-        return false;
-    const Densities density(o[1], static_cast<int>(integer(o[2])), static_cast<int>(integer(o[3])));
+        return Done::nothing;
+    Densities density(o[1], static_cast<int>(integer(o[2])), static_cast<int>(integer(o[3])));
     each_batch(
         rows, [&](const Batch &batch) { return density.sums(spectra(o[0], batch), batch); },
         [&](const Batch &batch, const auto &sums) { store(o[4], batch, density(sums)); });
-    return true;
+    return density.finite.done();
 }
 
-[[gnu::flatten]] bool refl_to_densities(const Operand *o, npy_intp rows)
+[[gnu::flatten]] Done refl_to_densities(const Operand *o, npy_intp rows)
 {
     if (!is_spectrum(o[0]) || !is_paper(o[1]) || !is_same_filter(o[2], o[2]) ||
         integer(o[2]) == CCR1_STATUS)
-        return false;
+        return Done::nothing;
     const int status = static_cast<int>(integer(o[2]));
     std::optional<Densities> densities[NUM_RESPONSES];
     for (const int response : vantrel::responses_of(status))
@@ -273,18 +282,18 @@ private:
     each_batch(rows, [&](const Batch &batch) {
         const Bands refl = spectra(o[0], batch);
         for (int response = VISUAL_RESPONSE; response < NUM_RESPONSES; ++response) {
-            const auto &density = densities[response];
+            auto &density = densities[response];
             store(o[3], batch, density ? (*density)(density->sums(refl, batch)) : V(0), response);
         }
     });
-    return true;
+    return densities[*vantrel::responses_of(status).begin()]->finite.done();
 }
 
-[[gnu::flatten]] bool determine_density_response(const Operand *o, npy_intp rows)
+[[gnu::flatten]] Done determine_density_response(const Operand *o, npy_intp rows)
 {
     if (!is_spectrum(o[0]) || !is_same(o[1]) || !is_spectrum(o[2]) || integer(o[1]) < 0 ||
         integer(o[1]) > T_STATUS)
-        return false;
+        return Done::nothing;
     const int status = static_cast<int>(integer(o[1]));
     each_batch(rows, [&](const Batch &batch) {
         Bands refl = spectra(o[0], batch);
@@ -311,17 +320,17 @@ private:
                 vantrel::automatic_response(row(o[0]), status, row(o[2]));
         }
     });
-    return true;
+    return Done::rows;
 }
 
 // Dot area and gain: solid, tint, paper, status, response, n.
 
-template <class F> bool dot_areas(const Operand *o, npy_intp rows, F store_area)
+template <class F> Done dot_areas(const Operand *o, npy_intp rows, F store_area)
 {
     if (!is_spectrum(o[0]) || !is_spectrum(o[1]) || !is_paper(o[2]) ||
         !is_same_filter(o[3], o[4]) || !is_same(o[5]) || number(o[5]) == 0)
-        return false;
-    const Densities density(o[2], static_cast<int>(integer(o[3])), static_cast<int>(integer(o[4])));
+        return Done::nothing;
+    Densities density(o[2], static_cast<int>(integer(o[3])), static_cast<int>(integer(o[4])));
     const auto absorbed = [&](const Densities::Sums &of) {
         return vantrel::absorptance(density(of), number(o[5]));
     };
@@ -335,18 +344,18 @@ template <class F> bool dot_areas(const Operand *o, npy_intp rows, F store_area)
                            same ? solid : absorbed(density.sums(spectra(o[0], batch), batch)),
                            absorbed(tint)));
         });
-    return true;
+    return std::isfinite(number(o[5])) ? density.finite.done() : Done::rows;
 }
 
-[[gnu::flatten]] bool refl_to_dot_area(const Operand *o, npy_intp rows)
+[[gnu::flatten]] Done refl_to_dot_area(const Operand *o, npy_intp rows)
 {
     return dot_areas(o, rows, [&](const Batch &batch, V area) { store(o[6], batch, area); });
 }
 
-[[gnu::flatten]] bool refl_to_dot_gain(const Operand *o, npy_intp rows)
+[[gnu::flatten]] Done refl_to_dot_gain(const Operand *o, npy_intp rows)
 {
     if (!is_same(o[6]) || integer(o[6]) != static_cast<int>(integer(o[6])))
-        return false;
+        return Done::nothing;
     const int nominal = static_cast<int>(integer(o[6]));
     return dot_areas(o, rows, [&](const Batch &batch, V area) {
         store(o[7], batch, vantrel::dot_gain(area, nominal));
@@ -355,10 +364,10 @@ template <class F> bool dot_areas(const Operand *o, npy_intp rows, F store_area)
 
 // Inks.
 
-[[gnu::flatten]] bool estimate_refls_for_thickness(const Operand *o, npy_intp rows)
+[[gnu::flatten]] Done estimate_refls_for_thickness(const Operand *o, npy_intp rows)
 {
     if (!is_spectrum(o[0]) || !is_same(o[1]) || !is_spectrum(o[2]) || !is_spectrum(o[3]))
-        return false;
+        return Done::nothing;
     const auto absorbances = [&](const Batch &batch) {
         Bands paper = spectra(o[2], batch);
         for (V &band : paper)
@@ -373,27 +382,27 @@ template <class F> bool dot_areas(const Operand *o, npy_intp rows, F store_area)
             refl[i] = vantrel::film_band(refl[i], number(o[1]), paper[i]);
         store(o[3], batch, refl);
     });
-    return true;
+    return Done::rows;
 }
 
-[[gnu::flatten]] bool combine_ink_colors(const Operand *o, npy_intp rows)
+[[gnu::flatten]] Done combine_ink_colors(const Operand *o, npy_intp rows)
 {
     if (!is_spectrum(o[0]) || !is_spectrum(o[1]) || !is_spectrum(o[2]))
-        return false;
+        return Done::nothing;
     each_batch(rows, [&](const Batch &batch) {
         store(o[2], batch, vantrel::overprint(spectra(o[0], batch), spectra(o[1], batch)));
     });
-    return true;
+    return Done::rows;
 }
 
-[[gnu::flatten]] bool estimate_refls(const Operand *o, npy_intp rows)
+[[gnu::flatten]] Done estimate_refls(const Operand *o, npy_intp rows)
 {
     constexpr int kMostInks = 3;
     const npy_intp inks = o[0].counts[0];
     if (inks < 1 || inks > kMostInks || o[0].counts[1] != kBands || o[1].counts[0] != inks ||
         o[0].strides[1] != sizeof(double) || !is_same(o[1]) || !is_spectrum(o[2]) ||
         !is_spectrum(o[3]))
-        return false;
+        return Done::nothing;
     Operand ink[kMostInks];
     int percent[kMostInks];
     for (int k = 0; k < inks; ++k) {
@@ -401,7 +410,7 @@ template <class F> bool dot_areas(const Operand *o, npy_intp rows, F store_area)
         ink[k].row += k * o[0].strides[0];
         const npy_int64 p = *reinterpret_cast<const npy_int64 *>(o[1].row + k * o[1].strides[0]);
         if (p < 0 || p > 100)
-            return false;
+            return Done::nothing;
         percent[k] = static_cast<int>(p);
     }
     each_batch(rows, [&](const Batch &batch) {
@@ -417,23 +426,23 @@ template <class F> bool dot_areas(const Operand *o, npy_intp rows, F store_area)
             printed = vantrel::overprint(printed, layer(k));
         store(o[3], batch, printed);
     });
-    return true;
+    return Done::rows;
 }
 
 constexpr LaneLoop kLoops[] = {
-    {"refl_to_xyz", refl_to_xyz},
-    {"refl_to_cielab", refl_to_cielab},
+    {"refl_to_xyz", refl_to_xyz, true},
+    {"refl_to_cielab", refl_to_cielab, true},
     {"xyz_to_cielab", xyz_to_cielab},
     {"metamerism", metamerism},
     {"verbal_color_difference", verbal_color_difference},
     {"lab_to_de94", lab_to_de94},
     {"lab_to_de2000", lab_to_de2000},
     {"lab_to_de_cmc", lab_to_de_cmc},
-    {"refl_to_density", refl_to_density},
-    {"refl_to_densities", refl_to_densities},
+    {"refl_to_density", refl_to_density, true},
+    {"refl_to_densities", refl_to_densities, true},
     {"determine_density_response", determine_density_response},
-    {"refl_to_dot_area", refl_to_dot_area},
-    {"refl_to_dot_gain", refl_to_dot_gain},
+    {"refl_to_dot_area", refl_to_dot_area, true},
+    {"refl_to_dot_gain", refl_to_dot_gain, true},
     {"estimate_refls_for_thickness", estimate_refls_for_thickness},
     {"combine_ink_colors", combine_ink_colors},
     {"estimate_refls", estimate_refls},

@@ -5,10 +5,18 @@
 
 #include <span>
 
+/// What a loop has computed.
+enum class Done {
+    nothing, ///< none is written: the rows or arguments ask for one row after the other
+    rows,
+    finite_rows, ///< and every input of every row is finite
+};
+
 struct LaneLoop {
     const char *name; ///< of the ufunc
-    /// False, with nothing written, where the rows or arguments ask for one row after the other.
-    bool (*run)(const Operand *operands, npy_intp rows);
+    Done (*run)(const Operand *operands, npy_intp rows);
+    /// Whether it may find that the inputs are finite, by the sums that it makes of them.
+    bool finds_finite = false;
 };
 
 struct LaneLoops {
