@@ -118,31 +118,19 @@ bool read_rows(std::string_view text, Sheet &sheet, bool spectra)
     Table table(sheet, std::move(heading->fields), line);
     sheet.patches.reserve(static_cast<std::size_t>(std::count(text.begin(), text.end(), '\n')) + 1);
     Row row;
-    std::string_view statistics; // from where they stand to the end
-    std::size_t statistics_line = 0;
-    bool patches_alone = false; // "Mean" is the name of a patch where others follow
     while (!text.empty()) {
-        const std::string_view begin = text;
         const std::size_t at = line + 1;
         if (!next_record(text, heading->separator, line, row))
             throw InputError{at, "a quoted text is not closed"};
         if (is_blank(row))
             continue;
-        if (!patches_alone && table.is_statistic(row)) {
-            if (statistics.empty()) {
-                statistics = begin;
-                statistics_line = at;
-            }
-            continue;
-        }
-        if (!statistics.empty()) {
-            text = std::exchange(statistics, {});
-            line = statistics_line - 1;
-            patches_alone = true;
-            continue;
-        }
         while (row.values.size() > table.fields.size() && row.values.back().empty())
             row.values.pop_back();
+        const std::string_view statistic = Table::statistic_in(row);
+        if (row.values.size() < table.fields.size() && !statistic.empty()) {
+            sheet.leave_out(statistic, at);
+            continue;
+        }
         if (row.values.size() != table.fields.size())
             throw InputError{at, fmt::format("{} values in a row of {} fields", row.values.size(),
                                              table.fields.size())};
@@ -150,8 +138,6 @@ bool read_rows(std::string_view text, Sheet &sheet, bool spectra)
         work.left(text.size());
     }
     work.left(0);
-    if (!statistics.empty())
-        sheet.warn(statistics_line, "the rows of averages at the end are left out");
     table.finish();
     return true;
 }

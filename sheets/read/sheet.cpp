@@ -1,6 +1,7 @@
 #include "read/sheet.h"
 
 #include "read/doubts.h"
+#include "read/statistics.h"
 #include "read/text.h"
 
 #include <fmt/format.h>
@@ -31,6 +32,19 @@ std::string names_of(const std::set<Condition> &conditions)
     for (const Condition &condition : conditions)
         out += fmt::format("{}{}", out.empty() ? "" : ", ", name_of(condition));
     return out;
+}
+
+// Keeps those whose places are wanted.
+template <typename Wanted> void keep_some(std::vector<Patch> &patches, Wanted wanted)
+{
+    std::size_t kept = 0;
+    for (std::size_t i = 0; i < patches.size(); ++i)
+        if (wanted(i)) {
+            if (kept != i)
+                patches[kept] = std::move(patches[i]);
+            ++kept;
+        }
+    patches.resize(kept);
 }
 
 double largest_in(const std::vector<Patch> &patches)
@@ -119,16 +133,53 @@ void Sheet::choose_condition()
             warn(0, fmt::format("spectra under {}: those under {} are read, --condition chooses",
                                 names_of(present), name_of(chosen)));
     }
-    std::size_t kept = 0;
-    for (std::size_t i = 0; i < patches.size(); ++i)
-        if (conditions[i] == chosen) {
-            if (kept != i)
-                patches[kept] = std::move(patches[i]);
-            ++kept;
-        }
-    patches.resize(kept);
+    keep_some(patches, [&](std::size_t i) { return conditions[i] == chosen; });
     if (chosen)
         origin.condition = name_of(chosen);
+}
+
+void Sheet::leave_out(std::string_view statistic, std::size_t line)
+{
+    left_out.push_back(in_quotes(statistic));
+    left_out_line = left_out_line ? std::min(left_out_line, line) : line;
+}
+
+// Rows that are named as statistics and are those of the other rows, or have no device values where
+// all patches above have some.
+void Sheet::leave_out_statistics()
+{
+    std::vector<std::pair<Patch *, Statistic>> rows;
+    std::vector<const Patch *> others;
+    for (Patch &patch : patches) {
+        const auto by_name = statistic_named(patch.name);
+        const auto statistic = by_name ? by_name : statistic_named(patch.id);
+        if (statistic)
+            rows.emplace_back(&patch, *statistic);
+        else
+            others.push_back(&patch);
+    }
+    if (rows.empty())
+        return;
+    const bool devices =
+        !others.empty() && std::none_of(others.begin(), others.end(),
+                                        [](const Patch *patch) { return patch->device.empty(); });
+    const std::size_t last = others.empty() ? 0 : others.back()->line;
+    Statistics statistics(std::move(others), kind);
+    std::vector<bool> is_out(patches.size());
+    for (const auto &[row, statistic] : rows) {
+        const std::string name = row->name.empty() ? row->id : row->name;
+        if ((devices && row->device.empty() && row->line > last) ||
+            statistics.holds(statistic, *row)) {
+            leave_out(name, row->line);
+            is_out[static_cast<std::size_t>(row - patches.data())] = true;
+        } else {
+            warn(row->line,
+                 fmt::format("{} is named as a statistic, but is none of the other rows: "
+                             "it is read as a patch",
+                             in_quotes(name)));
+        }
+    }
+    keep_some(patches, [&](std::size_t i) { return !is_out[i]; });
 }
 
 // The place stands for an id that is missing, and the id for a name. Whether any patch has either.
@@ -258,6 +309,11 @@ Measurement Sheet::measurement()
         throw InputError{0, fmt::format("{} {} of {}, no spectra", patches.size(),
                                         patches.size() == 1 ? "patch" : "patches", colour_space)};
     choose_condition();
+    leave_out_statistics();
+    if (!left_out.empty())
+        warn(left_out_line,
+             fmt::format("{} left out: no patch, but {} of the other rows", listed(left_out),
+                         left_out.size() == 1 ? "a statistic" : "statistics"));
     const bool has_ids = std::any_of(patches.begin(), patches.end(),
                                      [](const Patch &patch) { return !patch.id.empty(); });
     const bool named = name_patches();

@@ -31,6 +31,9 @@ public:
     // file gives none.
     void add(Patch patch, Condition condition, std::size_t line);
 
+    // A row that is no patch, by the name of a statistic that it has.
+    void leave_out(std::string_view statistic, std::size_t line);
+
     // What the perfect white reads, and the keyword that says so; throws InputError where another
     // keyword said otherwise.
     void set_full_scale(double value, std::string_view keyword, std::size_t line);
@@ -58,6 +61,7 @@ public:
 private:
     void warn_of(const Bands &used, std::size_t line);
     void choose_condition();
+    void leave_out_statistics();
     bool name_patches();
     void bring_to_percent();
     double largest_fraction() const;
@@ -72,6 +76,8 @@ private:
     std::optional<Bands> bands;
     std::optional<double> full_scale, usual_scale;
     std::string scale_by, usually_by;
+    std::vector<std::string> left_out; // names of statistics
+    std::size_t left_out_line = 0;     // of the first
     bool told_order = false, told_interpolated = false, told_held = false;
 };
 

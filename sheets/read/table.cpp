@@ -1,5 +1,6 @@
 #include "read/table.h"
 
+#include "read/statistics.h"
 #include "read/text.h"
 
 #include <fmt/format.h>
@@ -346,28 +347,34 @@ std::optional<CIELABCOORD> Table::colour(const Row &row, std::size_t line) const
     return CIELABCOORD{out[0], out[1], out[2]};
 }
 
-bool Table::is_statistic(const Row &row) const
+std::string_view Table::statistic_in(const Row &row)
 {
-    constexpr std::array words = {
-        "AVERAGE", "AVG",     "MEAN", "STDDEV",  "STDEV",  "STD",   "SD",   "STANDARDDEVIATION",
-        "MIN",     "MINIMUM", "MAX",  "MAXIMUM", "MEDIAN", "RANGE", "COUNT"};
-    const auto is_word = [&](std::string_view value) {
-        if (value.empty() ||
-            std::string_view("AMSRCamsrc").find(value[0]) == std::string_view::npos)
-            return false; // the words begin with one of these
-        const std::string key = letters(value);
-        return std::find(words.begin(), words.end(), key) != words.end();
-    };
-    for (const Device &device : devices)
-        if (device.column < row.values.size() && !row.values[device.column].empty())
-            return false;
     const std::size_t most = std::min<std::size_t>(row.values.size(), 3);
-    return std::any_of(row.values.begin(), row.values.begin() + static_cast<std::ptrdiff_t>(most),
-                       is_word);
+    const auto end = row.values.begin() + static_cast<std::ptrdiff_t>(most);
+    const auto cell = std::find_if(row.values.begin(), end, [](std::string_view it) {
+        return statistic_named(it).has_value();
+    });
+    return cell == end ? std::string_view() : *cell;
+}
+
+// In each column that makes a patch.
+bool Table::has_numbers(const Row &row) const
+{
+    const auto is_number = [&](std::size_t column) {
+        std::string_view cell = row.values[column];
+        cell.remove_suffix(cell.ends_with('%'));
+        return number_in(cell).has_value();
+    };
+    return values.empty() ? std::all_of(lab.begin(), lab.end(), is_number)
+                          : std::all_of(values.begin(), values.end(), is_number);
 }
 
 void Table::add(const Row &row, Condition given, std::size_t line)
 {
+    if (const auto statistic = statistic_in(row); !statistic.empty() && !has_numbers(row)) {
+        sheet.leave_out(statistic, line);
+        return;
+    }
     Patch patch;
     if (!values.empty()) {
         const Bands &at = bands(row, line);

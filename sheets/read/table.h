@@ -31,11 +31,12 @@ public:
     Table(Sheet &sheet, std::vector<std::string> names, std::size_t line);
 
     // A row has as many values as there are fields. A condition in a column of its own goes before
-    // the one given. Throws InputError.
+    // the one given. A row that is named as a statistic and lacks numbers is left out. Throws
+    // InputError.
     void add(const Row &row, Condition given, std::size_t line);
 
-    // Whether the row is a mean or another statistic of those above, by its name.
-    bool is_statistic(const Row &row) const;
+    // The cell that names a mean or another statistic of other rows; empty where none does.
+    static std::string_view statistic_in(const Row &row);
 
     // Settles what only all rows together tell: whether tints are fractions, which inks there are.
     void finish();
@@ -47,6 +48,7 @@ private:
     void find_colours(const std::vector<std::string> &keys);
     void find_devices(const std::vector<std::string> &keys, std::size_t line);
     bool reads(std::size_t column) const;
+    bool has_numbers(const Row &row) const;
     void warn_of_inks();
     const Bands &bands(const Row &row, std::size_t line);
     std::optional<CIELABCOORD> colour(const Row &row, std::size_t line) const;
