@@ -82,8 +82,8 @@ public:
         std::copy_n(dimensions, 1 + guard.core_dimensions, sizes);
     }
 
-    /// Computes the next rows. Where the loop of lanes has not seen that all inputs are finite, they
-    /// are looked at: before a loop of single rows, whose output may lie over its input.
+    /// Computes the next rows. Where the loop of lanes has not seen that all inputs are finite,
+    /// they are looked at: before a loop of single rows, whose output may lie over its input.
     void operator()(npy_intp rows)
     {
         sizes[0] = rows;

@@ -131,13 +131,13 @@ class Index:
         # what is in a list keeps its type: a member of another enumeration, say
         array = as_numpy(value) if hasattr(value, "dtype") else np.array(value, dtype=object)
         if isinstance(array, np.ndarray) and array.dtype.kind in "UTOb":
-            items = array.astype(object).ravel().tolist()
+            items = array.ravel().tolist()
             if {*map(type, items)} <= {str, self.members}:  # unlike 1 and True, these are all distinct
                 found = {item: self.number(item, name) for item in dict.fromkeys(items)}
-                numbers = [found[item] for item in items]
+                numbers = map(found.__getitem__, items)
             else:
-                numbers = [self.number(item, name) for item in items]
-            array = np.array(numbers, dtype=np.int64).reshape(array.shape)
+                numbers = (self.number(item, name) for item in items)
+            array = np.fromiter(numbers, np.int64, len(items)).reshape(array.shape)
         return as_integers(array, name)
 
     def check(self, value, name):

@@ -171,9 +171,11 @@ V values(const Operand &o, const Batch &batch, int index = 0)
 template <class Element = double>
 void store(const Operand &o, const Batch &batch, V v, int index = 0)
 {
-    for (int lane = 0; lane < batch.rows(); ++lane)
-        *reinterpret_cast<Element *>(o.row + batch.row(lane) * o.step + index * o.strides[0]) =
-            static_cast<Element>(v[lane]);
+    double lanes[N];
+    std::memcpy(lanes, &v, sizeof v);
+    char *at = o.row + batch.first * o.step + index * o.strides[0];
+    for (int lane = 0; lane < batch.rows(); ++lane, at += o.step)
+        *reinterpret_cast<Element *>(at) = static_cast<Element>(lanes[lane]);
 }
 
 Lab labs(const Operand &o, const Batch &batch)
@@ -183,9 +185,14 @@ Lab labs(const Operand &o, const Batch &batch)
 
 void store(const Operand &o, const Batch &batch, V first, V second, V third)
 {
-    store(o, batch, first, 0);
-    store(o, batch, second, 1);
-    store(o, batch, third, 2);
+    double values[3][N];
+    std::memcpy(values[0], &first, sizeof first);
+    std::memcpy(values[1], &second, sizeof second);
+    std::memcpy(values[2], &third, sizeof third);
+    char *at = o.row + batch.first * o.step;
+    for (int lane = 0; lane < batch.rows(); ++lane, at += o.step)
+        for (int i = 0; i < 3; ++i)
+            *reinterpret_cast<double *>(at + i * o.strides[0]) = values[i][lane];
 }
 
 } // namespace
