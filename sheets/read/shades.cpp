@@ -7,6 +7,7 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
+#include <functional>
 #include <map>
 #include <optional>
 #include <string_view>
@@ -49,7 +50,7 @@ struct Shade {
         const Patch *patch;
         double density;
     };
-    std::array<Extreme, 3> least{}, most{}; // through each filter
+    std::array<Extreme, 3> least{}, most{}; // through each filter there is
 };
 
 std::size_t deepest_filter(const Shade &shade, std::size_t filters)
@@ -61,6 +62,7 @@ std::size_t deepest_filter(const Shade &shade, std::size_t filters)
     return out;
 }
 
+// In the order of their tints.
 std::vector<Shade> shades_of(const std::vector<Patch> &patches, Kind kind, const Named &named)
 {
     std::map<std::string_view, std::size_t> fields;
@@ -119,34 +121,53 @@ struct Contradiction {
     double density, of_more;
 };
 
+constexpr double kLeastNoise = 0.05; // of a density
+
+// Whether a patch of the first is denser than one of the other through any filter.
+bool is_denser(const Shade &less, const Shade &more)
+{
+    for (std::size_t filter = 0; filter < less.most.size(); ++filter)
+        if (less.most[filter].density - more.least[filter].density > kLeastNoise)
+            return true;
+    return false;
+}
+
+bool has_no_less(const Shade &more, const Shade &less)
+{
+    return more.spot == less.spot && std::equal(less.tints.begin(), less.tints.end(),
+                                                more.tints.begin(), std::less_equal<>());
+}
+
 // Inks that trap badly lose up to a third of their density, and so does a zone of a bad sheet.
+std::optional<Contradiction> contradiction_of(const Shade &less, const Shade &more,
+                                              std::size_t filters)
+{
+    const bool same_inks =
+        &less != &more && std::equal(less.tints.begin(), less.tints.end(), more.tints.begin(),
+                                     [](double a, double b) { return (a > 0) == (b > 0); });
+    const std::size_t deepest = deepest_filter(less, filters); // an ink shines through others
+    std::optional<Contradiction> worst;
+    for (std::size_t filter = 0; filter < filters; ++filter) {
+        const auto [patch, density] = less.most[filter];
+        const auto [other, of_more] = more.least[filter];
+        const double share = std::max(density, 0.0);
+        const double noise = same_inks ? kLeastNoise + 0.07 * share : 0.1 + 0.3 * share;
+        if ((!less.spot || filter == deepest) && density - of_more > noise &&
+            (!worst || density - of_more > worst->density - worst->of_more))
+            worst = {patch, other, filter, density, of_more};
+    }
+    return worst;
+}
+
+// Of shades in the order of their tints: those before one have less of some ink.
 std::vector<Contradiction> contradictions_of(const std::vector<Shade> &shades, std::size_t filters)
 {
     std::vector<Contradiction> out;
-    for (const Shade &less : shades)
-        for (const Shade &more : shades) {
-            bool covered = less.spot == more.spot, same_inks = &less != &more;
-            for (std::size_t ink = 0; ink < less.tints.size() && covered; ++ink) {
-                covered = less.tints[ink] <= more.tints[ink];
-                same_inks = same_inks && (less.tints[ink] > 0) == (more.tints[ink] > 0);
-            }
-            if (!covered)
-                continue;
-            std::optional<Contradiction> worst;
-            const std::size_t deepest =
-                deepest_filter(less, filters); // an ink shines through others
-            for (std::size_t filter = 0; filter < filters; ++filter) {
-                const auto [patch, density] = less.most[filter];
-                const auto [other, of_more] = more.least[filter];
-                const double share = std::max(density, 0.0);
-                const double noise = same_inks ? 0.05 + 0.07 * share : 0.1 + 0.3 * share;
-                if ((!less.spot || filter == deepest) && density - of_more > noise &&
-                    (!worst || density - of_more > worst->density - worst->of_more))
-                    worst = {patch, other, filter, density, of_more};
-            }
-            if (worst)
-                out.push_back(*worst);
-        }
+    for (auto less = shades.begin(); less != shades.end(); ++less)
+        for (auto more = less; more != shades.end(); ++more)
+            if (is_denser(*less, *more) && has_no_less(*more, *less))
+                if (const auto found = contradiction_of(*less, *more, filters))
+                    out.push_back(*found);
     return out;
 }
 
