@@ -126,6 +126,20 @@ std::uint64_t hash_of(const Spectrum &refl)
     return hash;
 }
 
+// No paper reflects as much as the perfect white in every band.
+void doubt_whites(const std::vector<Patch> &patches, std::vector<Doubt> &out)
+{
+    constexpr double kLikeWhite = 0.5;
+    const auto white = std::find_if(patches.begin(), patches.end(), [](const Patch &patch) {
+        return std::all_of(patch.refl.begin(), patch.refl.end(),
+                           [](double v) { return std::abs(v - 100) <= kLikeWhite; });
+    });
+    if (white != patches.end())
+        out.push_back({white->line, fmt::format("{} reads 100 % in every band: are the spectra "
+                                                "relative to the paper?",
+                                                in_quotes(white->name))});
+}
+
 // A band that stands out of the two beside it: reflectances change slowly along the spectrum.
 void doubt_spikes(const std::vector<Patch> &patches, std::vector<Doubt> &out)
 {
@@ -367,8 +381,10 @@ std::vector<Doubt> doubts_about(const std::vector<Patch> &patches, Kind kind)
     std::vector<Doubt> out;
     Named named;
     if (kind != Kind::colours) {
-        if (kind == Kind::reflectance)
+        if (kind == Kind::reflectance) {
             doubt_scales(patches, named, out);
+            doubt_whites(patches, out);
+        }
         doubt_zeros(patches, named, out);
         doubt_bands(patches, out);
         doubt_alike(patches, out);

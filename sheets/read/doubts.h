@@ -14,11 +14,11 @@ struct Doubt {
     std::string text;
 };
 
-// Of reflectances in percent: rows that are fractions or were not measured, bands that read the
-// same everywhere or stand out of those beside them, reflectances below zero, spectra that stand
-// twice, and solids that read as another ink than the device values say. Of all: gaps in the count
-// of ids or places, ids and names of several patches, and patches that are lighter than others with
-// less ink.
+// Of reflectances in percent: rows that are fractions or were not measured, a patch as white as the
+// perfect white, bands that read the same everywhere or stand out of those beside them,
+// reflectances below zero, spectra that stand twice, and solids that read as another ink than the
+// device values say. Of all: gaps in the count of ids or places, ids and names of several patches,
+// and patches that are lighter than others with less ink.
 std::vector<Doubt> doubts_about(const std::vector<Patch> &patches, Kind kind);
 
 } // namespace vantrel::sheets

@@ -98,9 +98,11 @@ namespace {
 
 bool tells_no_filter(std::string_view text)
 {
-    constexpr std::array words = {"",     "NONE",       "NO",    "NOFILTER", "OFF",       "FALSE",
-                                  "0",    "UNFILTERED", "OPEN",  "NA",       "N/A",       "OHNE",
-                                  "KEIN", "KEINER",     "AUCUN", "SANS",     "UVINCLUDED"};
+    constexpr std::array words = {"",      "NONE",       "NO",         "NOFILTER",    "OFF",
+                                  "FALSE", "0",          "UNFILTERED", "OPEN",        "NA",
+                                  "N/A",   "OHNE",       "KEIN",       "KEINER",      "AUCUN",
+                                  "SANS",  "UVINCLUDED", "REFLECTIVE", "REFLECTANCE", "REFLECTION",
+                                  "SPOT",  "SCAN",       "STRIP"};
     return std::find(words.begin(), words.end(), letters(text)) != words.end();
 }
 
@@ -119,6 +121,14 @@ bool affirms(std::string_view text)
 
 } // namespace
 
+Condition Header::condition_told(std::string_view text)
+{
+    const Condition named = condition_of_filter(text);
+    if (!named && !tells_no_filter(text) && !upper(text).starts_with("STATUS"))
+        unknown_filter = text;
+    return named;
+}
+
 // A later table may name another condition; two keywords of one header contradict each other.
 void Header::keep_condition(const std::string &key, std::string_view value)
 {
@@ -130,12 +140,9 @@ void Header::keep_condition(const std::string &key, std::string_view value)
         return;
     const std::string_view text = trimmed(value);
     const Condition named = polarisation && affirms(text) ? Condition(3)
-                            : filter || polarisation || contains(key, "CONDITION")
-                                ? condition_of_filter(text)
-                                : condition_in(value);
-    if (!named && (filter || polarisation) && !tells_no_filter(text) &&
-        !upper(text).starts_with("STATUS"))
-        unknown_filter = text;
+                            : filter || polarisation      ? condition_told(text)
+                            : contains(key, "CONDITION")  ? condition_of_filter(text)
+                                                          : condition_in(value);
     if (!named)
         return;
     if (condition && condition != named && !condition_key.empty() && condition_key != key) {

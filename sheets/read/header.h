@@ -27,6 +27,9 @@ struct Header {
     std::string other_condition;                  // and one under another keyword
     std::string unknown_filter;
 
+    // condition_of_filter(); what tells neither a condition nor that there is no filter is kept.
+    Condition condition_told(std::string_view text);
+
     // The first to say something is believed, but for the condition.
     void take(std::string_view keyword, std::string_view value);
 

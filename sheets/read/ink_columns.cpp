@@ -6,6 +6,7 @@
 
 #include <algorithm>
 #include <array>
+#include <cmath>
 #include <initializer_list>
 
 namespace vantrel::sheets {
@@ -136,14 +137,14 @@ DoubtfulColumn::DoubtfulColumn(std::size_t column, std::string_view key)
             (key.size() > 2 && key.starts_with("PC") && key[2] >= '0' && key[2] <= '9'))
 {
     constexpr std::array beginnings = {
-        "LAB",      "CIE",       "LCH",        "XYZ",    "XYY",     "LUV",      "RGB",
-        "SRGB",     "DE",        "DELTA",      "DENS",   "DOTAREA", "DOTGAIN",  "TVI",
-        "SCTV",     "TRAP",      "HUE",        "CHROMA", "GRAY",    "GREY",     "PRINTCONTRAST",
-        "NEUTRAL",  "STD",       "STDEV",      "MEAN",   "CHI",     "SPECTRAL", "ROW",
-        "COL",      "LINE",      "PAGE",       "SHEET",  "STRIP",   "ZONE",     "POS",
-        "INDEX",    "TIME",      "STEP",       "COUNT",  "SEQ",     "REPEAT",   "SAMPLE",
-        "PATCH",    "WHITENESS", "BRIGHTNESS", "GLOSS",  "OPACITY", "TEMP",     "HUMID",
-        "LIGHTNESS"};
+        "LAB",        "CIE",   "LCH",     "XYZ",    "XYY",     "LUV",      "RGB",
+        "SRGB",       "DE",    "DELTA",   "DENS",   "DOTAREA", "DOTGAIN",  "TVI",
+        "SCTV",       "TRAP",  "HUE",     "CHROMA", "GRAY",    "GREY",     "PRINTCONTRAST",
+        "NEUTRAL",    "STD",   "STDEV",   "MEAN",   "CHI",     "SPECTRAL", "ROW",
+        "COL",        "LINE",  "PAGE",    "SHEET",  "STRIP",   "ZONE",     "POS",
+        "INDEX",      "TIME",  "STEP",    "COUNT",  "SEQ",     "REPEAT",   "SAMPLE",
+        "PATCH",      "ZEILE", "SPALTE",  "SEITE",  "FEUCHT",  "GLANZ",    "WHITENESS",
+        "BRIGHTNESS", "GLOSS", "OPACITY", "TEMP",   "HUMID",   "LIGHTNESS"};
     constexpr std::array whole = {
         "L",  "L*",       "A*", "B*", "C*",     "H",      "H*",    "HAB",  "X",
         "Z",  "A",        "ID", "NO", "NUMBER", "NR",     "LOC",   "D",    "DC",
@@ -165,18 +166,23 @@ void DoubtfulColumn::take(std::string_view cell)
         ++others;
         return;
     }
+    whole = whole && *value == std::floor(*value);
+    counts = counts && (numbers == 0 || *value == last + 1 || *value == last);
+    last = *value;
     least = numbers ? std::min(least, *value) : *value;
     most = numbers ? std::max(most, *value) : *value;
     ++numbers;
 }
 
-// Bare paper has 0 of an ink. What ends between 1 and 4 is a density.
+// Bare paper has 0 of an ink, a sheet of tints alone has a wide range of whole percentages. What
+// ends between 1 and 4 is a density.
 bool DoubtfulColumn::may_be_ink() const
 {
-    constexpr double kDensest = 4;
+    constexpr double kDensest = 4, kRange = 50;
     const bool percentages = most > kDensest && most <= 255 && (least == 0 || most == 100);
+    const bool tints = !counts && whole && most <= 100 && most - least >= kRange;
     const bool fractions = most > 0 && most <= 1 && least == 0;
-    return named || (numbers > 9 * others && least >= 0 && (percentages || fractions));
+    return named || (numbers > 9 * others && least >= 0 && (percentages || tints || fractions));
 }
 
 } // namespace vantrel::sheets

@@ -28,7 +28,9 @@ private:
     bool named;    // like an ink
     bool measured; // or placed: not by its values
     std::size_t numbers = 0, others = 0;
-    double least = 0, most = 0;
+    double least = 0, most = 0, last = 0;
+    bool counts = true; // one after the other
+    bool whole = true;
 };
 
 } // namespace vantrel::sheets

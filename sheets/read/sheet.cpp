@@ -330,7 +330,7 @@ Measurement Sheet::measurement()
         warn(0, fmt::format("the condition is said to be {}, and {} elsewhere: the first is taken",
                             name_of(header.condition), in_quotes(header.other_condition)));
     if (!header.unknown_filter.empty())
-        warn(0, fmt::format("the filter {} tells no condition known here (M0 to M3)",
+        warn(0, fmt::format("the filter or condition {} tells none that is known here (M0 to M3)",
                             in_quotes(header.unknown_filter)));
     if (xyz)
         bring_to_lab(colours);

@@ -167,6 +167,7 @@ Table::Table(Sheet &sheet, std::vector<std::string> names, std::size_t line)
     ink = column_of(keys, {"INK", "INKNAME", "COLORANT", "COLOURANT"});
     tint = column_of(keys, {"TINT", "TINTPCT", "TINT%", "TINTVALUE", "TONEVALUE", "NOMINAL"});
     find_devices(keys, line);
+    find_ends();
     free_names = free_names || tint != kNone;
     if (tint == kNone) {
         name = name == kNone ? ink : name;
@@ -257,6 +258,38 @@ bool Table::reads(std::size_t column) const
            std::any_of(at_nm.begin(), at_nm.end(), is_it) ||
            std::any_of(devices.begin(), devices.end(),
                        [&](const Device &device) { return is_it(device.column); });
+}
+
+// At the ends of the spectra.
+void Table::find_ends()
+{
+    if (pairs || values.empty())
+        return;
+    const std::size_t first = values.front(), last = values.back();
+    if (first > 0 && !reads(first - 1))
+        neighbours.emplace_back(first - 1, first);
+    if (last + 1 < fields.size() && !reads(last + 1))
+        neighbours.emplace_back(last + 1, last);
+    const std::vector<std::size_t> &used = sheet.bands_at(wavelengths, heading).used();
+    for (std::size_t i = 0; i < values.size(); ++i)
+        if (std::find(used.begin(), used.end(), i) == used.end())
+            spare_bands.emplace_back(values[i]);
+}
+
+void Table::warn_of_shifts()
+{
+    for (const Neighbour &it : neighbours)
+        if (it.continues_spectrum())
+            sheet.warn(
+                heading,
+                fmt::format("the values under {} are near those under {}: is a name missing in the "
+                            "heading, so that each value stands under another wavelength?",
+                            in_quotes(fields[it.column]), in_quotes(fields[it.end])));
+    for (const SpareBand &it : spare_bands)
+        if (it.few_empty())
+            sheet.warn(it.first_line,
+                       fmt::format("the row is empty under {}{}: are its cells shifted?",
+                                   in_quotes(fields[it.column]), and_more(it.empty)));
 }
 
 void Table::warn_of_inks()
@@ -398,13 +431,19 @@ void Table::add(const Row &row, Condition given, std::size_t line)
     free_names = free_names && !percent_signs;
     for (DoubtfulColumn &doubt : doubtful)
         doubt.take(row.values[doubt.column]);
-    const Condition own =
-        condition == kNone ? std::nullopt : condition_of_filter(row.values[condition]);
+    for (Neighbour &it : neighbours)
+        it.take(row);
+    for (SpareBand &it : spare_bands)
+        it.take(row, line);
+    const Condition own = condition == kNone
+                              ? std::nullopt
+                              : sheet.header.condition_told(trimmed(row.values[condition]));
     sheet.add(std::move(patch), own ? own : given, line);
 }
 
 void Table::finish()
 {
+    warn_of_shifts();
     warn_of_inks();
     std::vector<Patch> &patches = sheet.patches;
     double largest = 0;

@@ -4,6 +4,7 @@
 #include "read/ink_columns.h"
 #include "read/lines.h"
 #include "read/sheet.h"
+#include "read/shifts.h"
 
 #include <array>
 #include <cstddef>
@@ -49,6 +50,8 @@ private:
     void find_devices(const std::vector<std::string> &keys, std::size_t line);
     bool reads(std::size_t column) const;
     bool has_numbers(const Row &row) const;
+    void find_ends();
+    void warn_of_shifts();
     void warn_of_inks();
     const Bands &bands(const Row &row, std::size_t line);
     std::optional<CIELABCOORD> colour(const Row &row, std::size_t line) const;
@@ -70,6 +73,8 @@ private:
     std::array<std::size_t, 3> lab; // L*, a*, b*, or X, Y, Z where the sheet says so
     std::vector<Device> devices;
     std::vector<DoubtfulColumn> doubtful;
+    std::vector<Neighbour> neighbours; // of the columns of wavelengths
+    std::vector<SpareBand> spare_bands;
     std::size_t heading = 0;    // its line
     bool free_names = false;    // of a field that no standard names, and so gives no scale
     bool percent_signs = false; // behind values of the row
