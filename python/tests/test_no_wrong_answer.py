@@ -159,6 +159,33 @@ def test_a_wrong_name_is_told_the_right_one(status, response, reason):
         vantrel.refl_to_white_e313_98(SPECTRA, "A_2DEG")
 
 
+def test_a_filter_that_a_status_does_not_have_has_no_reading():
+    through_filters = [
+        lambda status, response, **ok: vantrel.refl_to_density(SPECTRA[:2], PAPER, status, response, **ok),
+        lambda *read, **ok: vantrel.refl_to_refl_density(SPECTRA[:2], *read, **ok),
+        lambda *read, **ok: vantrel.density_to_integrated_refl([1.2, 1.3], *read, **ok),
+        lambda *read, **ok: vantrel.refl_to_dot_area(PAPER / 9, SPECTRA[:2], PAPER, *read, **ok),
+        lambda *read, **ok: vantrel.refl_to_dot_gain(PAPER / 9, SPECTRA[:2], PAPER, *read, 1, 50, **ok),
+        lambda *read, **ok: vantrel.refl_to_print_contrast(PAPER / 9, SPECTRA[:2], PAPER, *read, **ok),
+        lambda *read, **ok: vantrel.refl_to_trap(PAPER / 9, PAPER / 5, SPECTRA[:2], PAPER, *read, **ok),
+        lambda *read, **ok: vantrel.pol_refl_to_density(
+            SPECTRA[:2], np.ones(4), None, None, np.ones((4, 31)), *read, **ok
+        ),
+        lambda *read, **ok: vantrel.get_normalized_density_weights(*read, **ok)[-2:],
+    ]
+    for function in through_filters:
+        with pytest.raises(ValueError, match="response: E_STATUS has no filter for HIFI1.*, but VISUAL_"):
+            function("E", "HIFI1")
+        values, ok = function(["E", "CCR2"], ["GREEN", "HEXACHROME2"], ok=True)
+        assert np.isfinite(values).tolist() == ok.tolist() == [True, False]
+        with vantrel.settings():  # a filter of one's own
+            vantrel.den_weight[1, 4] = vantrel.den_weight[1, 3]
+            assert np.array_equal(function("E", "HIFI1"), function("E", "BLUE"))
+    lazy = vantrel.refl_to_density(da.from_array(SPECTRA, chunks=3), None, da.from_array([1, 6] * 3), 5)
+    assert np.isfinite(lazy.compute()).tolist() == [False, True] * 3
+    assert np.isfinite(vantrel.refl_to_density(SPECTRA[:2], None, ["SPECTRAL", "HIFI"], [550, 6])).all()
+
+
 def hifi(spectra):
     return vantrel.refl_to_density(spectra, None, "HIFI", "HIFI1")
 

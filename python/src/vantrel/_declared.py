@@ -17,6 +17,7 @@ from ._arguments import (
     warn_of_fractions,
 )
 from ._enums import IllumObs, Response, Status
+from ._filters import OWN_READINGS, check_filter, without_filter
 
 WORDS = {"verbal_color_difference": np.array(_ufuncs.difference_words)}
 
@@ -25,6 +26,7 @@ _DOUBLE = np.dtype(np.float64)
 _HANDED_ON = object()  # a value that is not remembered
 _ENUMERATIONS = {IllumObs, Status, Response}
 _MOST_REMEMBERED = 1000  # calls of a function
+_THROUGH_FILTERS = {"Reading", "ResponseName", "InkResponse"}
 
 
 class Declared:
@@ -42,12 +44,29 @@ class Declared:
         self.result_cores = _cores(results)
         self.names = [p.name for p in self.parameters]
         self.kinds = [p.annotation for p in self.parameters]
+        self.read = self._read()
         self.spectral = [is_spectral(*pair) for pair in zip(self.kinds, self.cores)]
         self.without_spectra = not any(self.spectral)
         self.last = [_last(*pair) for pair in zip(self.kinds, self.cores)]
         self.dtypes = [np.dtype(t) for t in self.ufunc.types[0].partition("->")[0]]
         self.seen = {}
         self.defaults = {p.name: p.default for p in self.parameters if p.default is not p.empty}
+
+    def _read(self):
+        """Where a status and a response stand among the arguments, and whether that is a Reading."""
+        read = [i for i, kind in enumerate(self.kinds) if kind in _THROUGH_FILTERS]
+        if "status" not in self.names or not read:
+            return None
+        return self.names.index("status"), read[0], self.kinds[read[0]] == "Reading"
+
+    def _peak(self, values):
+        """The place in den_weight of the largest weight of the filter that is read through."""
+        if not self.read or any(np.ndim(values[i]) for i in self.read[:2]):
+            return None
+        filter_at = tuple(int(values[i]) for i in self.read[:2])
+        if filter_at[0] in OWN_READINGS:
+            return None
+        return *filter_at, int(_ufuncs.den_weight[filter_at].argmax())
 
     def bind(self, args, kwargs):
         """The arguments in order, defaults filled in."""
@@ -75,11 +94,12 @@ class Declared:
         for value, core, kind, name in zip(values, self.cores, self.kinds, self.names):
             if core:
                 check_core(value, core, kind, name)
-        if "Reading" in self.kinds:
-            reading = self.kinds.index("Reading")
-            status = values[self.names.index("status")]
-            if not is_lazy(status) and not is_lazy(values[reading]):
-                check_reading(status, values[reading], self.names[reading])
+        if self.read:
+            i, j, is_reading = self.read
+            if not is_lazy(values[i]) and not is_lazy(values[j]):
+                if is_reading:
+                    check_reading(values[i], values[j], self.names[j])
+                check_filter(values[i], values[j], is_reading, self.names[j])
         if any(self.spectral):
             warn_of_fractions([v for v, s in zip(values, self.spectral) if s], 4)
         return values
@@ -113,9 +133,10 @@ class Declared:
             return None
         called = tuple(key)
         seen = self.seen.get(called)
-        if seen is None:
-            values = zip(self.prepare(self.bind(args, {})), self.dtypes)
-            seen = [np.asarray(*v) for v in values], [i for i, k in enumerate(key) if k is _HANDED_ON]
+        if seen is None or seen[2] and _ufuncs.den_weight.item(seen[2]) <= 0:  # its filter was taken away
+            values = [np.asarray(*v) for v in zip(self.prepare(self.bind(args, {})), self.dtypes)]
+            handed_on = [i for i, k in enumerate(key) if k is _HANDED_ON]
+            seen = values, handed_on, self._peak(values)
             if len(self.seen) < _MOST_REMEMBERED:
                 self.seen[called] = seen
         prepared = seen[0].copy()
@@ -168,6 +189,9 @@ def evaluate(name, ok, *values, out=None, missing=()):
     else:
         outs = out if isinstance(out, tuple) else (out,)
         results = ufunc(*values, out=outs + (None,) * (ufunc.nout - len(outs)))
+    if declared.read and not any(declared.result_cores):  # the C function refuses these itself
+        status, response, is_reading = declared.read
+        results = without_filter(results, values[status], values[response], is_reading)
     if words is None:
         return results
     texts = tuple(words[np.maximum(r, 0)] for r in results[:3])

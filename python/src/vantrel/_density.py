@@ -47,9 +47,8 @@ def refl_to_density(
     """Density (ISO 5-3, ISO 5-4) of spectra in percent, over a paper or absolute (None).
 
     The response is 0 to 8; for SPECTRAL_STATUS a wavelength of 391 to 709 nm (the paper plays no
-    part); for SPECTRALX_STATUS a request of 0 to 30 as in calculate_spectralx_density(). One that
-    the status does not measure gives 5, over a paper or under CCR2_STATUS 0. CCR1_STATUS is read
-    without the correction of calculate_ccr_densities().
+    part); for SPECTRALX_STATUS a request of 0 to 30 as in calculate_spectralx_density(). CCR1_STATUS
+    is read without the correction of calculate_ccr_densities().
 
     >>> print(np.round(vantrel.refl_to_density(magenta, paper, "E", "GREEN"), 3))
     0.872

@@ -18,6 +18,8 @@ _OK = """ok : bool, default False
     Whether a last output tells which rows were accepted. A row that is refused, or that holds a NaN,
     is NaN (-1 in integers, False, "" in words) either way."""
 _RAISES = "ValueError\n    Where an argument is wrong for the whole call, with its name and the reason."
+_NO_FILTER = """A response of which the status has no filter: of single ones a ValueError, of several a
+row that is refused. (The C function answers 5, 0 or infinity.)"""
 _TYPES = {"f": "float", "i": "int", "u": "int", "b": "bool", "U": "str"}
 
 
@@ -56,6 +58,7 @@ def _documentation(declared, declaration, keywords):
     c_name = _ufuncs.c_names[declared.name]
     notes = [
         (declaration.__globals__["__doc__"] or "").partition("\n\n")[2].strip(),
+        _NO_FILTER if declared.read else "",
         f"Shapes: {declared.signature}, broadcast as NumPy does."
         + (f" C function: {c_name}." if c_name else ""),
     ]

@@ -148,7 +148,7 @@ def refl_to_hue_gray(spectra: "Spectra", paper: "OptionalSpectra", status: "HueS
 def density_to_integrated_refl(density: "Numbers", status: "HueStatus", response: "InkResponse"):
     """Reflectance in percent times bands under the response curve: 10^7 / (peak weight 10^D).
 
-    A density of 0 or less is refused; infinite for a response that the status does not have.
+    A density of 0 or less is refused.
 
     >>> print(np.round(vantrel.density_to_integrated_refl(1.2, "E", "GREEN"), 3))
     33.515
