@@ -58,13 +58,16 @@ private:
     std::string_view text;
     Sheet &sheet;
     pugi::xml_document document;
-    std::map<std::string_view, Settings> all_settings; // by Id
-    std::map<std::string_view, TintStep> tints;        // by the object's Id
-    std::map<std::string, Target> targets;             // by place
-    std::vector<std::pair<Patch, Condition>> colours;  // of objects with no spectrum
+    std::map<std::string_view, Settings> all_settings;  // by Id
+    std::map<std::string_view, TintStep> tints;         // by the object's Id
+    std::map<std::string, Target> targets;              // by place
+    using Measured = std::pair<Condition, std::size_t>; // setup
+    std::vector<std::pair<Patch, Measured>> colours;    // of objects with no spectrum
+    std::map<Measured, std::string_view> preferred;     // ColorSpecification of several
     bool step_missing = false;
-    std::size_t without = 0;  // objects with no spectrum
-    std::size_t repeated = 0; // spectra of an object under a condition that it has already
+    std::size_t without = 0;      // objects with no spectrum
+    std::size_t repeated = 0;     // spectra of an object under a condition that it has already
+    std::string_view repeated_of; // ColorSpecification that is read instead of the first
     std::optional<std::pair<std::string_view, std::string_view>>
         first_stated;                   // illuminant, observer
     std::size_t of_others = 0;          // colours for others than these
@@ -257,52 +260,65 @@ void CxfReader::read_object(const Node &object)
     Patch patch;
     name(patch, object);
 
-    // the object's own colours, one for a condition
+    // the object's own colours, one for a condition and setup
     struct Own {
         CIELABCOORD lab;
-        Condition condition;
+        Measured measured;
     };
     std::vector<Own> own;
     for (const Node &node : values.children())
         if (const auto lab = read_colour(node)) {
-            const Condition condition = settings_of(node).condition;
+            const Settings &settings = settings_of(node);
+            const Measured measured{settings.condition, settings.setup_number};
             if (std::none_of(own.begin(), own.end(),
-                             [&](const Own &other) { return other.condition == condition; }))
-                own.push_back({*lab, condition});
+                             [&](const Own &other) { return other.measured == measured; }))
+                own.push_back({*lab, measured});
         }
-    const auto own_under = [&](Condition condition) -> std::optional<CIELABCOORD> {
+    const auto own_of = [&](const Measured &measured) -> std::optional<CIELABCOORD> {
+        const auto [condition, setup] = measured;
         for (const Own &colour : own)
-            if (colour.condition == condition || !colour.condition)
+            if ((colour.measured.first == condition || !colour.measured.first) &&
+                (colour.measured.second == setup || colour.measured.second == 0))
                 return colour.lab;
         return std::nullopt;
     };
 
-    std::vector<Condition> seen;
-    for (const Node &spectrum : values.children()) {
-        const bool transmission = is(spectrum, "TransmittanceSpectrum");
-        if (!is(spectrum, "ReflectanceSpectrum") && !transmission)
+    std::vector<std::pair<Measured, Node>> spectra;
+    for (const Node &node : values.children()) {
+        if (!is(node, "ReflectanceSpectrum") && !is(node, "TransmittanceSpectrum"))
             continue;
-        const Settings &settings = settings_of(spectrum);
-        const Condition condition =
-            settings.condition ? settings.condition : condition_in(attribute(spectrum, "Name"));
-        if (std::find(seen.begin(), seen.end(), condition) != seen.end()) {
-            ++repeated;
+        const Settings &settings = settings_of(node);
+        const Measured measured{settings.condition ? settings.condition
+                                                   : condition_in(attribute(node, "Name")),
+                                settings.setup_number};
+        const auto same = std::find_if(spectra.begin(), spectra.end(),
+                                       [&](const auto &it) { return it.first == measured; });
+        if (same == spectra.end()) {
+            spectra.emplace_back(measured, node);
             continue;
         }
-        if (transmission || settings.quantity.find("Transmi") != std::string_view::npos)
+        const auto before =
+            preferred.try_emplace(measured, attribute(same->second, "ColorSpecification")).first;
+        if (attribute(node, "ColorSpecification") == before->second)
+            same->second = node;
+        repeated_of = repeated++ ? repeated_of : before->second;
+    }
+    for (const auto &[measured, spectrum] : spectra) {
+        const Settings &settings = settings_of(spectrum);
+        if (is(spectrum, "TransmittanceSpectrum") ||
+            settings.quantity.find("Transmi") != std::string_view::npos)
             sheet.kind = Kind::transmission;
         read_spectrum(spectrum, settings, patch);
-        seen.push_back(condition);
-        patch.lab = own_under(condition);
-        sheet.add(patch, condition, line_of(spectrum));
+        patch.lab = own_of(measured);
+        sheet.add(patch, measured.first, line_of(spectrum), measured.second);
     }
-    if (!seen.empty())
+    if (!spectra.empty())
         return;
     ++without;
     patch.line = line_of(object);
-    for (const auto &[lab, condition] : own) {
+    for (const auto &[lab, measured] : own) {
         patch.lab = lab;
-        colours.emplace_back(patch, condition);
+        colours.emplace_back(patch, measured);
     }
 }
 
@@ -334,7 +350,11 @@ void CxfReader::read_about(const Node &root)
         sheet.header.take(local_name(node.name()), node.child_value());
     for (const Node &node :
          child(child(root, "Resources"), "ColorSpecificationCollection").children()) {
-        all_settings.try_emplace(attribute(node, "Id"), settings_in(node));
+        Settings settings = settings_in(node);
+        settings.setup_number = sheet.setup_number(settings.setup);
+        if (!settings.unknown.empty())
+            sheet.header.condition_told(settings.unknown);
+        all_settings.try_emplace(attribute(node, "Id"), std::move(settings));
         const Node device = child(child(node, "MeasurementSpec"), "Device");
         sheet.header.take("INSTRUMENT", child(device, "Model").child_value());
     }
@@ -377,9 +397,9 @@ void CxfReader::read()
         sheet.warn(0, fmt::format("objects without a reflectance spectrum: {}", without));
     if (sheet.patches.empty() && !colours.empty()) {
         sheet.kind = Kind::colours;
-        for (auto &[patch, condition] : colours) {
+        for (auto &[patch, measured] : colours) {
             const std::size_t at = patch.line;
-            sheet.add(std::move(patch), condition, at);
+            sheet.add(std::move(patch), measured.first, at, measured.second);
         }
     }
     const auto unused = std::count_if(targets.begin(), targets.end(),
@@ -393,9 +413,9 @@ void CxfReader::read()
                    fmt::format("colours for another illuminant or observer than {}, left out: {}",
                                in_quotes(sheet.header.colours().stated), of_others));
     if (repeated > 0)
-        sheet.warn(
-            0, fmt::format("further spectra of an object under the same condition, left out: {}",
-                           repeated));
+        sheet.warn(0, fmt::format("further spectra of an object under the same condition, left "
+                                  "out: {}; ColorSpecification {} is read",
+                                  repeated, in_quotes(repeated_of)));
 }
 
 } // namespace

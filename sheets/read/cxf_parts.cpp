@@ -4,6 +4,7 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
 #include <utility>
 #include <vector>
 
@@ -21,9 +22,38 @@ template <typename Visit> auto first_below(const Node &top, Visit visit)
     decltype(visit(top)) found{};
     static_cast<void>(top.find_node([&](const Node &node) {
         found = visit(node);
-        return bool(found);
+        return found != decltype(found){};
     }));
     return found;
+}
+
+// What tells a condition by its name, and is none that is known.
+std::string_view unknown_condition_of(const Node &node)
+{
+    const std::string_view name = local_name(node.name());
+    const bool told = name == "MeasurementCondition" || name == "MeasurementMode";
+    return told && !condition_in(node.child_value()) ? trimmed(node.child_value())
+                                                     : std::string_view();
+}
+
+// The names and texts of an element and those below it: "Backing White".
+std::string description_of(const Node &top)
+{
+    std::string out;
+    const auto add = [&](const Node &node) {
+        if (node.type() != pugi::node_element)
+            return false;
+        const std::string_view text = trimmed(node.child_value());
+        const bool blank = text.find_first_not_of(" \t\r\n") == std::string_view::npos;
+        out += fmt::format("{}{}{}{}", out.empty() ? "" : " ", local_name(node.name()),
+                           blank ? "" : " ", blank ? "" : text);
+        return false;
+    };
+    if (top) {
+        add(top);
+        static_cast<void>(top.find_node(add));
+    }
+    return out.empty() ? out : out + "; ";
 }
 
 // The condition that one element below a ColorSpecification tells.
@@ -69,12 +99,25 @@ Settings settings_in(const Node &stated)
         out.condition = 3;
     else
         out.condition = first_below(stated, condition_of);
-    if (!out.condition &&
-        contains_any_case(child(device, "DeviceFilter").child_value(), "UVEXCLUDED"))
-        out.condition = 2;
+    const Node filter = child(device, "DeviceFilter");
+    std::string_view of_filter = trimmed(filter.child_value());
+    if (of_filter.starts_with("Filter_"))
+        of_filter.remove_prefix(7);
+    if (!out.condition)
+        out.condition = condition_of_filter(of_filter);
     for (const char *name : {"Name", "Id"})
         if (!out.condition)
             out.condition = condition_in(attribute(stated, name));
+    for (const Node &node : measurement.children())
+        if (contains_any_case(local_name(node.name()), "BACKING"))
+            out.setup += description_of(node);
+    if (!out.condition) {
+        out.unknown = of_filter.empty() ? first_below(stated, unknown_condition_of) : of_filter;
+        out.setup += description_of(child(device, "DeviceIllumination")) + description_of(filter);
+    }
+    for (const Node &geometry : child(measurement, "GeometryChoice").children())
+        out.setup += description_of(geometry);
+    out.setup.resize(out.setup.size() - std::min<std::size_t>(out.setup.size(), 2));
     return out;
 }
 

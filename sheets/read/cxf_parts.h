@@ -4,6 +4,7 @@
 #include "read/header.h"
 #include "read/xml.h"
 
+#include <cstddef>
 #include <map>
 #include <optional>
 #include <string>
@@ -14,6 +15,9 @@ namespace vantrel::sheets {
 // How a ColorSpecification was measured, and what its colours were computed for.
 struct Settings {
     Condition condition;
+    std::string_view unknown; // filter or condition, where none of those known is told
+    std::string setup;        // geometry and backing; without a condition the light and filter too
+    std::size_t setup_number = 0;
     std::optional<double> first_nm, step_nm;
     std::string_view illuminant, observer, quantity;
 };

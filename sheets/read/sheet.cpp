@@ -35,16 +35,16 @@ std::string names_of(const std::set<Condition> &conditions)
 }
 
 // Keeps those whose places are wanted.
-template <typename Wanted> void keep_some(std::vector<Patch> &patches, Wanted wanted)
+template <typename Value, typename Wanted> void keep_some(std::vector<Value> &all, Wanted wanted)
 {
     std::size_t kept = 0;
-    for (std::size_t i = 0; i < patches.size(); ++i)
+    for (std::size_t i = 0; i < all.size(); ++i)
         if (wanted(i)) {
             if (kept != i)
-                patches[kept] = std::move(patches[i]);
+                all[kept] = std::move(all[i]);
             ++kept;
         }
-    patches.resize(kept);
+    all.resize(kept);
 }
 
 double largest_in(const std::vector<Patch> &patches)
@@ -86,13 +86,22 @@ void Sheet::warn_of(const Bands &used, std::size_t line)
                                                        : "700 nm"));
 }
 
-void Sheet::add(Patch patch, Condition condition, std::size_t line)
+void Sheet::add(Patch patch, Condition condition, std::size_t line, std::size_t setup)
 {
     if (patches.empty())
         origin = bands ? bands->source() : Source{};
     patch.line = line;
     patches.push_back(std::move(patch));
     conditions.push_back(condition);
+    setups.push_back(setup);
+}
+
+std::size_t Sheet::setup_number(const std::string &setup)
+{
+    const auto [at, added] = setup_numbers.try_emplace(setup, told_setups.size());
+    if (added)
+        told_setups.push_back(setup);
+    return at->second;
 }
 
 void Sheet::set_full_scale(double value, std::string_view keyword, std::size_t line)
@@ -134,8 +143,32 @@ void Sheet::choose_condition()
                                 names_of(present), name_of(chosen)));
     }
     keep_some(patches, [&](std::size_t i) { return conditions[i] == chosen; });
+    keep_some(setups, [&](std::size_t i) { return conditions[i] == chosen; });
     if (chosen)
         origin.condition = name_of(chosen);
+    choose_setup();
+}
+
+// That of the first patch.
+void Sheet::choose_setup()
+{
+    const std::size_t chosen = setups.front();
+    const auto other = std::find_if(setups.begin(), setups.end(),
+                                    [=](std::size_t setup) { return setup != chosen; });
+    if (other == setups.end())
+        return;
+    const auto told = [&](std::size_t setup) {
+        return told_setups[setup].empty()
+                   ? "none named"
+                   : fmt::format("\"{}\"", cut(printable(told_setups[setup]), 120));
+    };
+    const auto left =
+        setups.size() - static_cast<std::size_t>(std::count(setups.begin(), setups.end(), chosen));
+    warn(patches[static_cast<std::size_t>(other - setups.begin())].line,
+         fmt::format("geometry and backing of the first patch: {}; spectra of others, such as {}, "
+                     "left out: {}",
+                     told(chosen), told(*other), left));
+    keep_some(patches, [&](std::size_t i) { return setups[i] == chosen; });
 }
 
 void Sheet::leave_out(std::string_view statistic, std::size_t line)

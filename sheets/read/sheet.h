@@ -6,6 +6,7 @@
 #include "read/measurement.h"
 
 #include <cstddef>
+#include <map>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -28,8 +29,11 @@ public:
     const Bands &bands_at(const std::vector<double> &wavelengths, std::size_t line);
 
     // The patch's reflectances are still on the file's scale; its id and name are empty where the
-    // file gives none.
-    void add(Patch patch, Condition condition, std::size_t line);
+    // file gives none. Patches of several setups are kept apart, as those under several conditions.
+    void add(Patch patch, Condition condition, std::size_t line, std::size_t setup = 0);
+
+    // The number of the geometry, backing and the like that this text tells.
+    std::size_t setup_number(const std::string &setup);
 
     // A row that is no patch, by the name of a statistic that it has.
     void leave_out(std::string_view statistic, std::size_t line);
@@ -61,6 +65,7 @@ public:
 private:
     void warn_of(const Bands &used, std::size_t line);
     void choose_condition();
+    void choose_setup();
     void leave_out_statistics();
     bool name_patches();
     void bring_to_percent();
@@ -73,6 +78,9 @@ private:
     Source origin; // that of the first patch
     std::vector<std::string> warnings;
     std::vector<Condition> conditions; // of each patch
+    std::vector<std::size_t> setups;   // of each patch
+    std::vector<std::string> told_setups = {""};
+    std::map<std::string, std::size_t> setup_numbers = {{"", 0}};
     std::optional<Bands> bands;
     std::optional<double> full_scale, usual_scale;
     std::string scale_by, usually_by;
