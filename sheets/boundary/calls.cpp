@@ -59,7 +59,9 @@ public:
     {
         std::string value = text(name, choices.front().c_str());
         if (std::find(choices.begin(), choices.end(), value) == choices.end())
-            refuse(name, fmt::format("one of {}", fmt::join(choices, ", ")));
+            refuse(name,
+                   fmt::format("one of {}", fmt::join(choices.begin() + choices.front().empty(),
+                                                      choices.end(), ", ")));
         return value;
     }
 
@@ -314,8 +316,11 @@ Measurement open_spectra(std::string_view file, const Rows &rows, std::string_vi
 
 std::string about(const Measurement &sheet)
 {
+    std::vector<std::string> warnings;
+    for (const std::string &warning : sheet.warnings) // LINE: and what there is to say
+        warnings.push_back(warning.substr(warning.find_first_not_of(' ')));
     const nlohmann::ordered_json out = {
-        {"file", sheet.file}, {"patches", sheet.patches.size()}, {"warnings", sheet.warnings}};
+        {"file", sheet.file}, {"patches", sheet.patches.size()}, {"warnings", warnings}};
     return out.dump();
 }
 
@@ -338,6 +343,8 @@ std::string report(const std::vector<const Measurement *> &sheets, const Measure
     given.finish();
     if (!(request.n_factor > 0) || !std::isfinite(request.n_factor))
         refuse("n_factor", "a number above 0");
+    if (sheets.empty())
+        throw RequestError{"there is no sheet"};
     std::vector<Report> reports;
     for (const Measurement *sheet : sheets)
         reports.push_back(report_of(*sheet, request));

@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <exception>
 #include <new>
+#include <stdexcept>
 #include <string>
 #include <string_view>
 #include <utility>
@@ -35,6 +36,8 @@ template <typename Work> VantrelAnswer *answer(const Work &work) noexcept
             return new VantrelAnswer{false, error.message};
         } catch (const std::bad_alloc &) {
             return &out_of_memory;
+        } catch (const std::length_error &) { // more than any memory holds
+            return &out_of_memory;
         } catch (const std::exception &error) {
             return new VantrelAnswer{false, error.what()};
         }
@@ -43,11 +46,26 @@ template <typename Work> VantrelAnswer *answer(const Work &work) noexcept
     }
 }
 
+// What a host passes that has no sheet, since its file was refused, is a null pointer.
+template <typename T> const T *required(const T *pointer, const char *name)
+{
+    if (!pointer)
+        throw RequestError{std::string(name) + " is null"};
+    return pointer;
+}
+
+const Measurement &measurement_of(const VantrelSheet *sheet, const char *name)
+{
+    return required(sheet, name)->measurement;
+}
+
 // Hands the measurement over, and says what there is to say about it.
 template <typename Open> VantrelAnswer *opened(VantrelSheet **sheet, const Open &open)
 {
-    *sheet = nullptr;
+    if (sheet)
+        *sheet = nullptr;
     return answer([&] {
+        required(sheet, "the place of the sheet");
         Measurement measurement = open();
         std::string out = about(measurement);
         *sheet = new VantrelSheet{std::move(measurement)};
@@ -69,14 +87,13 @@ std::vector<const Measurement *> measurements_of(const VantrelSheet *const *shee
 {
     std::vector<const Measurement *> out;
     for (std::size_t i = 0; i < count; ++i)
-        out.push_back(&sheets[i]->measurement);
+        out.push_back(&measurement_of(required(sheets, "the list of sheets")[i], "a sheet"));
     return out;
 }
 
 const Patch *patch_at(const VantrelSheet *sheet, std::size_t patch)
 {
-    const std::vector<Patch> &patches = sheet->measurement.patches;
-    return patch < patches.size() ? &patches[patch] : nullptr;
+    return patch < vantrel_patches(sheet) ? &sheet->measurement.patches[patch] : nullptr;
 }
 
 } // namespace
@@ -85,7 +102,9 @@ VantrelAnswer *vantrel_open(const char *name, const char *bytes, size_t size, co
                             VantrelSheet **sheet, VantrelTell tell, void *user)
 {
     return opened(sheet, [&] {
-        return open_file(name, {bytes, size}, given(options), teller(tell, user));
+        required(size ? bytes : "", "the file");
+        return open_file(required(name, "the name"), {bytes, size}, given(options),
+                         teller(tell, user));
     });
 }
 
@@ -94,20 +113,23 @@ VantrelAnswer *vantrel_open_spectra(const char *name, const double *spectra, siz
                                     VantrelSheet **sheet)
 {
     return opened(sheet, [&] {
-        Rows rows{spectra, patches, bands, {}};
-        if (names)
-            rows.names.assign(names, names + patches);
-        return open_spectra(name, rows, given(options));
+        Rows rows{required(spectra, "the list of spectra"), patches, bands, {}};
+        for (std::size_t i = 0; names && i < patches; ++i)
+            rows.names.emplace_back(required(names[i], "a name"));
+        return open_spectra(required(name, "the name"), rows, given(options));
     });
 }
 
 void vantrel_close(VantrelSheet *sheet) { delete sheet; }
 
-size_t vantrel_patches(const VantrelSheet *sheet) { return sheet->measurement.patches.size(); }
+size_t vantrel_patches(const VantrelSheet *sheet)
+{
+    return sheet ? sheet->measurement.patches.size() : 0;
+}
 
 int vantrel_spectra(const VantrelSheet *sheet, double *spectra)
 {
-    if (sheet->measurement.kind == Kind::colours)
+    if (!sheet || !spectra || sheet->measurement.kind == Kind::colours)
         return 0;
     for (const Patch &patch : sheet->measurement.patches)
         spectra = std::copy(patch.refl.begin(), patch.refl.end(), spectra);
@@ -141,26 +163,28 @@ VantrelAnswer *vantrel_compare(const VantrelSheet *reference, const VantrelSheet
                                const char *options, VantrelTell tell, void *user)
 {
     return answer([&] {
-        return compare(reference->measurement, sample->measurement, given(options),
-                       teller(tell, user));
+        return compare(measurement_of(reference, "the reference"),
+                       measurement_of(sample, "the sample"), given(options), teller(tell, user));
     });
 }
 
 VantrelAnswer *vantrel_run(const VantrelSheet *const *sheets, size_t count,
                            const VantrelSheet *aims, const char *options)
 {
-    return answer(
-        [&] { return run(measurements_of(sheets, count), aims->measurement, given(options)); });
+    return answer([&] {
+        return run(measurements_of(sheets, count), measurement_of(aims, "the sheet of aims"),
+                   given(options));
+    });
 }
 
 VantrelAnswer *vantrel_predict(const VantrelSheet *sheet, const char *options)
 {
-    return answer([&] { return predict(sheet->measurement, given(options)); });
+    return answer([&] { return predict(measurement_of(sheet, "the sheet"), given(options)); });
 }
 
 VantrelAnswer *vantrel_ink(const VantrelSheet *sheet, const char *options)
 {
-    return answer([&] { return ink(sheet->measurement, given(options)); });
+    return answer([&] { return ink(measurement_of(sheet, "the sheet"), given(options)); });
 }
 
 int vantrel_answer_ok(const VantrelAnswer *answer) { return answer->ok; }

@@ -15,7 +15,8 @@
  * with the reason why there is none. Texts are UTF-8. Options are a JSON object; null is none, and
  * an unknown one, or a value that it does not take, is refused. There is no global state: threads
  * may use one sheet at the same time as long as none closes it. No exception leaves a call; where
- * memory runs out, that is the answer. A null pointer is legal only where it says so. */
+ * memory runs out, that is the answer. A null pointer is legal only where it says so: any other is
+ * refused, and a sheet that is null has no patches. An answer is never null. */
 #ifndef VANTREL_SHEETS_H
 #define VANTREL_SHEETS_H
 

@@ -1,6 +1,7 @@
 /* A host in C: vantrel_host COMMAND OPTIONS FILE… prints the answer of vantrel_COMMAND(), or the
  * reason why there is none, with exit status 2. `vantrel_host spectra` opens its file's spectra and
- * names from memory first, and reports on them. */
+ * names from memory first, and reports on them; `vantrel_host nulls` prints what calls with a null
+ * pointer say. */
 #include <stdio.h>
 #include <stdlib.h>
 #include <string.h>
@@ -53,6 +54,36 @@ static VantrelSheet *from_memory(VantrelSheet *sheet, const char *name)
     return made;
 }
 
+static int say_nulls(const VantrelSheet *sheet)
+{
+    const char *names[] = {NULL};
+    const VantrelSheet *none = NULL;
+    VantrelSheet *made = NULL;
+    double row[31] = {0};
+    VantrelAnswer *answers[] = {
+        vantrel_open(NULL, "", 0, NULL, &made, NULL, NULL),
+        vantrel_open("x", NULL, 1, NULL, &made, NULL, NULL),
+        vantrel_open("x", "", 0, NULL, NULL, NULL, NULL),
+        vantrel_open_spectra("x", NULL, 1, 31, NULL, NULL, &made),
+        vantrel_open_spectra("x", row, 1, 31, names, NULL, &made),
+        vantrel_open_spectra("x", row, (size_t)-1, 31, NULL, NULL, &made),
+        vantrel_report(NULL, 0, NULL, NULL, NULL, NULL),
+        vantrel_report(NULL, 1, NULL, NULL, NULL, NULL),
+        vantrel_report(&none, 1, NULL, NULL, NULL, NULL),
+        vantrel_compare(none, sheet, NULL, NULL, NULL),
+        vantrel_compare(sheet, none, NULL, NULL, NULL),
+        vantrel_run(&sheet, 1, none, NULL),
+        vantrel_predict(none, NULL),
+        vantrel_ink(none, NULL),
+    };
+    size_t i;
+    for (i = 0; i < sizeof answers / sizeof *answers; ++i) {
+        printf("%d %s\n", vantrel_answer_ok(answers[i]), vantrel_answer_text(answers[i]));
+        vantrel_answer_free(answers[i]);
+    }
+    return vantrel_patches(none) || vantrel_spectra(none, row) || vantrel_patch_name(none, 0);
+}
+
 int main(int count, char **words)
 {
     const char *command = words[1], *options = words[2];
@@ -62,6 +93,8 @@ int main(int count, char **words)
     int i, files = count - 3;
     for (i = 0; i < files && i < most; ++i)
         sheets[i] = open_file(words[3 + i]);
+    if (!strcmp(command, "nulls"))
+        return say_nulls(sheets[0]);
     if (!strcmp(command, "spectra"))
         sheets[0] = from_memory(sheets[0], words[3]);
     answer =
