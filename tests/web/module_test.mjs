@@ -64,6 +64,7 @@ test('spectra in memory are a sheet', () => {
   assert.deepEqual([file.ids, names], [a.map(({ id }) => id), a.map(({ name }) => name)]);
   assert.throws(() => vantrel.readSpectra(spectra.subarray(1)), /rows of 31/);
   assert.throws(() => vantrel.readSpectra(spectra, { names: names.slice(1) }), /with a name each/);
+  assert.throws(() => vantrel.readSpectra(spectra, { names: names.with(2, 'a\0b') }), /a character 0/);
   file.close();
   assert.throws(() => vantrel.report(file), /press\.txt is closed/);
 });
@@ -71,6 +72,16 @@ test('spectra in memory are a sheet', () => {
 test('refusals are told, progress too, and memory is given back', () => {
   assert.throws(() => vantrel.read('CGATS.17\nBEGIN_DATA\n1\t2\n', { name: 'x' }), /^Error: x: no measurement file/);
   const bytes = readFileSync(join(data, 'press.txt'));
+  const view = new DataView(bytes.buffer, bytes.byteOffset, bytes.length);
+  assert.equal(vantrel.read(view, { name: 7 }).file, '7');
+  for (const given of [undefined, 5, {}, Promise.resolve(bytes), new Blob([bytes])])
+    assert.throws(() => vantrel.read(given), /^TypeError: read\(\) takes/);
+  for (const given of [undefined, {}, { pointer: 8 }])
+    assert.throws(() => vantrel.report([given]), /^TypeError: what is no sheet/);
+  const sheet = vantrel.read(bytes);
+  assert.throws(() => vantrel.compare(sheet, sheet, { tolerance: NaN }), /^TypeError: an option holds NaN/);
+  assert.throws(() => vantrel.report([]), /there is no sheet/);
+  assert.throws(() => vantrel.read(bytes, {}, 'tell'), /no function/);
   const shares = [];
   const before = vantrel.wasm.HEAPU8.length;
   const free = () => { // the place of the next function in the module's table
@@ -82,6 +93,7 @@ test('refusals are told, progress too, and memory is given back', () => {
   for (let i = 0; i < 2000; ++i) {
     vantrel.read(bytes, {}, (what, share) => shares.push(share)).close();
     assert.throws(() => vantrel.read(bytes, { papier: 1 }), /no option "papier"/);
+    assert.throws(() => vantrel.read(bytes, {}, () => { throw new Error('enough'); }), /^Error: enough$/);
   }
   assert.ok(shares.length >= 2000 && shares.every((share) => share >= 0 && share <= 1));
   assert.deepEqual([vantrel.wasm.HEAPU8.length, free()], [before, place]);

@@ -123,11 +123,13 @@ test('in Chromium the same calls give the same', async () => {
   await new Promise((ready) => { server.listen(0, '127.0.0.1', ready); });
   const page = await browser.newPage();
   await page.goto(`http://127.0.0.1:${server.address().port}/`);
+  run(fileURLToPath(installed), join(WEB, 'node_modules/.bin/esbuild'), 'index.js', '--bundle', '--minify',
+    '--format=esm', '--target=es2022', '--log-level=error', '--outfile=bundle.js');
   const sheet = readFileSync(join(root, 'tests/sheets/data/press.txt'), 'utf8');
   const [results, report] = await page.evaluate(async ([asked, text]) => {
-    const installed = await import('/index.js');
+    const [installed, bundled] = [await import('/index.js'), await import('/bundle.js')];
     return [asked.map(([name, values]) => installed[name](...values)),
-      installed.report(installed.read(text, { name: 'press.txt' }))];
+      bundled.report(bundled.read(text, { name: 'press.txt' }))];
   }, [calls.map(([name, values]) => [name, values]), sheet]);
   assert.deepEqual(results, calls.map(([, , result]) => result));
   assert.deepEqual(report, vantrel.report(vantrel.read(sheet, { name: 'press.txt' })));
@@ -148,6 +150,19 @@ test('rows are what single calls are', () => {
   assert.throws(() => vantrel.reflToCIELAB(lab, 'D50_2DEG'), /reflToCIELAB\(\) takes rows of 31 numbers/);
   assert.throws(() => vantrel.reflToCIELAB(new Float64Array(31), 'D51'), /illumObs of reflToCIELAB\(\) is D51/);
   assert.throws(() => vantrel.reflToDensity(new Float64Array(62), null, 99, 1), /row 0: for /);
+});
+
+test('what is no number and no name of its kind is refused', () => {
+  const spectra = Array.from({ length: 62 }, (_, i) => 20 + i);
+  const one = spectra.slice(31);
+  assert.deepEqual(vantrel.reflToCIELAB(spectra, ['D50_2DEG', 'F7_10DEG']).slice(3), vantrel.reflToCIELAB(one, 'F7_10DEG'));
+  for (const illuminant of [NaN, 1.5, 2 ** 32, 'toString', '__proto__', 'A_STATUS', 'NUM_ILLUM_OBS', null, []])
+    assert.throws(() => vantrel.reflToCIELAB(one, illuminant), /^TypeError: illumObs of reflToCIELAB\(\)/);
+  assert.throws(() => vantrel.reflToDensity(one, null, 'D50_2DEG', 1), /^TypeError: status of/);
+  for (const value of [null, undefined, '40', [40]]) {
+    assert.throws(() => vantrel.reflToCIELAB(one.with(3, value), 'D50_2DEG'), /^TypeError: refl of .* at place 3/);
+    assert.throws(() => vantrel.readSpectra(one.with(3, value)), /^TypeError: spectra of .* at place 3/);
+  }
 });
 
 test('the example of the README', () => {

@@ -32,7 +32,9 @@ const reasonIn = (comment) => /@return (?:1; 0|true; false) ((?:.|\n)*?)(\.\s|\.
 
 const TYPES = { CIELABCOORD: 'double', CIELCHCOORD: 'double', DENSITYSTRUCT: 'double',
   POLWEIGHTSTRUCT: 'double', 'unsigned int': 'unsigned' };
-const VALUES = { k: 'Illuminant', s: 'Status', r: 'Response', d: 'Numbers', i: 'Numbers | string' };
+const VALUES = { k: 'Illuminant | Illuminant[]', s: 'Status | Status[]', r: 'Response | Response[]', d: 'Numbers',
+  i: 'Numbers | Response | Response[]' };
+const ENDINGS = { k: 'DEG', s: '_STATUS', r: '_RESPONSE', d: '', i: '_RESPONSE' };
 
 const functions = [];
 for (const [, comment, returns, name, list] of header.matchAll(
@@ -44,7 +46,7 @@ for (const [, comment, returns, name, list] of header.matchAll(
   const args = declared.map((declaration, i) => {
     const [, type, star, own] = /^(?:const )?(\w+(?: int)?)\s*([*&]?)\s*(\w+)$/.exec(declaration);
     const [, out, core, mark] = /^(>?)(\w+)([?!]?)/.exec(tokens[i]);
-    if (!star) return { name: own, kind: 'number', value: VALUES[core] };
+    if (!star) return { name: own, kind: 'number', value: VALUES[core], ending: ENDINGS[core], whole: core !== 'd' };
     const kind = out ? 'output' : type === 'POLWEIGHTSTRUCT' ? 'weights' : 'array';
     return { name: own, kind, count: Number(core), type: TYPES[type] ?? type,
       ...(mark === '?' && !out ? { nullable: true } : {}) };
@@ -72,7 +74,7 @@ function declarationOf({ js, args, comment }) {
   const outputs = args.filter(({ kind }) => kind === 'output');
   const last = inputs.findLastIndex(({ nullable }) => !nullable);
   const parameters = inputs.map((argument, i) => `${argument.name}${i > last ? '?' : ''}: ${typeOf(argument)}`);
-  const result = outputs.length === 0 ? 'number | Float64Array'
+  const result = inputs.length === 0 ? 'number' : outputs.length === 0 ? 'number | Float64Array'
     : outputs.length === 1 ? resultType(outputs[0])
       : `{ ${outputs.map((one) => `${one.name}: ${resultType(one)}`).join('; ')} }`;
   return `/**\n${comment.split('\n').map((line) => ` * ${line}`.trimEnd()).join('\n')}\n */\n` +

@@ -26,7 +26,7 @@ export interface Options {
 export type Tell = (what: string, share: number) => void;
 
 /** CGATS text, CSV or CxF. Throws an Error with the reason where a file is refused. */
-export function read(bytes: string | ArrayBuffer | ArrayLike<number>, options?: Reading, tell?: Tell): Sheet;
+export function read(bytes: string | ArrayBuffer | ArrayBufferView | number[], options?: Reading, tell?: Tell): Sheet;
 export function readSpectra(spectra: Rows, options?: Reading & { names?: string[]; bands?: number;
   wavelengths?: number[]; device?: Record<string, (number | null)[]> }): Sheet;
 /** What the commands of the program answer: an object as docs/json.md tells, or a text by `format`. */

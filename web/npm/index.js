@@ -6,10 +6,11 @@ import { peaksOf } from './peaks.js';
 
 const url = new URL('module.wasm', import.meta.url);
 const inNode = typeof process === 'object' && process.versions?.node;
-const bytes = inNode ? await (await import('node:fs/promises')).readFile(url)
+const system = 'node:fs/promises'; // which bundlers for browsers must not look for
+const bytes = inNode ? await (await import(/* webpackIgnore: true */ /* @vite-ignore */ system)).readFile(url)
   : await (await fetch(url)).arrayBuffer();
-const { wasm, ...files } = await load(create, bytes);
+const { wasm, ...calls } = await load(create, bytes);
 
-export const { read, readSpectra, report, compare, run, predict, ink } = files;
+export const { read, readSpectra, report, compare, run, predict, ink } = calls;
 export const { calculateSpecialDensity, chooseBPWavelen, findMaxDensityPoints } = peaksOf(wasm);
 export { constants };

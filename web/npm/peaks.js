@@ -1,11 +1,14 @@
 // The functions of windows over a spectrum, whose arrays have no fixed length.
 
+import { requireNumbers } from './vantrel.js';
+
 const BANDS = 31;
 
 export function peaksOf(wasm) {
   // Calls work(refl, more) with the places of the spectrum and of `size` bytes after it.
   function withSpectrum(name, refl, size, work) {
     if (refl?.length !== BANDS) throw new TypeError(`refl of ${name}() takes ${BANDS} numbers`);
+    requireNumbers(refl, `refl of ${name}()`);
     const at = wasm._malloc(BANDS * 8 + size) >>> 0;
     if (!at) throw new Error('not enough memory');
     try {

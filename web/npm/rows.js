@@ -1,5 +1,7 @@
 // The functions of the library over rows of Float64Array.
 
+import { requireNumbers } from './vantrel.js';
+
 const SIZES = { double: 8, float: 4, int: 4, unsigned: 4, wchar_t: 4 };
 const HEAPS = { double: 'HEAPF64', float: 'HEAPF32', int: 'HEAP32', unsigned: 'HEAPU32', wchar_t: 'HEAPU32' };
 
@@ -18,25 +20,32 @@ export function functionsOf(wasm, table, constants) {
     capacity = size;
   }
 
-  function numberOf(value, name) {
-    if (typeof value === 'number') return value;
-    const found = ['', '_STATUS', '_RESPONSE'].map((ending) => constants[value + ending])
-      .find((constant) => constant !== undefined);
-    if (found === undefined) throw new TypeError(`${name} is ${value}, no number and no name`);
-    return found;
+  // A name is that of a constant of the argument's kind, with or without the ending of them all.
+  function numberOf(value, { ending, whole }, label) {
+    if (typeof value === 'number' && (!whole || (value | 0) === value)) return value;
+    const found = [value, value + ending].find((name) => typeof value === 'string' &&
+      Object.hasOwn(constants, name) && name.endsWith(ending) && !name.startsWith('NUM_'));
+    if (found === undefined)
+      throw new TypeError(`${label} is ${value}, no ${whole ? 'whole number' : 'number'} and no name`);
+    return constants[found];
   }
 
   // What is given for an argument: { data, rows } of an array, { value } of a number.
   function taken(argument, value, name) {
     const { count, kind, nullable } = argument;
+    const label = `${argument.name} of ${name}()`;
     if (kind === 'number') {
-      return typeof value === 'object' && value !== null ? { data: value, rows: value.length }
-        : { value: numberOf(value, `${argument.name} of ${name}()`), rows: 1 };
+      if (!Array.isArray(value) && !ArrayBuffer.isView(value))
+        return { value: numberOf(value, argument, label), rows: 1 };
+      const data = Array.from(value, (one) => numberOf(one, argument, label));
+      if (!data.length) throw new TypeError(`${label} takes a number, or one for each row`);
+      return { data, rows: data.length };
     }
     if ((value === null || value === undefined) && nullable) return { value: 0, rows: 1 };
     const rows = value?.length / count;
     if (!(rows >= 1) || !Number.isInteger(rows))
-      throw new TypeError(`${argument.name} of ${name}() takes rows of ${count} numbers`);
+      throw new TypeError(`${label} takes rows of ${count} numbers`);
+    requireNumbers(value, label);
     return { data: value, rows };
   }
 
