@@ -1,11 +1,13 @@
 // The application in Chromium shows what the program's page shows, and asks nothing of any network.
 
 import assert from 'node:assert/strict';
+import { execFileSync } from 'node:child_process';
 import { closeSync, openSync, readFileSync, writeSync } from 'node:fs';
 import { createServer } from 'node:http';
 import { join } from 'node:path';
 import { after, test } from 'node:test';
 import { pathToFileURL } from 'node:url';
+import { inWords } from '../../web/app/texts.js';
 import { browser, end, folder, open, small, wide } from '../sheets/page/browser.mjs';
 import { faultsOfLayout } from '../sheets/page/layout.mjs';
 import { textOfPage } from '../sheets/page/text.mjs';
@@ -64,7 +66,8 @@ for (const [button, command, files] of [
   test(`${button} is the page of ${command}`, async () => {
     const [ours, theirs] = [await openApp(wide, files), await open(command)];
     await press(ours, button);
-    assert.equal(await said(ours, '#result > *'), await said(theirs, '#page > :not(footer)'));
+    assert.equal(await said(ours, '#result > *'), inWords(await said(theirs, '#page > :not(footer)')));
+    assert.doesNotMatch(await ours.innerText('main'), /--[a-z]/);
     assert.deepEqual(await nameless(ours), []);
     assert.deepEqual([...ours.complaints, ...theirs.complaints], []);
     await ours.close();
@@ -74,14 +77,27 @@ for (const [button, command, files] of [
 test('a telephone in the dark, a file that is no measurement, a tolerance, files closed', async () => {
   const page = await openApp(small, ['press.txt', 'offset.toml', 'page.html', 'proof.csv'], 'dark');
   assert.match(await page.innerText('.complaints'), /^page\.html:.*: ./);
-  await page.getByLabel('Tolerance, ΔE00').fill('2.5');
+  await page.getByLabel('Tolerance, ΔE00').fill('2,5');
   await press(page, 'Compare');
-  assert.match(await page.innerText('.verdict'), /ailed/);
+  assert.match(await page.innerText('.verdict'), /ailed[^]* above ΔE00 2\.5;/);
   assert.deepEqual(await page.evaluate(faultsOfLayout), []);
   await page.getByLabel(/^Paper \(/).fill('No such patch');
   await page.getByRole('button', { name: 'Report', exact: true }).click();
   await page.getByRole('alert').filter({ hasText: 'No such patch' }).waitFor();
+  assert.equal(await page.innerText('#result'), '');
+  assert.ok(await page.getByRole('button', { name: 'Save as' }).isDisabled());
+  await page.getByLabel('Tolerance, ΔE00').fill('1e');
+  await page.getByRole('button', { name: 'Compare', exact: true }).click();
+  await page.getByRole('alert').filter({ hasText: 'Tolerance, ΔE00: 1e is no number' }).waitFor();
+  await page.getByLabel(/^Paper \(/).fill('');
+  await press(page, 'Press run');
+  assert.match(await page.innerText('#result'), /not judged: page\.html:11: /);
+  assert.match(await page.innerText('.files'), /0\.961, is taken for a fraction; “Scale of the files” sets/);
+  await page.getByLabel('Scale of the files').selectOption('fraction');
+  await page.getByText('0.961').waitFor({ state: 'detached' });
+  assert.equal(await page.innerText('#result'), '');
   for (const name of ['press.txt', 'proof.csv']) await page.getByLabel(`Close ${name}`).click();
+  assert.equal(await page.evaluate(() => document.activeElement.getAttribute('aria-label')), 'Close page.html');
   assert.ok(await page.getByRole('button', { name: 'Report', exact: true }).isDisabled());
   assert.deepEqual(page.complaints, []);
   await page.close();
@@ -103,8 +119,11 @@ test('a table pasted by the keyboard, inks to predict, a result saved', async ()
   assert.match(readFileSync(await (await waiting).path(), 'utf8'), /^file,.*nm700,warnings\r?\nPasted table 1,/);
   const sheet = page.locator('label', { hasText: /^Sheet/ }).locator('select');
   await sheet.selectOption('Pasted table 1');
-  await page.getByLabel(/^Or paste a table/).fill(rows);
-  await page.getByRole('button', { name: 'Read the table' }).click();
+  await page.evaluate((cells) => { // out of a spreadsheet
+    const dataTransfer = new DataTransfer();
+    dataTransfer.setData('text/plain', cells);
+    document.dispatchEvent(new DragEvent('drop', { dataTransfer, cancelable: true }));
+  }, rows);
   await page.getByText('Pasted table 2 · ').waitFor();
   assert.equal(await sheet.locator('option:checked').innerText(), 'Pasted table 1');
   await page.getByLabel(/^Inks/).fill('Magenta 100:40, Gelb: 70');
@@ -156,7 +175,7 @@ test('from a server it is kept and opens without one', async () => {
   });
   await new Promise((ready) => { server.listen(0, '127.0.0.1', ready); });
   const page = await browser.newPage();
-  const at = `http://127.0.0.1:${server.address().port}/`;
+  const at = `http://127.0.0.1:${server.address().port}/index.html`;
   await page.goto(at);
   await page.evaluate(() => navigator.serviceWorker.ready);
   server.closeAllConnections();
@@ -165,5 +184,9 @@ test('from a server it is kept and opens without one', async () => {
   await give(page, [join(folder, 'press.txt')]);
   await press(page, 'Report');
   assert.match(await page.title(), /press\.txt/);
+  const waiting = page.waitForEvent('download');
+  await page.getByRole('button', { name: 'Save as' }).click();
+  assert.equal(readFileSync(await (await waiting).path(), 'utf8'), execFileSync(process.env.VANTREL,
+    ['report', 'press.txt', '--format', 'json'], { cwd: folder, encoding: 'utf8', stdio: ['ignore', 'pipe', 'ignore'] }));
   await page.close();
 });

@@ -12,5 +12,6 @@ self.addEventListener('fetch', (event) => {
   event.respondWith(fetch(event.request).then(async (answer) => {
     if (answer.ok) await (await caches.open(KEPT)).put(event.request, answer.clone());
     return answer;
-  }, async () => (await caches.match(event.request)) ?? Response.error()));
+  }, async () => await caches.match(event.request) ||
+    (event.request.mode === 'navigate' && await caches.match('./')) || Response.error()));
 });

@@ -11,10 +11,14 @@ export const texts = {
   files: 'Files',
   patches: (count) => `${count.toLocaleString('en')} ${count === 1 ? 'patch' : 'patches'}`,
   limits: 'tolerances',
+  unread: 'not read; a press run counts it as missing',
   remove: (name) => `Close ${name}`,
   asStated: 'as the file says',
   illuminant: 'Illuminant',
   status: 'Density status',
+  scale: 'Scale of the files',
+  condition: 'Measurement condition',
+  whichever: 'M1, or what the file has',
   paper: 'Paper (patch; empty for the usual one)',
   aims: 'Aims (of a press run: of all other files)',
   sheet: 'Sheet',
@@ -22,8 +26,14 @@ export const texts = {
   tolerance: 'Tolerance, ΔE00',
   tolerances: 'Tolerances (a TOML file)',
   none: 'none',
-  corrected: 'Aims on the paper of the sheet',
+  flags: {
+    substrate_corrected: 'Aims on the paper of the sheet',
+    force_pairs: 'Pairs that disagree too',
+    allow_missing: 'Patches may be missing',
+    advice: 'What to change at the press',
+  },
   inks: 'Inks to predict: NAME:PERCENT, commas between (empty: all overprints)',
+  noNumber: (label, wish) => `${label}: ${wish} is no number`,
   noInk: (wish) => `${wish} is no NAME:PERCENT`,
   report: 'Report',
   compare: 'Compare',
@@ -38,3 +48,13 @@ export const texts = {
   refused: (name, reason) => (reason.startsWith(name) ? reason : `${name}: ${reason}`),
   tooLarge: (name) => `${name} is larger than 512 MiB, the largest file that is read`,
 };
+
+// What stands here for the options of the program that its texts name.
+const here = { ...texts.flags, paper: 'Paper', scale: texts.scale, condition: texts.condition,
+  pair: texts.pair, illuminant: texts.illuminant, tolerance: texts.tolerance, ink: 'Inks to predict',
+  format: texts.save };
+export const inWords = (text) => text.replace(/(?:the option |(?<=^|[\s(;])--)([a-z]+(?:[-_][a-z]+)*)/g,
+  (option, name) => {
+    const key = name.replaceAll('-', '_');
+    return Object.hasOwn(here, key) ? `“${here[key]}”` : option;
+  });
