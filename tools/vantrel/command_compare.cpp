@@ -8,7 +8,6 @@
 #include <fmt/format.h>
 
 #include <algorithm>
-#include <cmath>
 #include <memory>
 
 namespace vantrel::program {
@@ -38,7 +37,7 @@ void set_weights(std::vector<Metric> &metrics, std::string_view wish)
     const auto equals = wish.find('=');
     const auto comma = wish.find(',', equals == std::string_view::npos ? 0 : equals);
     const auto number = [&](std::size_t from, std::size_t to) {
-        return number_in(wish.substr(from, to - from));
+        return number_of_option(wish.substr(from, to - from));
     };
     const bool whole = equals != std::string_view::npos && comma != std::string_view::npos;
     const auto lightness = whole ? number(equals + 1, comma) : std::nullopt;
@@ -74,7 +73,7 @@ Pairing pairing_of(const std::string &name)
 
 Outcome run(const CompareOptions &options)
 {
-    if (options.tolerance && !(*options.tolerance >= 0 && std::isfinite(*options.tolerance)))
+    if (options.tolerance && *options.tolerance < 0)
         throw RequestError{"--tolerance takes a number from 0 up"};
     if (options.force_pairs && options.pairing == "auto")
         throw RequestError{"--force-pairs takes a key named by --pair"};
@@ -181,7 +180,8 @@ Command add_compare(CLI::App &app)
                      "The difference in words: ab along a* and b*, hue as chroma and hue")
         ->check(CLI::IsMember({"ab", "hue"}))
         ->capture_default_str();
-    command->add_option("--tolerance", options->tolerance, "Largest difference that is accepted");
+    command->add_option("--tolerance", options->tolerance, "Largest difference that is accepted")
+        ->check(is_number());
     command->add_option("--tolerances", options->tolerances,
                         "TOML file of limits by group of patches; examples/ has three");
     command->add_flag("--substrate-corrected", options->substrate_corrected,

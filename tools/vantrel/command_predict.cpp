@@ -24,7 +24,7 @@ InkTint ink_tint(std::string_view wish)
     const auto colon = wish.rfind(':');
     if (colon == std::string_view::npos)
         throw RequestError{fmt::format("--ink takes NAME:PERCENT, not {}", in_quotes(wish))};
-    const auto percent = number_in(wish.substr(colon + 1));
+    const auto percent = number_of_option(wish.substr(colon + 1));
     if (!percent || *percent < 0 || *percent > 100 || *percent != std::floor(*percent))
         throw RequestError{fmt::format("--ink takes a whole percentage from 0 to 100, not {}",
                                        in_quotes(wish.substr(colon + 1)))};

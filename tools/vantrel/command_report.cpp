@@ -8,7 +8,6 @@
 
 #include <fmt/format.h>
 
-#include <cmath>
 #include <memory>
 
 namespace vantrel::program {
@@ -54,7 +53,7 @@ void require_patch_or_file(const Measurement &sheet, const std::string &paper)
 
 Outcome run(const ReportOptions &options)
 {
-    if (!(options.n_factor > 0) || !std::isfinite(options.n_factor))
+    if (!(options.n_factor > 0))
         throw RequestError{"--n-factor takes a number above 0"};
     const SecondPaper second = second_paper_of(options);
     const std::optional<Measurement> aims =
@@ -112,6 +111,7 @@ Command add_report(CLI::App &app)
     add_sheet_options(*command, *options);
     add_order_option(*command, options->order);
     command->add_option("--n-factor", options->n_factor, "Yule-Nielsen factor of the dot areas")
+        ->check(is_number())
         ->capture_default_str();
     command->add_option(
         "--second-paper", options->second_paper,

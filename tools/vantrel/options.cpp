@@ -65,6 +65,21 @@ void add_order_option(CLI::App &command, std::vector<std::string> &order)
         ->allow_extra_args(false);
 }
 
+std::optional<double> number_of_option(std::string_view text)
+{
+    return text.find(',') == std::string_view::npos ? number_in(text) : std::nullopt;
+}
+
+CLI::Validator is_number()
+{
+    return {[](const std::string &text) {
+                return number_of_option(text)
+                           ? ""
+                           : fmt::format("{} is no number such as 1.5", in_quotes(text));
+            },
+            ""};
+}
+
 ILLUM_OBS illuminant_of(const std::string &name)
 {
     const auto illuminant = illuminant_named(name);

@@ -11,6 +11,7 @@
 #include <memory>
 #include <optional>
 #include <string>
+#include <string_view>
 #include <utility>
 #include <vector>
 
@@ -56,6 +57,10 @@ void add_sheet_options(CLI::App &command, Options &options);
 void add_condition_option(CLI::App &command, const std::string &name, std::string &condition,
                           const std::string &description);
 void add_order_option(CLI::App &command, std::vector<std::string> &order);
+
+// A finite decimal number with a point: commas separate values.
+std::optional<double> number_of_option(std::string_view text);
+CLI::Validator is_number();
 
 // What the options name; throw RequestError.
 ILLUM_OBS illuminant_of(const std::string &name);
