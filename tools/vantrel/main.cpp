@@ -65,6 +65,10 @@ void write(const Outcome &outcome)
     outcome.write(
         {[&](std::string_view text) { file.write(text); }, on_terminal ? Tell() : progress_bar()});
     file.finish();
+    if (const std::size_t names = file.other_names())
+        complain(fmt::format("{} to {} the old content",
+                             names == 1 ? "a hard link" : fmt::format("{} hard links", names),
+                             printable(outcome.output) + (names == 1 ? " keeps" : " keep")));
 }
 
 int exit_status(int count, char **words)

@@ -1,6 +1,7 @@
 // Text out. What is of the system is in output_file_posix.cpp and system_windows.cpp.
 #pragma once
 
+#include <cstddef>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -34,6 +35,9 @@ public:
     void write(std::string_view text);
     void finish();
 
+    // How many other names the file had that was replaced; they keep the old one.
+    std::size_t other_names() const { return links_cut; }
+
 private:
     void open();
     void open_to_replace(const struct stat &target);
@@ -48,6 +52,7 @@ private:
     int file = -1;
     std::string temporary, replaced; // both empty where the file is written straight
     std::optional<unsigned> mode;    // that of the old file
+    std::size_t links_cut = 0;
 };
 
 } // namespace vantrel::program

@@ -6,12 +6,14 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
 #include <cerrno>
 #include <climits>
 #include <csignal>
 #include <cstdlib>
 #include <cstring>
 #include <fcntl.h>
+#include <iterator>
 #include <memory>
 #include <sys/stat.h>
 #include <unistd.h>
@@ -26,7 +28,8 @@ namespace {
 
 OutputError output_error_now() { return {std::strerror(errno)}; }
 
-constexpr int kEnding[] = {SIGHUP, SIGINT, SIGQUIT, SIGTERM};
+// Signals that end no program.
+constexpr int kHarmless[] = {SIGCHLD, SIGCONT, SIGTSTP, SIGTTIN, SIGTTOU, SIGURG, SIGWINCH};
 
 char doomed[PATH_MAX] = ""; // the temporary file that goes when a signal ends the program
 
@@ -41,11 +44,9 @@ extern "C" void remove_and_end(int signal)
 // number for "XXXXXX".
 int make_temporary(std::string &name, mode_t mode)
 {
-    sigset_t ending, before;
-    sigemptyset(&ending);
-    for (const int signal : kEnding)
-        sigaddset(&ending, signal);
-    sigprocmask(SIG_BLOCK, &ending, &before);
+    sigset_t all, before;
+    sigfillset(&all);
+    sigprocmask(SIG_BLOCK, &all, &before);
     int file = -1;
     for (unsigned number = static_cast<unsigned>(getpid());; ++number) {
         fmt::format_to(name.end() - 6, "{:06x}", number & 0xFFFFFF);
@@ -56,9 +57,11 @@ int make_temporary(std::string &name, mode_t mode)
     const int error = errno;
     if (file >= 0) {
         doomed[name.copy(doomed, sizeof doomed - 1)] = '\0';
-        for (const int signal : kEnding) {
+        for (int signal = 1; signal < NSIG; ++signal) {
             struct sigaction action {};
-            if (sigaction(signal, nullptr, &action) == 0 && action.sa_handler != SIG_IGN) {
+            if (std::find(std::begin(kHarmless), std::end(kHarmless), signal) ==
+                    std::end(kHarmless) &&
+                sigaction(signal, nullptr, &action) == 0 && action.sa_handler == SIG_DFL) {
                 action.sa_handler = remove_and_end;
                 action.sa_flags = SA_RESETHAND;
                 sigaction(signal, &action, nullptr);
@@ -176,7 +179,8 @@ void OutputFile::open_to_replace(const struct stat &target)
     }
     if (access(path.c_str(), W_OK) != 0)
         throw output_error_now();
-    mode = target.st_mode & 07777;
+    mode = target.st_mode & 0777; // what is new may not act as its owner
+    links_cut = target.st_nlink - 1;
     open_beside(real);
     if (fstat(file, &made) != 0)
         throw output_error_now();
