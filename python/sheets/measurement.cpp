@@ -221,7 +221,7 @@ Object object_of(const Measurement &sheet)
         result.add("spectra", doubles(spectra));
     if (has_lab)
         result.add("lab", doubles(lab));
-    if (has_lab && sheet.colours.illuminant)
+    if (sheet.colours.illuminant)
         result.add("lab_illuminant", checked(PyLong_FromLong(*sheet.colours.illuminant)));
     result.add("lab_stated", sheet.colours.stated);
     result.add("device", device_of(sheet.patches));

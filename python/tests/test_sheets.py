@@ -35,6 +35,7 @@ LIBRARY_OF_SPOTS = f"""<CxF xmlns="http://colorexchangeformat.com/CxF3-core"><Re
 <Object ObjectType="Standard" Name="Spot" Id="1"><ColorValues>{SPOT.format("M0", 4)}{SPOT.format("M1", 5)}
 </ColorValues></Object></ObjectCollection><ColorSpecificationCollection>{CONDITION.format("M0")}
 {CONDITION.format("M1")}</ColorSpecificationCollection></Resources></CxF>"""
+NOBODY = vantrel.Origin("", "", "", "", "")
 COLOURS = "name,L,a,b\npaper,95,0,-2\nmagenta,48,75,-4\n"
 
 
@@ -281,39 +282,80 @@ def test_results_are_those_of_the_program(call, command, sheet, darker, tmp_path
     )
 
 
-@pytest.mark.filterwarnings("ignore:.*(transmission, not reflectance|largest reflectance is 0.904|a green density of)")
+OWN = {"source", "file", "warnings", "lines", "_warnings", "_read_from", "_of"}  # of each file
+SHEETS = [*LIBRARY.glob("examples/*.txt"), *LIBRARY.parents[1].glob("tests/sheets/data/*.*")]
+
+
+def differing(first, second):
+    """The fields that tell two sheets apart, but for what is of each file."""
+
+    def digits(value):
+        return value.tolist() if isinstance(value, np.ndarray) else value
+
+    held = [
+        {name: repr(digits(value)) for name, value in vars(s).items() if name not in OWN}
+        | {"device": repr({field: column.tolist() for field, column in s.device.items()})}
+        | {"condition": s.source and s.source.condition}
+        for s in (first, second)
+    ]
+    return {name for name in held[0] if held[0][name] != held[1][name]}
+
+
+@pytest.mark.filterwarnings("ignore")
 def test_what_is_written_reads_back(sheet, tmp_path):
     odd = replace(
         sheet,
         names=[f'{name}, "no. {i}"' for i, name in enumerate(sheet.names)],
-        device={"CMYK_C": np.where(np.arange(31) == 3, np.nan, np.arange(31) / 7)},
+        device={"CMYK_C": np.where(np.arange(31) == 3, np.nan, np.arange(31) / 7), "Reflex #1": np.arange(31.0)},
         spectra=sheet.spectra / 99,
         lab=np.linspace(1, 90, 93).reshape(31, 3),
-        lab_illuminant=vantrel.IllumObs.D65_10DEG,
+        lab_illuminant=vantrel.IllumObs.F12_10DEG,
+        lab_stated="F12, 10",
         source=replace(sheet.source, condition="M2"),
-        origin=vantrel.Origin("me", 'a "sheet";\nof two', "2026-03-02", "reader", "job 7"),
+        origin=vantrel.Origin("me", "a sheet; of two", "2026-03-02", "reader", "job 7"),
         kind="transmission",
+        collection=True,
     )
-    plain = replace(odd, kind="reflectance", spectra=sheet.spectra / 7)
-    for name, written in ("sheet.TXT", odd), ("sheet.csv", plain):
-        written.write(tmp_path / name)
-        back = vantrel.read(tmp_path / name)
-        for field in "spectra", "lab":
-            assert getattr(back, field).tobytes() == getattr(written, field).tobytes()
-        for field in "names", "ids", "kind":
-            assert getattr(back, field) == getattr(written, field)
-        assert back.source.condition == "M2" and back.device["CMYK_C"][4] == 4 / 7
-    back = vantrel.read(tmp_path / "sheet.TXT")
-    assert (back.origin, back.lab_illuminant) == (
-        replace(odd.origin, descriptor="a 'sheet'; of two"),
-        odd.lab_illuminant,
-    )
-    replace(odd, lab_illuminant=None, lab_stated="D93, 2 degree").write(tmp_path / "stated.txt")
-    assert vantrel.read(tmp_path / "stated.txt").lab_stated == "D93, 2 degree"
-    assert np.array_equal(back.device["CMYK_C"], odd.device["CMYK_C"], equal_nan=True)
+    plain = replace(odd, kind="reflectance", spectra=sheet.spectra / 7, collection=False, origin=NOBODY)
+    unlabelled = replace(plain, names=[str(i + 1) for i in range(31)], named=False, has_ids=False)
+    unlabelled = replace(unlabelled, ids=unlabelled.names, device={}, lab_stated="D93", lab_illuminant=None)
+    held = {".txt": [odd, plain, unlabelled], ".csv": [plain, replace(unlabelled, lab=None, lab_stated="")]}
+    for file in SHEETS:
+        try:
+            read = vantrel.read(file)
+        except ValueError:
+            continue
+        held[".txt"].append(read)
+        light = None if read.lab is None else read.lab_illuminant
+        stated = light.name[:-3].replace("_", ", ") if light is not None else ""
+        held[".csv"].append(replace(read, collection=False, origin=NOBODY, lab_illuminant=light, lab_stated=stated))
+    assert len(held[".csv"]) > 3
+    for ending, sheets in held.items():
+        for written in sheets:
+            with warnings.catch_warnings(record=True) as caught:
+                warnings.simplefilter("always")
+                written.write(tmp_path / f"sheet{ending}")
+            assert not [str(w.message) for w in caught]
+            assert not differing(vantrel.read(tmp_path / f"sheet{ending}"), written)
     for refused, reason in (odd, "transmittance"), (replace(sheet, spectra=sheet.spectra / 50), "scale"):
         with pytest.raises(ValueError, match=reason):
             refused.write(tmp_path / "refused.csv")
+
+
+@pytest.mark.filterwarnings("ignore:.*(interchanged|green density|lab_illuminant)")
+def test_what_is_not_written_is_told(sheet, tmp_path):
+    library = replace(sheet, collection=True, lab=vantrel.refl_to_cielab(sheet.spectra), lab_stated="D93")
+    with pytest.warns(UserWarning, match="not give the same lab_stated, origin, collection$"):
+        library.write(tmp_path / "library.csv")
+    library.write(tmp_path / "library.txt")
+    read = vantrel.read(tmp_path / "library.txt")
+    darker = replace(read, spectra=read.spectra * 0.9)
+    with pytest.warns(UserWarning, match="are of spectra that were replaced, and are left out"):
+        darker.write(tmp_path / "darker.txt")
+    assert vantrel.read(tmp_path / "darker.txt").lab is None
+    both = replace(darker, lab=vantrel.refl_to_cielab(darker.spectra))
+    both.write(tmp_path / "both.txt")
+    assert not differing(both, vantrel.read(tmp_path / "both.txt"))
 
 
 @pytest.mark.filterwarnings("ignore:.*would agree")
@@ -353,6 +395,11 @@ def test_spectra_that_are_put_in_are_judged_with_their_scale_in_doubt(sheet):
         other = replace(sheet, spectra=sheet.spectra * factor, file="other")
         with pytest.warns(UserWarning, match=re.escape(f"other: {doubt}")):
             assert f"other: {doubt}" in vantrel.report(other).to_html()
+
+
+def test_an_illuminant_that_a_file_states_holds_for_its_spectra_too(tmp_path):
+    (tmp_path / "stated.txt").write_text(EXAMPLE.read_text().replace("DESC", 'ILLUMINANT "D65"\nDESC', 1))
+    assert vantrel.report(vantrel.read(tmp_path / "stated.txt")).to_dict()["sheets"][0]["illuminant"] == "D65_2DEG"
 
 
 def test_a_result_stays_what_it_was(sheet):

@@ -158,6 +158,8 @@ void CgatsReader::header(std::string_view text)
             throw InputError{line, fmt::format("SPECTRAL_NORM is {}", in_quotes(value))};
         sheet.set_full_scale(*number, keyword, line);
     }
+    if (keyword == "COLLECTION")
+        sheet.collection = equal_ignoring_case(value, "yes");
     if (keyword == "DEVICE_CLASS")
         device_class = upper(value);
     // "Measurement Condition=M0" has a blank in its keyword

@@ -57,9 +57,10 @@ Colour colour_in(const std::vector<std::string> &keys)
                 if (out.columns[part] != kNone || !keys[i].starts_with(family[part]))
                     continue;
                 const std::string_view rest = std::string_view(keys[i]).substr(family[part].size());
-                const bool light = family[0].size() > 1 &&
-                                   (rest.starts_with('D') || rest == "A2") &&
-                                   (rest.ends_with('2') || rest.ends_with("10"));
+                const bool light =
+                    family[0].size() > 1 && !rest.empty() &&
+                    std::string_view("ACDF").find(rest[0]) != std::string_view::npos &&
+                    (rest.ends_with('2') || rest.ends_with("10"));
                 if (!rest.empty() && !light)
                     continue;
                 out.columns[part] = i;
@@ -86,6 +87,14 @@ bool is_own_report(const std::vector<std::string> &fields)
 {
     return fields.size() > 4 && fields[0] == "file" && fields[1] == "id" && fields[2] == "name" &&
            std::find(fields.begin(), fields.end(), "dE00_paper") != fields.end();
+}
+
+// "ink:Reflex Blue" holds percentages of an ink of any name; empty for other fields.
+std::string_view named_ink(std::string_view field)
+{
+    constexpr std::string_view mark = "ink:";
+    const bool marked = equal_ignoring_case(field.substr(0, mark.size()), mark);
+    return marked ? trimmed(field.substr(mark.size())) : std::string_view();
 }
 
 [[noreturn]] void throw_twice(std::string_view field, std::size_t first, std::size_t second,
@@ -232,9 +241,14 @@ void Table::find_devices(const std::vector<std::string> &keys, std::size_t line)
     const std::size_t swatch = column_of(keys, {"RGB"});
     std::map<std::string, std::size_t> seen;
     for (std::size_t i = 0; i < fields.size(); ++i) {
-        const bool free = own && i > 2 && i < swatch; // a name of any kind, in percent
+        const std::string_view ink_of_field = named_ink(fields[i]);
+        // a name of any kind, in percent
+        const bool free = !ink_of_field.empty() || (own && i > 2 && i < swatch);
         const bool standard = is_standard_device_field(fields[i]);
-        std::string device = standard ? upper(fields[i]) : free ? fields[i] : inks[i];
+        std::string device = !ink_of_field.empty() ? std::string(ink_of_field)
+                             : standard            ? upper(fields[i])
+                             : free                ? fields[i]
+                                                   : inks[i];
         if (device.empty())
             continue;
         free_names = free_names || !(standard || free);
@@ -422,7 +436,7 @@ void Table::add(const Row &row, Condition given, std::size_t line)
 
     if (sheet.patches.empty() && id == kNone && name == kNone && ink == kNone)
         for (std::size_t i = 0; i < fields.size() && name == kNone; ++i)
-            if (!trimmed(row.values[i]).empty() && !number_in(row.values[i]))
+            if (i != condition && !trimmed(row.values[i]).empty() && !number_in(row.values[i]))
                 name = i; // the first column of words
     patch.id = text_at(row, id);
     patch.name = text_at(row, name);

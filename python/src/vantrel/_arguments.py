@@ -134,7 +134,7 @@ class Index:
             items = array.ravel().tolist()
             if {*map(type, items)} <= {str, self.members}:  # unlike 1 and True, these are all distinct
                 found = {item: self.number(item, name) for item in dict.fromkeys(items)}
-                numbers = map(found.__getitem__, items)
+                numbers = (found[item] for item in items)
             else:
                 numbers = (self.number(item, name) for item in items)
             array = np.fromiter(numbers, np.int64, len(items)).reshape(array.shape)

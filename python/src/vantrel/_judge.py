@@ -83,8 +83,9 @@ def _fields(sheet: Sheet) -> Dict[str, Any]:
     }
     if sheet.spectra is not None:
         taken["spectra"] = _doubles(sheet.spectra, (patches, 31), "spectra")
-    if sheet.lab is not None:
-        taken["lab"] = _doubles(sheet.lab, (patches, 3), "lab", sheet.kind != "colours")
+    taken["lab"] = sheet._own_lab()
+    if taken["lab"] is not None:
+        taken["lab"] = _doubles(taken["lab"], (patches, 3), "lab", sheet.kind != "colours")
     taken["origin"] = asdict(sheet.origin)
     taken["source"] = None if sheet.source is None else asdict(sheet.source)
     return taken

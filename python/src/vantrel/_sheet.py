@@ -4,8 +4,9 @@ import html
 import os
 import re
 import warnings
+import zlib
 from dataclasses import dataclass, field, replace
-from typing import Any, Dict, List, Literal, Optional, Sequence, Union
+from typing import Any, Dict, List, Literal, Optional, Sequence, Tuple, Union
 
 import numpy as np
 from numpy.typing import NDArray
@@ -20,6 +21,11 @@ from ._wavelengths import NM
 Scale = Literal["automatic", "percent", "fraction"]
 Condition = Optional[Literal["M0", "M1", "M2", "M3"]]
 _SCALES = {"automatic": 0, "percent": 1, "fraction": 2}
+_STALE = "its L*a*b* are of spectra that were replaced, and are left out"
+_WRITTEN = (
+    "spectra", "names", "ids", "device", "lab", "lab_illuminant", "lab_stated", "kind", "condition",
+    "origin", "collection",
+)
 _MOST_SHOWN = 200  # patches in a notebook
 
 # What the program's texts name after two hyphens; those that a patch or a file has in its name stay.
@@ -86,8 +92,11 @@ class Sheet:
     device : dict of str to array (n,)
         Dot areas and the like by field, "CMYK_M" for instance; NaN where a patch has none.
     lab : array (n, 3) or None
-        L*a*b* that the file itself holds, computed for `lab_illuminant` or, in the words of the
-        file, `lab_stated`.
+        L*a*b* that the file itself holds.
+    lab_illuminant : IllumObs or None
+        What the file states for its colours; report() and its kin take it by default.
+    lab_stated : str
+        The same in the words of the file, which may be none of IllumObs.
     kind : str
         "reflectance", "transmission" or "colours".
     source : Source
@@ -124,6 +133,7 @@ class Sheet:
     lines: Sequence[int] = ()
     _warnings: Sequence[str] = ()  # in the words of the program
     _read_from: str = ""
+    _of: Tuple[int, ...] = ()  # digests of the spectra and L*a*b* of the file, where it has both
 
     def __repr__(self) -> str:
         return f"<Sheet of {self.file}: {len(self)} patches, {self.kind}>"
@@ -152,8 +162,11 @@ class Sheet:
         columns = {"id": self.ids, "name": self.names, **self.device}
         if self.spectra is not None:
             columns.update(zip(NM.astype(int).tolist(), self.spectra.T))
-        if self.lab is not None:
-            columns.update(zip(("L", "a", "b"), self.lab.T))
+        lab = self._own_lab()
+        if lab is not None:
+            columns.update(zip(("L", "a", "b"), lab.T))
+        elif self.lab is not None:
+            warnings.warn(f"{self.file}: {_STALE}", stacklevel=2)
         return pd.DataFrame(columns)
 
     def to_xarray(self) -> Any:
@@ -169,8 +182,10 @@ class Sheet:
     def write(self, file: Union[str, "os.PathLike[str]"]) -> None:
         """Writes CSV to a name that ends in .csv, CGATS text (ISO 28178) to one in .txt.
 
-        read() gives the same doubles back; CSV has no room for the origin. The file is replaced as a
-        whole; the one that the sheet was read from is refused.
+        read() gives the same sheet back, to the last digit, as spectra from 400 to 700 nm. What the
+        format does not hold is warned of: CSV has no room for the origin, nor to say that the sheet is
+        a collection. L*a*b* of the file are left out where the spectra were changed and they were not.
+        The file is replaced as a whole; the one that the sheet was read from is refused.
         """
         ending = os.path.splitext(os.fspath(file))[1].lower()
         if ending not in (".csv", ".txt"):
@@ -178,8 +193,34 @@ class Sheet:
         if self.spectra is not None and not np.all(np.isfinite(self.spectra)):
             row = int(np.argmin(np.isfinite(self.spectra).all(-1)))
             raise ValueError(f"spectra: {self.names[row]!r} holds what is no number")
-        text = csv_text(self) if ending == ".csv" else cgats_text(self)
+        lab = self._own_lab()
+        text = csv_text(self, lab) if ending == ".csv" else cgats_text(self, lab)
+        lost = self._lost(text, lab)
         write_text(file, text, [self._read_from] if self._read_from else [])
+        if self.lab is not None and lab is None:
+            warnings.warn(f"{self.file}: {_STALE}", stacklevel=2)
+        if lost:
+            warnings.warn(
+                f"{os.fspath(file)}: read() will not give the same {', '.join(lost)}", stacklevel=2
+            )
+
+    def _own_lab(self) -> Optional[NDArray[np.float64]]:
+        """The L*a*b* of the file, unless they belong to spectra that are no longer here."""
+        now = _digest(self.spectra), _digest(self.lab)
+        stale = self._of and self.spectra is not None and now[0] != self._of[0] and now[1] == self._of[1]
+        return None if stale else self.lab
+
+    def _lost(self, text: str, lab: Any) -> List[str]:
+        """The fields that a file with this text does not give back."""
+        try:
+            back = _read_sheet(text.encode(), "automatic", None)
+        except ValueError as error:
+            raise ValueError(f"what would be written cannot be read: {error}") from None
+        wanted = {**vars(self), "lab": lab, "condition": self.source.condition if self.source else ""}
+        found = {**vars(back), "condition": back.source.condition if back.source else ""}
+        if back.lab_illuminant is not None:
+            wanted["lab_stated"] = back.lab_stated  # its wording is free
+        return [name for name in _WRITTEN if not _same(wanted[name], found[name])]
 
     def _colours(self) -> Any:
         """(L*a*b*, what it is for) of the patches that a notebook shows."""
@@ -212,6 +253,18 @@ class Sheet:
         )
 
 
+def _digest(array: Any) -> int:
+    return 0 if array is None else zlib.crc32(np.ascontiguousarray(array, dtype=np.float64).data)
+
+
+def _same(first: Any, second: Any) -> bool:
+    if isinstance(first, dict):
+        return list(first) == list(second) and all(_same(first[k], second[k]) for k in first)
+    if isinstance(first, np.ndarray) and second is not None:
+        return np.array_equal(first, second, equal_nan=True)
+    return bool(first is second or first == second)
+
+
 def srgb(lab: Any) -> NDArray[np.uint8]:
     """Red, green and blue of a display, 0 to 255, for L*a*b* (..., 3); its white is 255, 255, 255."""
     lab = np.ascontiguousarray(lab, dtype=np.float64)
@@ -227,38 +280,45 @@ def _array(buffer: Any, *shape: int) -> NDArray[np.float64]:
     return np.frombuffer(buffer, dtype=np.float64).reshape(shape)
 
 
+def _read_sheet(content: bytes, scale: str, condition: Optional[str]) -> Sheet:
+    """Raises ValueError in the words of the program."""
+    found = extension().read(content, _SCALES[scale], condition or "")
+    illuminant = found.get("lab_illuminant")
+    spectra = _array(found["spectra"], -1, 31) if "spectra" in found else None
+    lab = _array(found["lab"], -1, 3) if "lab" in found else None
+    return Sheet(
+        spectra=spectra,
+        names=found["names"],
+        ids=found["ids"],
+        device={name: _array(column, -1) for name, column in found["device"].items()},
+        lab=lab,
+        lab_illuminant=None if illuminant is None else IllumObs(illuminant),
+        lab_stated=found["lab_stated"],
+        **{name: found[name] for name in ("kind", "collection", "named", "has_ids", "lines")},
+        source=Source(**found["source"]) if spectra is not None else None,
+        origin=Origin(**found["origin"]),
+        warnings=[in_python(line.strip()) for line in found["warnings"]],
+        _warnings=found["warnings"],
+        _of=(_digest(spectra), _digest(lab)) if spectra is not None and lab is not None else (),
+    )
+
+
 def _sheet(
     content: bytes, file: str, scale: str, condition: Optional[str], level: int
 ) -> Sheet:
-    module = extension()
+    extension()
     if scale not in _SCALES:
         raise ValueError(f"scale: {scale!r} is not one of {', '.join(_SCALES)}")
     if condition not in (None, "M0", "M1", "M2", "M3"):
         raise ValueError(f"condition: {condition!r} is not one of M0, M1, M2, M3")
     try:
-        found = module.read(content, _SCALES[scale], condition or "")
+        sheet = replace(_read_sheet(content, scale, condition), file=file)
     except ValueError as error:
         text = in_python(str(error))
         raise ValueError(f"{file}: {text}" if file else text) from None
-    said = [in_python(line.strip()) for line in found["warnings"]]
-    for line in found["warnings"]:
+    for line in sheet._warnings:
         warnings.warn(in_python(f"{file}:{line}" if file else line.strip()), stacklevel=level)
-    illuminant = found.get("lab_illuminant")
-    return Sheet(
-        spectra=_array(found["spectra"], -1, 31) if "spectra" in found else None,
-        names=found["names"],
-        ids=found["ids"],
-        device={name: _array(column, -1) for name, column in found["device"].items()},
-        lab=_array(found["lab"], -1, 3) if "lab" in found else None,
-        lab_illuminant=None if illuminant is None else IllumObs(illuminant),
-        lab_stated=found["lab_stated"],
-        **{name: found[name] for name in ("kind", "collection", "named", "has_ids", "lines")},
-        source=Source(**found["source"]) if "spectra" in found else None,
-        origin=Origin(**found["origin"]),
-        file=file,
-        warnings=said,
-        _warnings=found["warnings"],
-    )
+    return sheet
 
 
 def read(

@@ -3,12 +3,14 @@
 import csv
 import io
 import re
-from typing import Any, List
+from typing import Any, Dict, List, Tuple
 
 import numpy as np
 
 from ._wavelengths import NM
 
+# CMYK_C, CMYKOG_O, RGB_R, 6CLR_1: the names of the standard; what else is an ink is named as one.
+_STANDARD = re.compile(r"(RGB|CMY|CMYK[A-Z]*|\d+CLR)_.+")
 _FRACTIONS = 2  # what no keyword names is read as fractions up to here
 
 
@@ -17,27 +19,53 @@ def _column(values: Any) -> List[str]:
     return ["" if value != value else repr(value) for value in np.asarray(values, float).tolist()]
 
 
-def _number_columns(sheet: Any, spectral: str) -> Any:
-    yield from ((field, _column(values)) for field, values in sheet.device.items())
-    if sheet.lab is not None:
-        yield from ((f"LAB_{axis}", _column(v)) for axis, v in zip("LAB", sheet.lab.T))
+def _number_columns(sheet: Any, lab: Any, spectral: str, light: str = "") -> Any:
+    for field, values in sheet.device.items():
+        yield field if _STANDARD.fullmatch(field) else f"ink:{field}", _column(values)
+    if lab is not None:
+        yield from ((f"LAB_{axis}{light}", _column(v)) for axis, v in zip("LAB", lab.T))
     if sheet.spectra is not None:
         yield from ((f"{spectral}{nm:g}", _column(v)) for nm, v in zip(NM, sheet.spectra.T))
+
+
+def _light(sheet: Any) -> Tuple[str, str]:
+    """Illuminant and observer of the L*a*b*, in the words of the file where these still hold."""
+    if sheet.lab_illuminant is None:
+        return sheet.lab_stated, ""
+    light, degrees = sheet.lab_illuminant.name.removesuffix("DEG").split("_")
+    stated, comma, observer = sheet.lab_stated.rpartition(", ")
+    words = re.findall(r"[A-Za-z0-9]+", sheet.lab_stated)
+    if light in words and degrees in words and comma:
+        return stated, observer
+    return light, "" if sheet.lab_stated == light and degrees == "2" else degrees
+
+
+def _labels(sheet: Any) -> Dict[str, List[str]]:
+    """Ids and names, but for those that are places."""
+    places = [str(i) for i in range(1, len(sheet) + 1)]
+    labels = {}
+    if sheet.has_ids or sheet.ids != places:
+        labels["id"] = sheet.ids
+    if sheet.named or sheet.names != places:
+        labels["name"] = sheet.names
+    return labels
 
 
 def _one_line(text: str) -> str:
     return " ".join(text.splitlines())
 
 
-def csv_text(sheet: Any) -> str:
+def csv_text(sheet: Any, lab: Any) -> str:
     if sheet.kind == "transmission":
         raise ValueError("CSV does not tell transmittance from reflectance; .txt does")
     if sheet.spectra is not None and not sheet.spectra.max() > _FRACTIONS:
         raise ValueError("CSV does not name the scale of spectra, and these look like fractions; .txt does")
-    columns = {"id": sheet.ids, "name": sheet.names}
+    columns = _labels(sheet)
     if sheet.source is not None and sheet.source.condition:
         columns["measurement_condition"] = [sheet.source.condition] * len(sheet)
-    columns.update(_number_columns(sheet, "nm"))
+    light = sheet.lab_illuminant
+    light = "" if light is None else "_" + light.name.removesuffix("DEG")
+    columns.update(_number_columns(sheet, lab, "nm", light))
     text = io.StringIO()
     writer = csv.writer(text, lineterminator="\n")
     writer.writerow(columns)
@@ -49,7 +77,7 @@ def _quoted(text: str) -> str:
     return '"' + _one_line(text).replace('"', '""') + '"'
 
 
-def cgats_text(sheet: Any) -> str:
+def cgats_text(sheet: Any, lab: Any) -> str:
     origin = sheet.origin
     keywords = {
         "ORIGINATOR": origin.originator,
@@ -62,14 +90,14 @@ def cgats_text(sheet: Any) -> str:
         keywords["MEASUREMENT_CONDITION"] = sheet.source.condition if sheet.source else ""
         keywords["QUANTITY"] = "transmittance" if sheet.kind == "transmission" else "reflectance"
         keywords["SPECTRAL_NORM"] = "100"
-    if sheet.lab_illuminant is not None:
-        light, degrees = sheet.lab_illuminant.name.removesuffix("DEG").split("_")
-        keywords.update(ILLUMINANT=light, OBSERVER_ANGLE=degrees)
-    else:
-        keywords["ILLUMINANT"] = sheet.lab_stated
-    columns = {"SAMPLE_ID": [*map(_quoted, sheet.ids)], "SAMPLE_NAME": [*map(_quoted, sheet.names)]}
-    for field, values in _number_columns(sheet, "SPECTRAL_NM"):
-        columns[re.sub(r"[\s\"#]", "_", field)] = [value or '""' for value in values]
+    keywords["ILLUMINANT"], keywords["OBSERVER_ANGLE"] = _light(sheet)
+    if sheet.collection:
+        keywords["COLLECTION"] = "yes"
+    labels = _labels(sheet)
+    columns = {f"SAMPLE_{label.upper()}": [*map(_quoted, texts)] for label, texts in labels.items()}
+    for field, values in _number_columns(sheet, lab, "SPECTRAL_NM"):
+        heading = field if re.fullmatch(r"[^\s\"#]+", field) else _quoted(field)
+        columns[heading] = [value or '""' for value in values]
     lines = ["CGATS.17"]
     told = {keyword: value.replace('"', "'") for keyword, value in keywords.items() if value}
     lines += [f"{keyword}\t{_quoted(value)}" for keyword, value in told.items()]
