@@ -93,7 +93,8 @@ void Sheet::add(Patch patch, Condition condition, std::size_t line, std::size_t 
     patch.line = line;
     patches.push_back(std::move(patch));
     conditions.push_back(condition);
-    setups.push_back(setup);
+    if (told_setups.size() > 1)
+        setups.push_back(setup);
 }
 
 std::size_t Sheet::setup_number(const std::string &setup)
@@ -143,10 +144,12 @@ void Sheet::choose_condition()
                                 names_of(present), name_of(chosen)));
     }
     keep_some(patches, [&](std::size_t i) { return conditions[i] == chosen; });
-    keep_some(setups, [&](std::size_t i) { return conditions[i] == chosen; });
     if (chosen)
         origin.condition = name_of(chosen);
-    choose_setup();
+    if (!setups.empty()) {
+        keep_some(setups, [&](std::size_t i) { return conditions[i] == chosen; });
+        choose_setup();
+    }
 }
 
 // That of the first patch.

@@ -32,7 +32,7 @@ public:
     // file gives none. Patches of several setups are kept apart, as those under several conditions.
     void add(Patch patch, Condition condition, std::size_t line, std::size_t setup = 0);
 
-    // The number of the geometry, backing and the like that this text tells.
+    // The number of the geometry, backing and the like that this text tells; before any patch.
     std::size_t setup_number(const std::string &setup);
 
     // A row that is no patch, by the name of a statistic that it has.
@@ -78,7 +78,7 @@ private:
     Source origin; // that of the first patch
     std::vector<std::string> warnings;
     std::vector<Condition> conditions; // of each patch
-    std::vector<std::size_t> setups;   // of each patch
+    std::vector<std::size_t> setups;   // of each patch, where there are several
     std::vector<std::string> told_setups = {""};
     std::map<std::string, std::size_t> setup_numbers = {{"", 0}};
     std::optional<Bands> bands;
