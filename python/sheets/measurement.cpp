@@ -1,7 +1,9 @@
 #include "measurement.h"
 
+#include "read/doubts.h"
 #include "read/text.h"
 
+#include <algorithm>
 #include <cmath>
 #include <cstring>
 #include <limits>
@@ -193,6 +195,17 @@ void add_colours(Measurement &sheet, PyObject *fields)
     }
 }
 
+/// Adds what the reader would doubt of the numbers, where it has not said so of them.
+void doubt(Measurement &sheet)
+{
+    for (const Doubt &doubt : doubts_about(sheet.patches, sheet.kind)) {
+        const std::string line = doubt.line ? std::to_string(doubt.line) + ":" : "";
+        const std::string text = line + " " + doubt.text;
+        if (std::find(sheet.warnings.begin(), sheet.warnings.end(), text) == sheet.warnings.end())
+            sheet.warnings.push_back(text);
+    }
+}
+
 } // namespace
 
 Object object_of(const Measurement &sheet)
@@ -273,6 +286,10 @@ Measurement measurement_of(PyObject *fields)
     if (const Object source = item(fields, "source"); source.get() != Py_None)
         each_of_source(sheet.source, taken(source.get()));
     each_of_origin(sheet.origin, taken(item(fields, "origin").get()));
+    bool changed = false;
+    field("changed", changed);
+    if (changed)
+        doubt(sheet);
     return sheet;
 }
 

@@ -397,6 +397,26 @@ def test_spectra_that_are_put_in_are_judged_with_their_scale_in_doubt(sheet):
             assert f"other: {doubt}" in vantrel.report(other).to_html()
 
 
+def test_numbers_that_are_put_in_are_doubted_as_those_of_a_file(sheet, tmp_path):
+    magenta = sheet.device["CMYK_M"]
+    below = np.where(np.arange(31) == 7, -sheet.spectra, sheet.spectra)
+    for odd in (
+        replace(sheet, spectra=below),
+        replace(sheet, device={"CMYK_M": magenta / 100, "CMYK_Y": sheet.device["CMYK_Y"]}),
+        replace(sheet, device={"CMYK_M": np.where(magenta == 30, -30, magenta), "CMYK_Y": sheet.device["CMYK_Y"]}),
+    ):
+        with warnings.catch_warnings(record=True) as put_in:
+            warnings.simplefilter("always")
+            vantrel.report(replace(odd, file="odd"))
+        with warnings.catch_warnings(record=True):
+            warnings.simplefilter("always")
+            odd.write(tmp_path / "odd.txt")
+            read = vantrel.read(tmp_path / "odd.txt")
+        told = [str(w.message) for w in put_in]
+        unplaced = [re.sub(r"^(\d+:)? ?", "", line) for line in read.warnings]
+        assert unplaced and all(any(line in one for one in told) for line in unplaced)
+
+
 def test_an_illuminant_that_a_file_states_holds_for_its_spectra_too(tmp_path):
     (tmp_path / "stated.txt").write_text(EXAMPLE.read_text().replace("DESC", 'ILLUMINANT "D65"\nDESC', 1))
     assert vantrel.report(vantrel.read(tmp_path / "stated.txt")).to_dict()["sheets"][0]["illuminant"] == "D65_2DEG"
@@ -495,7 +515,7 @@ def test_figures_show_what_the_sheet_has(sheet, darker):
     along = np.diff(around.vertices, axis=0)
     assert (along[:-1, 0] * along[1:, 1] > along[:-1, 1] * along[1:, 0]).all()  # convex
 
-    with pytest.warns(UserWarning, match="are up to ΔE00 .* from their mean|1 of 33 patches have no"):
+    with pytest.warns(UserWarning, match="are up to ΔE00 .* from their mean|1 of 33 patches have no|the same spectrum to"):
         comparison = vantrel.compare(sheet, darker, formula=["cmc", "de2000"], tolerance=1.5)
     ax = vantrel.plot.ab_plane(comparison)
     assert len(ax.get_lines()) == len(comparison.pairs) + 3

@@ -11,6 +11,7 @@
 #include <cmath>
 #include <cstdint>
 #include <cstring>
+#include <map>
 #include <optional>
 #include <string_view>
 #include <utility>
@@ -374,11 +375,38 @@ void doubt_scales(const std::vector<Patch> &patches, Named &named, std::vector<D
                      patches.size(), lines.size() == 1 ? "line" : "lines", lines_of(lines))});
 }
 
+// On another scale the device values are no tints: nothing is printed at 100 %.
+void doubt_percentages(const std::vector<Patch> &patches, std::vector<Doubt> &out)
+{
+    double largest = 0, least = 0;
+    std::map<std::string_view, double> most; // of each ink
+    for (const Patch &patch : patches)
+        for (const auto &[field, percent] : patch.device)
+            if (is_ink(field)) {
+                largest = std::max(largest, percent);
+                least = std::min(least, percent);
+                most[field] = std::max(most[field], percent);
+            }
+    constexpr double kPercentages = 20; // no fractions
+    for (const auto &[ink, percent] : most)
+        if (largest >= kPercentages && percent > 0 && percent <= 1)
+            out.push_back({0, fmt::format("the largest value of {} is {:g}, and of another ink "
+                                          "{:g}; they are taken for percentages",
+                                          ink, percent, largest)});
+    if (largest > 100 || (largest > 0 && largest <= 1))
+        out.push_back({0, fmt::format("the largest ink value is {:g}; they are taken for "
+                                      "percentages",
+                                      largest)});
+    if (least < 0)
+        out.push_back({0, fmt::format("the smallest ink value is {:g}", least)});
+}
+
 } // namespace
 
 std::vector<Doubt> doubts_about(const std::vector<Patch> &patches, Kind kind)
 {
     std::vector<Doubt> out;
+    doubt_percentages(patches, out);
     Named named;
     if (kind != Kind::colours) {
         if (kind == Kind::reflectance) {

@@ -315,28 +315,6 @@ void Sheet::bring_to_lab(const Colours &colours)
         }
 }
 
-// On another scale the device values are no tints: nothing is printed at 100 %.
-void Sheet::check_inks()
-{
-    double largest = 0;
-    std::map<std::string_view, double> most; // of each ink
-    for (const Patch &patch : patches)
-        for (const auto &[field, percent] : patch.device)
-            if (is_ink(field)) {
-                largest = std::max(largest, percent);
-                most[field] = std::max(most[field], percent);
-            }
-    constexpr double kPercentages = 20; // no fractions
-    for (const auto &[ink, percent] : most)
-        if (largest >= kPercentages && percent > 0 && percent <= 1)
-            warn(0, fmt::format("the largest value of {} is {:g}, and of another ink {:g}; they "
-                                "are taken for percentages",
-                                ink, percent, largest));
-    if (largest > 100 || (largest > 0 && largest <= 1))
-        warn(0,
-             fmt::format("the largest ink value is {:g}; they are taken for percentages", largest));
-}
-
 Measurement Sheet::measurement()
 {
     if (patches.empty())
@@ -370,7 +348,6 @@ Measurement Sheet::measurement()
                             in_quotes(header.unknown_filter)));
     if (xyz)
         bring_to_lab(colours);
-    check_inks();
     for (const Doubt &doubt : doubts_about(patches, kind))
         warn(doubt.line, doubt.text);
     if (kind == Kind::transmission)

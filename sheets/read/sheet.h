@@ -72,7 +72,6 @@ private:
     double largest_fraction() const;
     void warn_of_guess(double largest);
     void bring_to_lab(const Colours &colours);
-    void check_inks();
 
     Reading reading;
     Source origin; // that of the first patch

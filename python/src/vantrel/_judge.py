@@ -76,6 +76,7 @@ def _fields(sheet: Sheet) -> Dict[str, Any]:
     lines = sheet.lines if len(sheet.lines) == patches else np.zeros(patches)
     taken: Dict[str, Any] = {name: getattr(sheet, name) for name in vars(sheet)}
     taken["warnings"] = [*sheet._warnings, *_scale_doubts(sheet)]
+    taken["changed"] = sheet._digests() != sheet._of
     taken["lines"] = _doubles(lines, (patches,), "lines")
     taken["device"] = {
         field: _doubles(column, (patches,), field, missing=True)

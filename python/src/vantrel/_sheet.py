@@ -133,7 +133,7 @@ class Sheet:
     lines: Sequence[int] = ()
     _warnings: Sequence[str] = ()  # in the words of the program
     _read_from: str = ""
-    _of: Tuple[int, ...] = ()  # digests of the spectra and L*a*b* of the file, where it has both
+    _of: Tuple[int, ...] = ()  # digests of the numbers of the file: spectra, L*a*b*, device values
 
     def __repr__(self) -> str:
         return f"<Sheet of {self.file}: {len(self)} patches, {self.kind}>"
@@ -206,9 +206,13 @@ class Sheet:
 
     def _own_lab(self) -> Optional[NDArray[np.float64]]:
         """The L*a*b* of the file, unless they belong to spectra that are no longer here."""
-        now = _digest(self.spectra), _digest(self.lab)
-        stale = self._of and self.spectra is not None and now[0] != self._of[0] and now[1] == self._of[1]
+        if self.spectra is None or not self._of or self.lab is None:
+            return self.lab
+        stale = _digest(self.spectra) != self._of[0] and _digest(self.lab) == self._of[1]
         return None if stale else self.lab
+
+    def _digests(self) -> Tuple[int, ...]:
+        return tuple(map(_digest, (self.spectra, self.lab, *self.device.values())))
 
     def _lost(self, text: str, lab: Any) -> List[str]:
         """The fields that a file with this text does not give back."""
@@ -286,7 +290,7 @@ def _read_sheet(content: bytes, scale: str, condition: Optional[str]) -> Sheet:
     illuminant = found.get("lab_illuminant")
     spectra = _array(found["spectra"], -1, 31) if "spectra" in found else None
     lab = _array(found["lab"], -1, 3) if "lab" in found else None
-    return Sheet(
+    sheet = Sheet(
         spectra=spectra,
         names=found["names"],
         ids=found["ids"],
@@ -299,8 +303,8 @@ def _read_sheet(content: bytes, scale: str, condition: Optional[str]) -> Sheet:
         origin=Origin(**found["origin"]),
         warnings=[in_python(line.strip()) for line in found["warnings"]],
         _warnings=found["warnings"],
-        _of=(_digest(spectra), _digest(lab)) if spectra is not None and lab is not None else (),
     )
+    return replace(sheet, _of=sheet._digests())
 
 
 def _sheet(
