@@ -70,6 +70,11 @@ def test_wavelengths_count():
         for given in labelled, beside, labelled.chunk({"patch": 2}), frame, frame.astype("Float64"):
             density = vantrel.refl_to_density(given, None, "E", "GREEN")
             assert np.array_equal(density, expected) and not getattr(density, "attrs", None)
+    for label in "R_{}_nm", "refl[{}]", "{}nm", "nm{}", "R1 {}.0 nm", "2024: {} nm", "{} nm, 2024":
+        turned = pd.DataFrame(SPECTRA[:, ::-1], columns=[label.format(w) for w in NM[::-1]])
+        assert np.array_equal(vantrel.refl_to_density(turned, None, "E", "GREEN"), expected)
+    turned.columns = pd.MultiIndex.from_product([["refl"], NM[::-1]], names=["kind", "nm"])
+    assert np.array_equal(vantrel.refl_to_density(turned, None, "E", "GREEN"), expected)
     halves = np.arange(380, 731, 2.5)
     waves = pd.DataFrame([50 + 40 * np.sin(halves / 20)], columns=[f"R{w}" for w in halves])
     at_bands = vantrel.resample(waves.to_numpy(), halves)
@@ -85,6 +90,8 @@ SQUARE = np.resize(SPECTRA, (31, 31))
     "given, reason",
     [
         (xr.DataArray(SQUARE, dims=("nm", "patch")), "along 'nm'.*transpose"),
+        (xr.DataArray(SQUARE, dims=("Wavelength [nm]", "patch")), "along 'Wavel.*transpose"),
+        (xr.DataArray(SQUARE, dims=("wavelength_nm", "patch")), "along 'wavel.*transpose"),
         (xr.DataArray(SQUARE, {"f": NM}, ("f", "patch")), "along 'f'.*transpose"),
         (pd.DataFrame(SQUARE, index=NM), "along 'index'.*transpose"),
         (xr.DataArray(SPECTRA, {"nm": NM + 10}, ("patch", "nm")), "range is too short"),

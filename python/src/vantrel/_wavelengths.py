@@ -11,7 +11,7 @@ NM = np.arange(400.0, 701.0, 10.0)
 _WIDEST = 10  # step, in nm
 _TOLERANCE = 0.001  # of a wavelength, in nm
 _NAMES = {"nm", "wavelength", "wavelengths", "wl", "lambda", "band", "bands"}
-_LABEL = re.compile(r"(?:[A-Za-z_ ]*[A-Za-z_ ])?(\d{3,4}(?:\.\d+)?) ?(?:nm)?", re.IGNORECASE)
+_LABEL = re.compile(r"(?<![\d.])\d{3,4}(?:\.\d+)?(?![\d.])")
 
 
 @functools.lru_cache(maxsize=64)
@@ -53,25 +53,34 @@ def to_bands(values, wavelengths, name):
 
 
 def wavelengths_of(labels):
-    """The wavelengths in nm that labels carry: numbers, or "400", "R400", "SPECTRAL_NM400"; or None.
+    """The wavelengths in nm that labels carry: numbers, "R400", "refl[400]", ("refl", 400); or None.
 
-    0, 1, 2, ... are places, and no wavelengths.
+    0, 1, 2, ... are places, and no wavelengths. Of several numbers in each label it is the last that
+    differs from label to label.
     """
     labels = np.asarray(labels)
     if labels.ndim != 1 or not labels.size:
         return None
     if labels.dtype.kind in "OUT":
-        found = [_LABEL.fullmatch(str(label).strip()) for label in labels]
-        return np.array([float(m.group(1)) for m in found if m]) if all(found) else None
+        numbers = [_LABEL.findall(str(label)) for label in labels]
+        for along in zip(*(found[::-1] for found in numbers)):
+            if len(set(along)) == len(labels):
+                return np.array(along, dtype=np.float64)
+        return None
     if labels.dtype.kind not in "fiu" or np.array_equal(labels, np.arange(labels.size)):
         return None
     return labels.astype(np.float64)
 
 
+def _is_named(name):
+    """Whether a name is one of wavelengths: "wavelength_nm", "Wavelength [nm]"."""
+    return not _NAMES.isdisjoint(re.split("[^a-z]+", str(name).lower()))
+
+
 def _is_spectral(name, labels):
     nm = None if labels is None else wavelengths_of(labels)
     spectral = nm is not None and nm.size > 1 and 300 <= nm.min() and 600 < nm.max() <= 1100
-    return spectral or str(name).lower() in _NAMES
+    return spectral or _is_named(name)
 
 
 def _refuse_turned(dims, last, name):
@@ -91,7 +100,7 @@ def _labels_along(value, dim):
     Along patches numbers may look like wavelengths; there the name counts.
     """
     for name, coordinate in value.coords.items():
-        known = dim == value.dims[-1] or str(name).lower() in _NAMES
+        known = dim == value.dims[-1] or _is_named(name)
         if known and coordinate.dims == (dim,) and _is_spectral(None, coordinate.values):
             return coordinate.values
     return value.coords[dim].values if dim in value.coords else None
