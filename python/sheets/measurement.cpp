@@ -283,8 +283,7 @@ Measurement measurement_of(PyObject *fields)
     }
     add_device(sheet.patches, item(fields, "device").get());
     add_colours(sheet, fields);
-    if (const Object source = item(fields, "source"); source.get() != Py_None)
-        each_of_source(sheet.source, taken(source.get()));
+    each_of_source(sheet.source, taken(item(fields, "source").get()));
     each_of_origin(sheet.origin, taken(item(fields, "origin").get()));
     bool changed = false;
     field("changed", changed);

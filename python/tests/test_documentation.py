@@ -7,13 +7,16 @@ import subprocess
 import sys
 from pathlib import Path
 
+import matplotlib
 import numpy as np
 import pytest
 
 import vantrel
+import vantrel.plot
 
 LIBRARY = Path(__file__).resolve().parents[1] / "library"
 PUBLIC = {name: getattr(vantrel, name) for name in vantrel.__all__}
+DRAWING = {name: getattr(vantrel.plot, name) for name in vantrel.plot.__all__}
 FUNCTIONS = {name: value for name, value in PUBLIC.items() if inspect.isfunction(value)}
 
 
@@ -28,7 +31,8 @@ def spectra():
 
 def test_every_example_prints_what_it_says(spectra, monkeypatch, capsys):
     monkeypatch.chdir(LIBRARY)
-    documented = [*filter(callable, PUBLIC.values()), *vars(vantrel.CIEDE2000).values()]
+    matplotlib.use("Agg")
+    documented = [*filter(callable, PUBLIC.values()), *DRAWING.values(), *vars(vantrel.CIEDE2000).values()]
     runner = doctest.DocTestRunner(optionflags=doctest.NORMALIZE_WHITESPACE, verbose=False)
     with_examples = 0
     for value in documented:
@@ -37,8 +41,9 @@ def test_every_example_prints_what_it_says(spectra, monkeypatch, capsys):
         with_examples += bool(test.examples)
         runner.run(test)
     assert runner.summarize(verbose=False).failed == 0, capsys.readouterr().out
-    assert with_examples >= len(FUNCTIONS) + 4
-    for name, function in FUNCTIONS.items():
+    matplotlib.pyplot.close("all")
+    assert with_examples >= len(FUNCTIONS) + len(DRAWING) + 4
+    for name, function in (FUNCTIONS | DRAWING).items():
         titles = ["Examples"] if name.startswith("set") else ["Returns", "Examples"]
         titles += ["Parameters", "Raises"] if inspect.signature(function).parameters else []
         assert all(f"{t}\n{'-' * len(t)}" in inspect.getdoc(function) for t in titles), name

@@ -73,8 +73,10 @@ def test_scales_ranges_and_warnings():
 
 
 def test_colours_alone_are_a_sheet_too():
-    sheet = vantrel.reads(COLOURS.encode())
-    assert (sheet.kind, sheet.spectra, sheet.source) == ("colours", None, None)
+    sheet = vantrel.reads(COLOURS.replace("\n", ",M1\n").replace("b,M1", "b,mode").encode())
+    assert (sheet.kind, sheet.spectra, sheet.source.condition) == ("colours", None, "M1")
+    with pytest.warns(UserWarning, match="for which illuminant"):
+        assert vantrel.report(sheet).source.condition == "M1"
     assert sheet.lab[1].tolist() == [48, 75, -4] and "magenta" in sheet._repr_html_()
     with pytest.raises(KeyError, match="colours alone"):
         sheet["paper"]
@@ -295,7 +297,7 @@ def differing(first, second):
     held = [
         {name: repr(digits(value)) for name, value in vars(s).items() if name not in OWN}
         | {"device": repr({field: column.tolist() for field, column in s.device.items()})}
-        | {"condition": s.source and s.source.condition}
+        | {"condition": s.source.condition}
         for s in (first, second)
     ]
     return {name for name in held[0] if held[0][name] != held[1][name]}
@@ -488,6 +490,24 @@ def test_texts_name_the_arguments_and_leave_names_alone():
     assert in_python(text) == (
         'my--paper.txt: a “--paper” and --paper-white; pair="auto", force_pairs= or inks='
     )
+
+
+def test_what_has_no_colour_is_not_drawn_black(sheet):
+    matplotlib.use("Agg")
+    missing = replace(sheet, spectra=np.where(np.arange(31)[:, None] == 2, np.nan, sheet.spectra), file="missing")
+    for draw in vantrel.plot.spectra, vantrel.plot.ab_plane:
+        with pytest.warns(UserWarning, match="missing: no colour, and left out: 'Magenta 20'$") as caught:
+            ax = draw(missing)
+        assert caught[0].filename == __file__
+    assert len(ax.collections[0].get_offsets()) == 30
+    assert np.isfinite(ax.get_lines()[0].get_xydata()).all()
+    row = missing._repr_html_().split("<tr>")[4]
+    assert "repeating-linear-gradient" in row and "rgb(0, 0, 0)" not in row
+    functions = [getattr(vantrel.plot, name) for name in vantrel.plot.__all__]
+    for draw, given in [(draw, given) for draw in functions for given in ("sheet.cxf", sheet.spectra)]:
+        with pytest.raises(TypeError, match=f"is needed, not {type(given).__name__}"):
+            draw(given)
+    matplotlib.pyplot.close("all")
 
 
 def test_figures_show_what_the_sheet_has(sheet, darker):

@@ -88,7 +88,7 @@ def _fields(sheet: Sheet) -> Dict[str, Any]:
     if taken["lab"] is not None:
         taken["lab"] = _doubles(taken["lab"], (patches, 3), "lab", sheet.kind != "colours")
     taken["origin"] = asdict(sheet.origin)
-    taken["source"] = None if sheet.source is None else asdict(sheet.source)
+    taken["source"] = asdict(sheet.source)
     return taken
 
 
@@ -316,7 +316,7 @@ def compare(
         "substrate_corrected": substrate_corrected,
         "advice": advice or None,
     }
-    conditions = [s.source.condition if s.source else "" for s in (aims, sheet)]
+    conditions = [s.source.condition for s in (aims, sheet)]
     sheets = [aims, sheet]
     if aims.file == sheet.file and conditions[0] != conditions[1]:
         sheets = [replace(s, file=f"{s.file} ({c})") for s, c in zip(sheets, conditions)]

@@ -26,6 +26,7 @@ _WRITTEN = (
     "spectra", "names", "ids", "device", "lab", "lab_illuminant", "lab_stated", "kind", "condition",
     "origin", "collection",
 )
+_HATCHED = "repeating-linear-gradient(45deg,#fff 0 4px,#bbb 4px 5px)"  # for a colour that is none
 _MOST_SHOWN = 200  # patches in a notebook
 
 # What the program's texts name after two hyphens; those that a patch or a file has in its name stay.
@@ -100,7 +101,7 @@ class Sheet:
     kind : str
         "reflectance", "transmission" or "colours".
     source : Source
-        What the spectra looked like in the file; None for colours alone.
+        What the spectra looked like in the file; of colours alone, their measurement condition.
     origin : Origin
         Who measured what and when.
     collection : bool
@@ -123,7 +124,7 @@ class Sheet:
     lab_illuminant: Optional[IllumObs]
     lab_stated: str
     kind: str
-    source: Optional[Source]
+    source: Source
     origin: Origin
     collection: bool = False
     file: str = ""
@@ -220,8 +221,8 @@ class Sheet:
             back = _read_sheet(text.encode(), "automatic", None)
         except ValueError as error:
             raise ValueError(f"what would be written cannot be read: {error}") from None
-        wanted = {**vars(self), "lab": lab, "condition": self.source.condition if self.source else ""}
-        found = {**vars(back), "condition": back.source.condition if back.source else ""}
+        wanted = {**vars(self), "lab": lab, "condition": self.source.condition}
+        found = {**vars(back), "condition": back.source.condition}
         if back.lab_illuminant is not None:
             wanted["lab_stated"] = back.lab_stated  # its wording is free
         return [name for name in _WRITTEN if not _same(wanted[name], found[name])]
@@ -239,7 +240,7 @@ class Sheet:
         head = ["", "id", "name", *self.device, "L*", "a*", "b*"]
         rows = []
         for i, colour in enumerate(lab):
-            rgb = f"rgb{tuple(swatches[i].tolist())}"
+            rgb = f"rgb{tuple(swatches[i].tolist())}" if np.isfinite(colour).all() else _HATCHED
             values = [f"{column[i]:g}" for column in self.device.values()]
             cells = [self.ids[i], self.names[i], *values, *(f"{c:.2f}" for c in colour)]
             rows.append(
@@ -299,7 +300,7 @@ def _read_sheet(content: bytes, scale: str, condition: Optional[str]) -> Sheet:
         lab_illuminant=None if illuminant is None else IllumObs(illuminant),
         lab_stated=found["lab_stated"],
         **{name: found[name] for name in ("kind", "collection", "named", "has_ids", "lines")},
-        source=Source(**found["source"]) if spectra is not None else None,
+        source=Source(**found["source"]),
         origin=Origin(**found["origin"]),
         warnings=[in_python(line.strip()) for line in found["warnings"]],
         _warnings=found["warnings"],

@@ -61,7 +61,7 @@ def csv_text(sheet: Any, lab: Any) -> str:
     if sheet.spectra is not None and not sheet.spectra.max() > _FRACTIONS:
         raise ValueError("CSV does not name the scale of spectra, and these look like fractions; .txt does")
     columns = _labels(sheet)
-    if sheet.source is not None and sheet.source.condition:
+    if sheet.source.condition:
         columns["measurement_condition"] = [sheet.source.condition] * len(sheet)
     light = sheet.lab_illuminant
     light = "" if light is None else "_" + light.name.removesuffix("DEG")
@@ -85,9 +85,9 @@ def cgats_text(sheet: Any, lab: Any) -> str:
         "CREATED": origin.created,
         "INSTRUMENTATION": origin.instrument,
         "JOB_NAME": origin.job,
+        "MEASUREMENT_CONDITION": sheet.source.condition,
     }
     if sheet.spectra is not None:
-        keywords["MEASUREMENT_CONDITION"] = sheet.source.condition if sheet.source else ""
         keywords["QUANTITY"] = "transmittance" if sheet.kind == "transmission" else "reflectance"
         keywords["SPECTRAL_NORM"] = "100"
     keywords["ILLUMINANT"], keywords["OBSERVER_ANGLE"] = _light(sheet)
