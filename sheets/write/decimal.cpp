@@ -1,5 +1,6 @@
 #include "write/decimal.h"
 
+#include <charconv>
 #include <cmath>
 #include <iterator>
 
@@ -7,24 +8,20 @@ namespace vantrel::sheets {
 
 void append_ten_thousandths(long long k, bool zeros, std::string &out)
 {
-    char text[24];
-    char *end = std::end(text), *begin = end;
-    auto rest = static_cast<unsigned long long>(k < 0 ? -k : k);
-    for (int place = 0; place <= 4 || rest != 0; ++place) {
-        if (place == 4)
-            *--begin = '.';
-        *--begin = static_cast<char>('0' + rest % 10);
-        rest /= 10;
-    }
+    char text[24] = "-";
+    const auto rest = static_cast<unsigned long long>(k < 0 ? -k : k);
+    char *end = std::to_chars(text + (k < 0), std::end(text), rest / 10000).ptr;
+    const auto decimals = static_cast<unsigned>(rest % 10000);
+    *end++ = '.';
+    for (const unsigned place : {1000, 100, 10, 1})
+        *end++ = static_cast<char>('0' + decimals / place % 10);
     if (!zeros) {
         while (end[-1] == '0')
             --end;
         if (end[-1] == '.')
             --end;
     }
-    if (k < 0)
-        *--begin = '-';
-    out.append(begin, end);
+    out.append(text, end);
 }
 
 std::optional<long long> ten_thousandths(double value)
