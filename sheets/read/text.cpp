@@ -1,9 +1,11 @@
 #include "read/text.h"
 
 #include <algorithm>
+#include <array>
 #include <cerrno>
 #include <charconv>
 #include <cmath>
+#include <cstdint>
 #include <cstdlib>
 
 namespace vantrel::sheets {
@@ -62,6 +64,30 @@ void append_utf8(std::string &out, char32_t c)
     }
 }
 
+// The number of at most 15 digits that the whole text is, as most are. Those digits and the power
+// of ten below them are doubles, so that their quotient is the double nearest to the number.
+std::optional<double> short_decimal(std::string_view text)
+{
+    static constexpr std::array powers = {1e0, 1e1, 1e2,  1e3,  1e4,  1e5,  1e6,  1e7,
+                                          1e8, 1e9, 1e10, 1e11, 1e12, 1e13, 1e14, 1e15};
+    const bool negative = text.starts_with('-');
+    text.remove_prefix(negative);
+    const std::size_t point = std::min(text.find('.'), text.size());
+    const std::string_view whole = text.substr(0, point),
+                           places = text.substr(std::min(point + 1, text.size()));
+    if (whole.size() + places.size() == 0 || whole.size() + places.size() >= powers.size())
+        return std::nullopt;
+    std::uint64_t digits = 0;
+    for (const std::string_view part : {whole, places})
+        for (const char c : part) {
+            if (c < '0' || c > '9')
+                return std::nullopt;
+            digits = 10 * digits + static_cast<std::uint64_t>(c - '0');
+        }
+    const double value = static_cast<double>(digits) / powers[places.size()];
+    return negative ? -value : value;
+}
+
 // The decimal number that the whole text is; otherwise not finite.
 double decimal(std::string_view text)
 {
@@ -117,6 +143,8 @@ std::string_view trimmed(std::string_view text)
 
 std::optional<double> number_in(std::string_view text)
 {
+    if (const auto number = short_decimal(text))
+        return number;
     text = trimmed(text);
     if (text.size() > 1 && text[0] == '+' && text[1] != '-')
         text.remove_prefix(1);
