@@ -17,12 +17,14 @@ namespace {
 bool next_record(std::string_view &text, char separator, std::size_t &line, Row &row)
 {
     const auto ends = [&](char c) { return c == separator || c == '\n' || c == '\r'; };
-    const std::string_view blanks = separator == '\t' ? " " : " \t";
+    const auto is_blank = [&](char c) { return c == ' ' || (c == '\t' && separator != '\t'); };
     row.clear();
     for (;;) {
         std::string_view quoted;
-        const auto begin = text.find_first_not_of(blanks);
-        if (begin != std::string_view::npos && text[begin] == '"') {
+        std::size_t begin = 0;
+        while (begin < text.size() && is_blank(text[begin]))
+            ++begin;
+        if (begin < text.size() && text[begin] == '"') {
             text.remove_prefix(begin);
             const auto string = next_string(text, row);
             if (!string)

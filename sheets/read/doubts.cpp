@@ -8,9 +8,9 @@
 
 #include <algorithm>
 #include <array>
+#include <bit>
 #include <cmath>
 #include <cstdint>
-#include <cstring>
 #include <map>
 #include <optional>
 #include <string_view>
@@ -115,15 +115,12 @@ void doubt_signs(const std::vector<Patch> &patches, std::vector<Doubt> &out)
                      and_more(count))});
 }
 
-// FNV-1a over the bytes.
+// FNV-1a over the values, of which -0 is 0.
 std::uint64_t hash_of(const Spectrum &refl)
 {
     std::uint64_t hash = 14695981039346656037u;
-    for (const double value : refl) {
-        std::uint64_t bits = 0;
-        std::memcpy(&bits, &value, sizeof bits);
-        hash = (hash ^ bits) * 1099511628211u;
-    }
+    for (const double value : refl)
+        hash = (hash ^ std::bit_cast<std::uint64_t>(value + 0.0)) * 1099511628211u;
     return hash;
 }
 
@@ -182,7 +179,7 @@ void doubt_copies(const std::vector<Patch> &patches, std::vector<Doubt> &out)
     for (std::size_t i = 1; i < hashes.size(); ++i) {
         const std::pair both{hashes[i - 1].second, hashes[i].second};
         const Patch &one = patches[both.first], &other = patches[both.second];
-        if (one.refl != other.refl)
+        if (hashes[i - 1].first != hashes[i].first || one.refl != other.refl)
             continue;
         Copies &copies = one.device == other.device ? repeats : strangers;
         copies.first = std::min(copies.first.value_or(both), both);
