@@ -202,19 +202,22 @@ void Sheet::leave_out_statistics()
     const std::size_t last = others.empty() ? 0 : others.back()->line;
     Statistics statistics(std::move(others), kind);
     std::vector<bool> is_out(patches.size());
-    for (const auto &[row, statistic] : rows) {
-        const std::string name = row->name.empty() ? row->id : row->name;
+    const Patch *kept = nullptr; // the first
+    std::size_t count = 0;
+    for (const auto &[row, statistic] : rows)
         if ((devices && row->device.empty() && row->line > last) ||
             statistics.holds(statistic, *row)) {
-            leave_out(name, row->line);
+            leave_out(row->name.empty() ? row->id : row->name, row->line);
             is_out[static_cast<std::size_t>(row - patches.data())] = true;
         } else {
-            warn(row->line,
-                 fmt::format("{} is named as a statistic, but is none of the other rows: "
-                             "it is read as a patch",
-                             in_quotes(name)));
+            kept = kept ? kept : row;
+            ++count;
         }
-    }
+    if (kept)
+        warn(kept->line,
+             fmt::format("{} is named as a statistic, but is none of the other rows{}: read as a "
+                         "patch",
+                         in_quotes(kept->name.empty() ? kept->id : kept->name), and_more(count)));
     keep_some(patches, [&](std::size_t i) { return !is_out[i]; });
 }
 
@@ -317,6 +320,8 @@ void Sheet::bring_to_lab(const Colours &colours)
 
 Measurement Sheet::measurement()
 {
+    if (patches.empty() && !left_out.empty())
+        throw InputError{left_out_line, fmt::format("no patches, but {}", listed(left_out))};
     if (patches.empty())
         throw InputError{0, "neither spectra nor L*a*b* nor XYZ in this file"};
     if (kind == Kind::colours && !reading.colours)
