@@ -84,7 +84,10 @@ std::string answer_of(std::string_view command, const std::vector<Measurement> &
         return predict(sheets.at(0), options);
     if (command == "ink")
         return ink(sheets.at(0), options);
-    return report({&sheets.at(0)}, sheets.size() > 1 ? &sheets[1] : nullptr, options);
+    const bool advised = command == "advice"; // a report, with aims after the sheet
+    const std::size_t second = advised ? 2 : 1;
+    return report({&sheets.at(0)}, sheets.size() > second ? &sheets[second] : nullptr, options, {},
+                  advised ? &sheets.at(1) : nullptr);
 }
 
 /// answer(command, [fields of a Sheet, ...], options in JSON): text. ValueError where it is

@@ -1,6 +1,7 @@
 """Measurement files of every format, as arrays."""
 
 import dataclasses
+import inspect
 import os
 import pickle
 import re
@@ -192,6 +193,10 @@ ASKED = [
         " --tolerance 1.25 --tolerances LIBRARY/examples/proof.toml --substrate-corrected --allow-missing",
     ),
     (
+        lambda sheet, darker: vantrel.report(sheet, advice=darker),
+        "report EXAMPLE --advice darker.txt",
+    ),
+    (
         lambda sheet, darker: vantrel.compare(
             sheet, darker, paper="1", pair="id", force_pairs=True, advice=True
         ),
@@ -232,6 +237,23 @@ ASKED = [
         " --tolerances LIBRARY/examples/proof.toml --illuminant D65_2DEG --order CMYK_Y,CMYK_M",
     ),
 ]
+
+
+# What the program asks for and Python says otherwise: by read(), by the sheets, by the result.
+NOT_ARGUMENTS = set("all aims condition format help no-color output sample-condition scale".split())
+
+
+def test_every_option_of_the_program_is_an_argument():
+    program = os.environ.get("VANTREL_PROGRAM")
+    if not program:
+        pytest.skip("VANTREL_PROGRAM does not name the program")
+    for command in "report", "compare", "predict", "ink", "run":
+        shown = subprocess.run([program, command, "--help"], capture_output=True, text=True).stdout
+        options = {*re.findall(r"(?<!\S)--([a-z-]+)", shown)} - NOT_ARGUMENTS
+        taken = {*inspect.signature(getattr(vantrel, command)).parameters}
+        renamed = {"ink": "inks"} if command == "predict" else {}
+        assert len(options) > 3
+        assert {renamed.get(o, o.replace("-", "_")) for o in options} <= taken, command
 
 
 @pytest.mark.parametrize("call, command", ASKED)

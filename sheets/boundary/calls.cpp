@@ -325,7 +325,7 @@ std::string about(const Measurement &sheet)
 }
 
 std::string report(const std::vector<const Measurement *> &sheets, const Measurement *second_sheet,
-                   std::string_view options, const Tell &tell)
+                   std::string_view options, const Tell &tell, const Measurement *aims)
 {
     Options given(options);
     const ReportRequest request{
@@ -337,6 +337,7 @@ std::string report(const std::vector<const Measurement *> &sheets, const Measure
         .second_paper = given.text("second_paper"),
         .second_sheet = second_sheet,
         .second_illuminant = given.illuminant("second_illuminant"),
+        .aims = aims,
         .tell = tell,
     };
     const std::string format = format_of(given);

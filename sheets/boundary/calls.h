@@ -30,9 +30,11 @@ Measurement open_spectra(std::string_view file, const Rows &rows, std::string_vi
 // JSON: `file`, `patches` (their number), `warnings`.
 std::string about(const Measurement &sheet);
 
-// `second_sheet` holds the second paper; null for one of each sheet itself.
+// `second_sheet` holds the second paper; null for one of each sheet itself. `aims` are those of the
+// solids, for advice.
 std::string report(const std::vector<const Measurement *> &sheets, const Measurement *second_sheet,
-                   std::string_view options, const Tell &tell = {});
+                   std::string_view options, const Tell &tell = {},
+                   const Measurement *aims = nullptr);
 std::string compare(const Measurement &reference, const Measurement &sample,
                     std::string_view options, const Tell &tell = {});
 std::string run(const std::vector<const Measurement *> &sheets, const Measurement &aims,

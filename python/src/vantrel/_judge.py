@@ -99,13 +99,17 @@ def _plain(value: Any) -> Any:
     raise TypeError(f"{value!r} is no number, text or list of these")
 
 
+def _called(command: str) -> str:
+    return "report" if command == "advice" else command
+
+
 def _answer(
     command: str, sheets: Sequence[Dict[str, Any]], options: Dict[str, Any], form: str
 ) -> str:
     try:
         wishes = json.dumps({**options, "format": form}, default=_plain, allow_nan=False)
     except ValueError:
-        raise ValueError(f"{command}: an argument is not finite") from None
+        raise ValueError(f"{_called(command)}: an argument is not finite") from None
     try:
         text: str = extension().answer(command, sheets, wishes)
     except ValueError as error:
@@ -120,7 +124,7 @@ def _result(kind: Any, command: str, sheets: Sequence[Sheet], options: Dict[str,
     result = kind._of(functools.partial(_answer, command, given, names), read_from)
     if settings_in_force():
         warnings.warn(
-            f"{command}() takes the constants of the program, not those that are set: these hold for "
+            f"{_called(command)}() takes the constants of the program, not those that are set: these hold for "
             "functions over arrays",
             stacklevel=3,
         )
@@ -168,6 +172,7 @@ def report(
     second_paper: Optional[str] = None,
     second_sheet: Optional[Sheet] = None,
     second_illuminant: Optional[Illuminant] = None,
+    advice: Optional[Sheet] = None,
 ) -> Report:
     """The colour, density and print attributes of every patch of a sheet, as `vantrel report`.
 
@@ -189,6 +194,8 @@ def report(
     second_sheet : Sheet, optional
     second_illuminant : IllumObs or its name, optional
         Of that metamerism, beside `illuminant`.
+    advice : Sheet, optional
+        Aims: of every solid, the density change that brings it nearest to its own.
 
     Returns
     -------
@@ -213,8 +220,8 @@ def report(
         "second_paper": second_paper,
         "second_illuminant": _name("Illuminant", second_illuminant, "second_illuminant"),
     }
-    sheets = [sheet] if second_sheet is None else [sheet, second_sheet]
-    result: Report = _result(Report, "report", sheets, options)
+    sheets = [s for s in (sheet, advice, second_sheet) if s is not None]
+    result: Report = _result(Report, "report" if advice is None else "advice", sheets, options)
     return result
 
 

@@ -135,6 +135,18 @@ class ReportSource:
     condition: Optional[str]
 
 
+@dataclass(frozen=True)
+class Advice:
+    """What to change at the press for a solid: its density, and ΔE00 before and after."""
+
+    ink: str
+    de00: float
+    density_change: float
+    de00_after: float
+    words: str
+    patch: str
+
+
 @dataclass(frozen=True, repr=False)
 class Report(Result):
     """What `vantrel report` says of a sheet; print() shows it as the program does."""
@@ -151,6 +163,8 @@ class Report(Result):
     tone_values: Tuple[ToneCurve, ...]
     greys: Tuple[Neutral, ...]
     patches: Tuple[PatchReport, ...]
+    advice: Optional[Tuple[Advice, ...]] = None
+    advice_from: Optional[str] = None
 
     @staticmethod
     def _body(document: Dict[str, Any]) -> Dict[str, Any]:
@@ -333,18 +347,6 @@ class GreyStep:
     delta_l: float
     reference_density: Optional[float]
     density: Optional[float]
-
-
-@dataclass(frozen=True)
-class Advice:
-    """What to change at the press for a solid: its density, and ΔE00 before and after."""
-
-    ink: str
-    de00: float
-    density_change: float
-    de00_after: float
-    words: str
-    patch: str
 
 
 @dataclass(frozen=True, repr=False)
