@@ -136,6 +136,9 @@ def test_any_name_of_a_dimension_will_do():
         for paper in PAPER, xr.DataArray(PAPER, dims="nm"):
             density = vantrel.refl_to_density(labelled, paper, [["E"], ["T"]], "GREEN")
             assert density.dims == (dim, "q") and np.array_equal(density, expected)
+    named = xr.DataArray(["E", "T"], dims="p")
+    by_name = vantrel.refl_to_density(xr.DataArray(SPECTRA[:2], dims=("p", "nm")), None, named, "GREEN")
+    assert np.array_equal(by_name, vantrel.refl_to_density(SPECTRA[:2], None, ["E", "T"], "GREEN"))
     lab = vantrel.refl_to_cielab(xr.DataArray(SPECTRA, dims=("lab", "nm")))
     assert lab.dims == ("lab", "lab_")
     expected = vantrel.refl_to_density(SPECTRA, PAPER, [["E"], ["T"]], "GREEN")

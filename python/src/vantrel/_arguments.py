@@ -128,6 +128,8 @@ class Index:
     def convert(self, value, name):
         if isinstance(value, (str, int, np.integer, np.bool_)):
             return self.number(value, name)
+        if library_of(value) == "xarray" and value.dtype.kind in "UTO" and not is_lazy(value.data):
+            return value.copy(data=self.convert(value.values, name))
         # what is in a list keeps its type: a member of another enumeration, say
         array = as_numpy(value) if hasattr(value, "dtype") else np.array(value, dtype=object)
         if isinstance(array, np.ndarray) and array.dtype.kind in "UTOb":
