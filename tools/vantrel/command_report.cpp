@@ -73,7 +73,7 @@ Outcome run(const ReportOptions &options)
     };
     std::vector<Report> sheets;
     std::vector<std::string> warnings;
-    for (const std::string &file : options.files) {
+    for (const std::string &file : files_of(options.files)) {
         Measurement sheet = sheet_of(file, options, true);
         if (!second.sheet)
             require_patch_or_file(sheet, second.name);

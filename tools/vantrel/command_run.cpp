@@ -2,6 +2,7 @@
 
 #include "judge/run.h"
 #include "options.h"
+#include "system.h"
 
 #include <memory>
 
@@ -23,7 +24,7 @@ Outcome run(const RunOptions &options)
                     .paper = options.paper,
                     .order = options.order,
                     .tolerances = tolerances_of(options.tolerances)});
-    for (const std::string &file : options.files) {
+    for (const std::string &file : files_of(options.files)) {
         try {
             judge.add(sheet_of(file, options));
         } catch (const RequestError &error) {

@@ -2,6 +2,7 @@
 #pragma once
 
 #include <string>
+#include <vector>
 
 namespace vantrel::program {
 
@@ -14,5 +15,9 @@ enum class Stream { output, error };
 bool is_terminal(Stream stream);
 
 bool is_regular_file(const std::string &path);
+
+// The files that words of the command line stand for. The shells of Windows leave * and ? to the
+// program; a word that no file fits stays.
+std::vector<std::string> files_of(const std::vector<std::string> &words);
 
 } // namespace vantrel::program

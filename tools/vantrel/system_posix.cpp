@@ -23,4 +23,6 @@ bool is_regular_file(const std::string &path)
     return stat(path.c_str(), &state) == 0 && S_ISREG(state.st_mode);
 }
 
+std::vector<std::string> files_of(const std::vector<std::string> &words) { return words; }
+
 } // namespace vantrel::program

@@ -114,6 +114,11 @@ BOOL WINAPI remove_and_end(DWORD)
     return FALSE; // as if there were no handler
 }
 
+std::string folder_of(const std::string &path)
+{
+    return path.substr(0, path.find_last_of("/\\:") + 1); // none where there is no separator
+}
+
 } // namespace
 
 void prepare(char **&words)
@@ -149,6 +154,28 @@ bool is_regular_file(const std::string &path)
 {
     const DWORD attributes = GetFileAttributesW(wide(path).c_str());
     return attributes != INVALID_FILE_ATTRIBUTES && !(attributes & FILE_ATTRIBUTE_DIRECTORY);
+}
+
+std::vector<std::string> files_of(const std::vector<std::string> &words)
+{
+    std::vector<std::string> out;
+    for (const std::string &word : words) {
+        std::vector<std::string> fitting;
+        WIN32_FIND_DATAW found;
+        HANDLE search = word.find_first_of("*?") == std::string::npos
+                            ? INVALID_HANDLE_VALUE // NOLINT(performance-no-int-to-ptr)
+                            : FindFirstFileW(wide(word).c_str(), &found);
+        for (bool more = search != INVALID_HANDLE_VALUE; more; // NOLINT(performance-no-int-to-ptr)
+             more = FindNextFileW(search, &found))
+            if (!(found.dwFileAttributes & FILE_ATTRIBUTE_DIRECTORY))
+                fitting.push_back(folder_of(word) + utf8(found.cFileName));
+        FindClose(search);
+        std::sort(fitting.begin(), fitting.end());
+        if (fitting.empty())
+            fitting.push_back(word);
+        out.insert(out.end(), fitting.begin(), fitting.end());
+    }
+    return out;
 }
 
 std::string read_file(const std::string &path)
@@ -230,6 +257,7 @@ void OutputFile::open()
             if (was_read(*target))
                 throw sheets::RequestError{sheets::printable(path) +
                                            " has been read; the output would write over it"};
+            links_cut = target->nNumberOfLinks - 1;
             open_beside(path);
         } else { // NUL, a pipe
             file = old;
@@ -244,8 +272,7 @@ void OutputFile::open()
 void OutputFile::open_beside(const std::string &target)
 {
     replaced = target;
-    const auto slash = target.find_last_of("/\\:");
-    const std::string folder = slash == std::string::npos ? "" : target.substr(0, slash + 1);
+    const std::string folder = folder_of(target);
     std::string name;
     for (unsigned i = 0; i < 100 && file < 0; ++i) {
         name = fmt::format("{}.vantrel.{:x}.{}", folder, GetCurrentProcessId(), i);
