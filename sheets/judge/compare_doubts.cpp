@@ -87,6 +87,19 @@ Line line_of(const std::vector<const PairReport *> &pairs)
     return {factor, y - factor * x};
 }
 
+std::string_view backing_in(const std::string &setup)
+{
+    return contains(setup, "BLACK") ? "black" : contains(setup, "WHITE") ? "white" : "";
+}
+
+std::string_view geometry_in(const std::string &setup)
+{
+    const auto names = [&](auto... words) { return (contains(setup, words) || ...); };
+    return names("SPHER", "DIFFUSE", "D/8", "D:8", "DE:8", "DI:8", "8/D", "8:D") ? "sphere"
+           : names("45", "SINGLEANGLE")                                          ? "45:0"
+                                                                                 : "";
+}
+
 } // namespace
 
 void warn_of_conditions(const Measurement &reference, const Measurement &sample,
@@ -96,6 +109,15 @@ void warn_of_conditions(const Measurement &reference, const Measurement &sample,
     if (!first.empty() && !second.empty() && first != second)
         warnings.push_back(fmt::format("{} was measured under {}, {} under {}", reference.file,
                                        first, sample.file, second));
+    const auto doubt = [&](std::string_view what, auto name_in) {
+        const std::string_view aim = name_in(upper(reference.source.setup)),
+                               own = name_in(upper(sample.source.setup));
+        if (!aim.empty() && !own.empty() && aim != own)
+            warnings.push_back(
+                fmt::format("{}: {} {}, {}: {}", reference.file, what, aim, sample.file, own));
+    };
+    doubt("backing", backing_in);
+    doubt("geometry", geometry_in);
 }
 
 void warn_of_uneven(const Pairs &pairs, const Measurement &reference, const Measurement &sample,

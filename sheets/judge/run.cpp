@@ -47,10 +47,11 @@ std::map<int, Series> zone_series(const RunSeries &series)
         Series values;
         for (const auto &[zone, value] : series.sheets[i]->zones)
             values.emplace_back(value);
+        const double middle = median_of(values);
         for (const auto &[zone, value] : series.sheets[i]->zones) {
             Series &own = out[zone];
             own.resize(series.sheets.size());
-            own[i] = value - median_of(values);
+            own[i] = value - middle;
         }
     }
     return out;
@@ -69,8 +70,9 @@ void find_odd_zones(RunSeries &series)
         for (const std::size_t sheet : outliers_about_slope(own, least))
             series.zone_outliers.push_back({sheet, zone, *own[sheet] - median_of(own)});
     }
+    const double middle = median_of(middles);
     for (const std::size_t i : outliers_of(middles, least))
-        series.odd_zones[zones[i]] = *middles[i] - median_of(middles);
+        series.odd_zones[zones[i]] = *middles[i] - middle;
 }
 
 } // namespace

@@ -64,7 +64,10 @@ private:
     using Measured = std::pair<Condition, std::size_t>; // setup
     std::vector<std::pair<Patch, Measured>> colours;    // of objects with no spectrum
     std::map<Measured, std::string_view> preferred;     // ColorSpecification of several
-    bool step_missing = false;
+    bool step_missing = false, start_told_twice = false;
+    // by first wavelength and step, spectra and the line of the first of each number of values
+    std::map<std::pair<double, double>, std::map<std::size_t, std::pair<std::size_t, std::size_t>>>
+        lengths;
     std::size_t without = 0;      // objects with no spectrum
     std::size_t repeated = 0;     // spectra of an object under a condition that it has already
     std::string_view repeated_of; // ColorSpecification that is read instead of the first
@@ -136,6 +139,11 @@ std::vector<double> CxfReader::wavelengths(const Node &spectrum, const Settings 
 {
     const std::string_view stated = attribute(spectrum, "StartWL");
     const auto first = stated.empty() ? settings.first_nm : std::optional(number(spectrum, stated));
+    if (first && settings.first_nm && *first != *settings.first_nm &&
+        !std::exchange(start_told_twice, true))
+        sheet.warn(line_of(spectrum),
+                   fmt::format("StartWL is {:g}, and {:g} in its ColorSpecification: {:g} is taken",
+                               *first, *settings.first_nm, *first));
     const std::string_view own_step = attribute(spectrum, "Increment");
     auto step = own_step.empty() ? settings.step_nm : std::optional(number(spectrum, own_step));
     const double last = first.value_or(0) + 10 * static_cast<double>(count - 1);
@@ -150,6 +158,8 @@ std::vector<double> CxfReader::wavelengths(const Node &spectrum, const Settings 
                          fmt::format("ColorSpecification {} gives this spectrum no StartWL and "
                                      "Increment of its wavelengths",
                                      in_quotes(attribute(spectrum, "ColorSpecification")))};
+    auto &[spectra, line] = lengths[{*first, *step}][count];
+    line = spectra++ ? line : line_of(spectrum);
     std::vector<double> nm(count);
     for (std::size_t i = 0; i < count; ++i)
         nm[i] = *first + *step * static_cast<double>(i);
@@ -308,6 +318,10 @@ void CxfReader::read_object(const Node &object)
         if (is(spectrum, "TransmittanceSpectrum") ||
             settings.quantity.find("Transmi") != std::string_view::npos)
             sheet.kind = Kind::transmission;
+        if (const std::string quantity = upper(settings.quantity);
+            contains(quantity, "EMISS") || contains(quantity, "RADIAN"))
+            throw InputError{line_of(spectrum), fmt::format("light ({}), not reflectances",
+                                                            in_quotes(settings.quantity))};
         read_spectrum(spectrum, settings, patch);
         patch.lab = own_of(measured);
         sheet.add(patch, measured.first, line_of(spectrum), measured.second);
@@ -401,6 +415,19 @@ void CxfReader::read()
             const std::size_t at = patch.line;
             sheet.add(std::move(patch), measured.first, at, measured.second);
         }
+    }
+    for (const auto &[range, counts] : lengths) {
+        const auto usual =
+            std::max_element(counts.begin(), counts.end(), [](const auto &a, const auto &b) {
+                return a.second.first < b.second.first;
+            });
+        for (const auto &[count, spectra] : counts)
+            if (2 * spectra.first <= usual->second.first)
+                sheet.warn(
+                    spectra.second,
+                    fmt::format("a spectrum of {} values{}, most from {:g} nm on have {}: is "
+                                "one lost, and are the others shifted?",
+                                count, and_more(spectra.first), range.first, usual->first));
     }
     const auto unused = std::count_if(targets.begin(), targets.end(),
                                       [](const auto &row) { return !row.second.used; });

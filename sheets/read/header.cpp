@@ -29,11 +29,6 @@ std::string_view next_word(std::string_view &text)
     return word;
 }
 
-bool contains(std::string_view text, std::string_view part)
-{
-    return text.find(part) != std::string_view::npos;
-}
-
 // What stands behind a mark, up to the next blank; empty where the mark is missing.
 std::string_view behind(std::string_view text, std::string_view mark)
 {
@@ -98,11 +93,13 @@ namespace {
 
 bool tells_no_filter(std::string_view text)
 {
-    constexpr std::array words = {"",      "NONE",       "NO",         "NOFILTER",    "OFF",
-                                  "FALSE", "0",          "UNFILTERED", "OPEN",        "NA",
-                                  "N/A",   "OHNE",       "KEIN",       "KEINER",      "AUCUN",
-                                  "SANS",  "UVINCLUDED", "REFLECTIVE", "REFLECTANCE", "REFLECTION",
-                                  "SPOT",  "SCAN",       "STRIP"};
+    constexpr std::array words = {"", "NONE", "NO", "NOFILTER", "OFF", "FALSE", "0", "UNFILTERED",
+                                  "OPEN", "NA", "N/A", "OHNE", "KEIN", "KEINER", "AUCUN", "SANS",
+                                  "UVINCLUDED", "REFLECTIVE", "REFLECTANCE", "REFLECTION", "SPOT",
+                                  "SCAN", "STRIP",
+                                  // filters of a density, and their status
+                                  "V", "VISUAL", "C", "CYAN", "M", "MAGENTA", "Y", "YELLOW", "K",
+                                  "BLACK", "RED", "GREEN", "BLUE", "A", "E", "I", "T", "AUTO", "-"};
     return std::find(words.begin(), words.end(), letters(text)) != words.end();
 }
 
@@ -121,36 +118,38 @@ bool affirms(std::string_view text)
 
 } // namespace
 
-Condition Header::condition_told(std::string_view text)
+Condition Header::condition_told(std::string_view text, std::string_view key)
 {
+    if (affirms(text) && (key.starts_with("POL") || contains(key, "UV")))
+        return key.starts_with("POL") ? 3 : 2;
     const Condition named = condition_of_filter(text);
+    if (contains(key, "ILLUMINATION"))
+        return named; // its other words are of light sources
     if (!named && !tells_no_filter(text) && !upper(text).starts_with("STATUS"))
         unknown_filter = text;
     return named;
 }
 
-// A later table may name another condition; two keywords of one header contradict each other.
+// A later table may name another condition; two texts of one header contradict each other.
 void Header::keep_condition(const std::string &key, std::string_view value)
 {
     if (key == "ENDDATA")
-        condition_key.clear();
+        named_condition = false;
     const bool polarisation = key.starts_with("POLARI");
-    const bool filter = contains(key, "FILTER");
     if (!polarisation && !names_condition(key))
         return;
     const std::string_view text = trimmed(value);
-    const Condition named = polarisation && affirms(text) ? Condition(3)
-                            : filter || polarisation      ? condition_told(text)
-                            : contains(key, "CONDITION")  ? condition_of_filter(text)
-                                                          : condition_in(value);
+    const Condition named = polarisation || contains(key, "FILTER") ? condition_told(text, key)
+                            : contains(key, "CONDITION")            ? condition_of_filter(text)
+                                                                    : condition_in(value);
     if (!named)
         return;
-    if (condition && condition != named && !condition_key.empty() && condition_key != key) {
+    if (condition && condition != named && named_condition) {
         other_condition = text;
         return;
     }
     condition = named;
-    condition_key = key;
+    named_condition = true;
 }
 
 void Header::take(std::string_view keyword, std::string_view value)
@@ -184,6 +183,13 @@ void Header::take(std::string_view keyword, std::string_view value)
     if (key == "QUANTITY" || key == "MEASTYPE" || key == "MEASUREMENTTYPE")
         keep(quantity, upper(value));
 
+    if (const std::string_view text = trimmed(value); !text.empty() && text != "-") {
+        const bool of_backing = contains(key, "BACKING");
+        if (of_backing || contains(key, "GEOMETR")) {
+            (of_backing ? backing : geometry) = printable(text);
+            ++setups_told;
+        }
+    }
     keep_condition(key, value);
     if (names_condition(key) && condition_in(value))
         return;
@@ -219,6 +225,13 @@ void Header::keep_observer(std::string_view value)
         observer = stated;
     else if (observer_in(stated) && observer_in(stated) != observer_in(observer))
         other_observer = stated;
+}
+
+std::string Header::setup() const
+{
+    return fmt::format("{}{}{}{}{}", backing.empty() ? "" : "Backing ", backing,
+                       backing.empty() || geometry.empty() ? "" : "; ",
+                       geometry.empty() ? "" : "Geometry ", geometry);
 }
 
 bool Header::transmission() const { return contains(quantity, "TRANSMI"); }

@@ -3,6 +3,7 @@
 
 #include "read/measurement.h"
 
+#include <cstddef>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -26,11 +27,17 @@ struct Header {
     Condition condition;                          // the one that was named last
     std::string other_condition;                  // and one under another keyword
     std::string unknown_filter;
+    std::string backing, geometry; // the last that were named
+    std::size_t setups_told = 0;   // how often one of them was
 
-    // condition_of_filter(); what tells neither a condition nor that there is no filter is kept.
-    Condition condition_told(std::string_view text);
+    // The condition that a text tells under a key such as FILTER, POLARIZATION or MODE; what tells
+    // neither a condition nor that there is no filter is kept.
+    Condition condition_told(std::string_view text, std::string_view key = {});
 
-    // The first to say something is believed, but for the condition.
+    // "Backing black; Geometry 45/0", what is known of it.
+    std::string setup() const;
+
+    // The first to say something is believed, but for the condition, backing and geometry.
     void take(std::string_view keyword, std::string_view value);
 
     bool transmission() const;
@@ -45,7 +52,7 @@ private:
     void keep_illuminant(std::string_view value);
     void keep_observer(std::string_view value);
 
-    std::string condition_key; // that named the condition
+    bool named_condition = false; // in this header, which may be of one table
 };
 
 } // namespace vantrel::sheets

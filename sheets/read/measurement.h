@@ -40,6 +40,7 @@ struct Source {
     bool scaled = false;       // not in percent there
     std::string scale_by; // what told the scale: a keyword, the kind of file, "values" or "--scale"
     std::string condition; // M0 to M3 (ISO 13655), empty where the file does not say
+    std::string setup;     // backing and geometry, in the words of the file
 };
 
 // What colours were computed for, by the file.

@@ -99,7 +99,7 @@ void Sheet::add(Patch patch, Condition condition, std::size_t line, std::size_t 
 
 std::size_t Sheet::setup_number(const std::string &setup)
 {
-    const auto [at, added] = setup_numbers.try_emplace(setup, told_setups.size());
+    const auto [at, added] = setup_numbers.try_emplace(upper(setup), told_setups.size());
     if (added)
         told_setups.push_back(setup);
     return at->second;
@@ -156,6 +156,7 @@ void Sheet::choose_condition()
 void Sheet::choose_setup()
 {
     const std::size_t chosen = setups.front();
+    origin.setup = told_setups[chosen];
     const auto other = std::find_if(setups.begin(), setups.end(),
                                     [=](std::size_t setup) { return setup != chosen; });
     if (other == setups.end())
@@ -184,11 +185,14 @@ void Sheet::leave_out(std::string_view statistic, std::size_t line)
 // all patches above have some.
 void Sheet::leave_out_statistics()
 {
+    constexpr std::ptrdiff_t kRowsOfStatistics = 12; // at the end, under any name
     std::vector<std::pair<Patch *, Statistic>> rows;
     std::vector<const Patch *> others;
     for (Patch &patch : patches) {
-        const auto by_name = statistic_named(patch.name);
-        const auto statistic = by_name ? by_name : statistic_named(patch.id);
+        auto statistic = statistic_named(patch.name);
+        statistic = statistic ? statistic : statistic_named(patch.id);
+        if (!statistic && patches.data() + patches.size() - &patch <= kRowsOfStatistics)
+            statistic = statistic_in_words_of(patch.name);
         if (statistic)
             rows.emplace_back(&patch, *statistic);
         else
@@ -204,15 +208,24 @@ void Sheet::leave_out_statistics()
     std::vector<bool> is_out(patches.size());
     const Patch *kept = nullptr; // the first
     std::size_t count = 0;
-    for (const auto &[row, statistic] : rows)
-        if ((devices && row->device.empty() && row->line > last) ||
-            statistics.holds(statistic, *row)) {
-            leave_out(row->name.empty() ? row->id : row->name, row->line);
-            is_out[static_cast<std::size_t>(row - patches.data())] = true;
-        } else {
+    for (const auto &[row, statistic] : rows) {
+        const std::string name = row->name.empty() ? row->id : row->name;
+        const bool named = statistic_named(name).has_value();
+        const bool holds = statistics.holds(statistic, *row);
+        const bool by_place = named && devices && row->device.empty() && row->line > last;
+        if (holds) {
+            leave_out(name, row->line);
+        } else if (by_place) {
+            warn(row->line,
+                 fmt::format("{} left out: named as a statistic and without the device values that "
+                             "all patches have, though it is none of the other rows",
+                             in_quotes(name)));
+        } else if (named) {
             kept = kept ? kept : row;
             ++count;
         }
+        is_out[static_cast<std::size_t>(row - patches.data())] = holds || by_place;
+    }
     if (kept)
         warn(kept->line,
              fmt::format("{} is named as a statistic, but is none of the other rows{}: read as a "

@@ -26,6 +26,9 @@ constexpr std::array words = {Word{"AVERAGE", Statistic::mean},
                               Word{"DURCHSCHNITT", Statistic::mean},
                               Word{"MOYENNE", Statistic::mean},
                               Word{"Ø", Statistic::mean},
+                              Word{"MEDIA", Statistic::mean},
+                              Word{"PROMEDIO", Statistic::mean},
+                              Word{"MW", Statistic::mean},
                               Word{"MEDIAN", Statistic::median},
                               Word{"MEDIANE", Statistic::median},
                               Word{"MéDIANE", Statistic::median},
@@ -102,7 +105,7 @@ double last_place(const std::vector<double> &values)
 
 std::optional<Statistic> statistic_named(std::string_view text)
 {
-    constexpr std::string_view beginnings = "ACDEMRSTacdemrst\xc3"; // with É and Ø
+    constexpr std::string_view beginnings = "ACDEMPRSTacdemprst\xc3"; // with É and Ø
     if (text.empty() || text.size() > kLongest ||
         beginnings.find(text[0]) == std::string_view::npos)
         return std::nullopt;
@@ -111,6 +114,18 @@ std::optional<Statistic> statistic_named(std::string_view text)
     const auto *const word =
         std::find_if(words.begin(), words.end(), [&](const Word &it) { return it.key == key; });
     return word == words.end() ? std::nullopt : std::optional(word->statistic);
+}
+
+std::optional<Statistic> statistic_in_words_of(std::string_view text)
+{
+    constexpr std::string_view between = " _-()=:,";
+    while (!text.empty()) {
+        const std::string_view word = text.substr(0, text.find_first_of(between));
+        if (const auto statistic = statistic_named(word))
+            return statistic;
+        text.remove_prefix(std::min(word.size() + 1, text.size()));
+    }
+    return std::nullopt;
 }
 
 std::vector<double> Statistics::values_of(const Patch &patch) const

@@ -17,6 +17,9 @@ enum class Statistic { mean, median, least, most, range, deviation, sum, count }
 // The statistic that a text names as a whole: "Average", "Std. Dev.", "Mittelwert".
 std::optional<Statistic> statistic_named(std::string_view text);
 
+// That of any of its words: "Mean of 20", "AVG_ALL".
+std::optional<Statistic> statistic_in_words_of(std::string_view text);
+
 // Whether rows are statistics of patches, to the last place of what they are written with.
 class Statistics {
 public:

@@ -159,7 +159,7 @@ bool has_colours(const std::vector<std::string> &fields)
 }
 
 Table::Table(Sheet &sheet, std::vector<std::string> names, std::size_t line)
-    : fields(std::move(names)), sheet(sheet)
+    : fields(std::move(names)), sheet(sheet), method(keys_of(fields))
 {
     const std::vector<std::string> keys = keys_of(fields);
     find_colours(keys);
@@ -171,8 +171,6 @@ Table::Table(Sheet &sheet, std::vector<std::string> names, std::size_t line)
     id = column_of(keys, {"SAMPLEID", "ID", "PATCHID", "SAMPLENO", "PATCHNO", "NUMBER", "NO"});
     name = column_of(keys, {"SAMPLENAME", "NAME", "PATCHNAME", "PATCH", "SAMPLE", "LABEL",
                             "SAMPLELOC", "SAMPLELOCATION", "LOCATION"});
-    condition = column_of(keys, {"MEASUREMENTCONDITION", "CONDITION", "MEASUREMENTMODE", "MEASMODE",
-                                 "TESTMODE", "MODE"});
     ink = column_of(keys, {"INK", "INKNAME", "COLORANT", "COLOURANT"});
     tint = column_of(keys, {"TINT", "TINTPCT", "TINT%", "TINTVALUE", "TONEVALUE", "NOMINAL"});
     find_devices(keys, line);
@@ -182,7 +180,9 @@ Table::Table(Sheet &sheet, std::vector<std::string> names, std::size_t line)
         name = name == kNone ? ink : name;
         ink = kNone;
     }
-    for (const std::size_t column : {id, name, condition, tint, lab[0], lab[1], lab[2]})
+    std::vector<std::size_t> single = method.all();
+    single.insert(single.end(), {id, name, tint, lab[0], lab[1], lab[2]});
+    for (const std::size_t column : single)
         if (column != kNone)
             if (const auto again = std::find(keys.begin() + static_cast<std::ptrdiff_t>(column) + 1,
                                              keys.end(), keys[column]);
@@ -265,9 +265,9 @@ void Table::find_devices(const std::vector<std::string> &keys, std::size_t line)
 
 bool Table::reads(std::size_t column) const
 {
-    const std::array<std::size_t, 7> single = {id, name, condition, tint, lab[0], lab[1], lab[2]};
+    const std::array<std::size_t, 6> single = {id, name, tint, lab[0], lab[1], lab[2]};
     const auto is_it = [column](std::size_t known) { return known == column; };
-    return std::any_of(single.begin(), single.end(), is_it) ||
+    return method.has(column) || std::any_of(single.begin(), single.end(), is_it) ||
            std::any_of(values.begin(), values.end(), is_it) ||
            std::any_of(at_nm.begin(), at_nm.end(), is_it) ||
            std::any_of(devices.begin(), devices.end(),
@@ -436,7 +436,7 @@ void Table::add(const Row &row, Condition given, std::size_t line)
 
     if (sheet.patches.empty() && id == kNone && name == kNone && ink == kNone)
         for (std::size_t i = 0; i < fields.size() && name == kNone; ++i)
-            if (i != condition && !trimmed(row.values[i]).empty() && !number_in(row.values[i]))
+            if (!method.has(i) && !trimmed(row.values[i]).empty() && !number_in(row.values[i]))
                 name = i; // the first column of words
     patch.id = text_at(row, id);
     patch.name = text_at(row, name);
@@ -449,10 +449,12 @@ void Table::add(const Row &row, Condition given, std::size_t line)
         it.take(row);
     for (SpareBand &it : spare_bands)
         it.take(row, line);
-    const Condition own = condition == kNone
-                              ? std::nullopt
-                              : sheet.header.condition_told(trimmed(row.values[condition]));
-    sheet.add(std::move(patch), own ? own : given, line);
+    const Condition own = method.condition(row, sheet.header);
+    if (method.tell_setup() || setups_told != sheet.header.setups_told) {
+        setup = sheet.setup_number(method.setup(row, sheet.header));
+        setups_told = sheet.header.setups_told;
+    }
+    sheet.add(std::move(patch), own ? own : given, line, setup);
 }
 
 void Table::finish()

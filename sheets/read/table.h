@@ -3,6 +3,7 @@
 
 #include "read/ink_columns.h"
 #include "read/lines.h"
+#include "read/method.h"
 #include "read/sheet.h"
 #include "read/shifts.h"
 
@@ -69,8 +70,10 @@ private:
     bool pairs = false;
     std::vector<double> wavelengths;
     std::vector<double> refl; // of a row, on the file's scale
-    std::size_t id, name, condition, ink, tint;
-    std::array<std::size_t, 3> lab; // L*, a*, b*, or X, Y, Z where the sheet says so
+    std::size_t id, name, ink, tint;
+    MethodColumns method;
+    std::size_t setup = 0, setups_told = 0; // by the header
+    std::array<std::size_t, 3> lab;         // L*, a*, b*, or X, Y, Z where the sheet says so
     std::vector<Device> devices;
     std::vector<DoubtfulColumn> doubtful;
     std::vector<Neighbour> neighbours; // of the columns of wavelengths

@@ -9,6 +9,9 @@
 
 namespace vantrel::sheets {
 
+// Whether a part stands anywhere in a text.
+bool contains(std::string_view text, std::string_view part);
+
 std::string upper(std::string_view text); // ASCII letters only
 bool equal_ignoring_case(std::string_view first, std::string_view second);
 std::string letters(std::string_view field); // SAMPLE_ID, SampleID and Sample Id are one: SAMPLEID
