@@ -221,6 +221,21 @@ def test_settings_travel_with_the_blocks():
     assert np.array_equal(both, [changed, default, changed])
 
 
+def test_settings_of_two_threads_do_not_overlap():
+    before = vantrel.get_hifi_constants()[0].tolist()
+    outer, inner = vantrel.settings(hifi=([480, 560, 620],)), vantrel.settings(hifi=([500, 560, 620],))
+    with ThreadPoolExecutor(1) as other, vantrel.settings():
+        with pytest.raises(RuntimeError, match="another thread is inside"):
+            other.submit(inner.__enter__).result()
+        outer.__enter__()
+        inner = vantrel.settings(hifi=([500, 560, 620],))
+        inner.__enter__()  # as coroutines do, which take turns
+        outer.__exit__(None, None, None)
+        assert vantrel.get_hifi_constants()[0][0] == 500
+        inner.__exit__(None, None, None)
+        assert vantrel.get_hifi_constants()[0].tolist() == before
+
+
 def test_a_centre_takes_its_shape_along():
     with vantrel.settings():
         _, shape, *_ = vantrel.get_hifi_constants()

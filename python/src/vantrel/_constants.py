@@ -1,7 +1,8 @@
 """What can be set, in this process, for all threads."""
 
 import contextlib
-from typing import Any, Callable, Dict
+import threading
+from typing import Any, Callable, Dict, List
 
 import numpy as np
 
@@ -231,12 +232,48 @@ def get_achromatic_constants():
     return _numbers(_ufuncs.get_achromatic_constants, 4)
 
 
+class _Entry:
+    """A settings() that has not been left yet."""
+
+    def __init__(self):
+        self.thread = threading.get_ident()
+        self.before = _ufuncs.get_settings()
+
+
+_entries: List[_Entry] = []  # the first is the outermost
+_entering = threading.Lock()
+
+
+def _enter():
+    with _entering:
+        entry = _Entry()
+        if any(outer.thread != entry.thread for outer in _entries):
+            raise RuntimeError(
+                "settings(): another thread is inside of settings(), and constants hold for all "
+                "threads; enter it once, around the threads"
+            )
+        _entries.append(entry)
+        return entry
+
+
+def _leave(entry):
+    """The one inside of an entry, of coroutines that take turns, restores what was before both."""
+    with _entering:
+        place = _entries.index(entry)
+        del _entries[place]
+        if place == len(_entries):
+            _ufuncs.set_settings(entry.before)
+        else:
+            _entries[place].before = entry.before
+
+
 @contextlib.contextmanager
 def settings(*, hifi=None, hexachrome=None, spectralx=None, achromatic=None):
     """Sets constants for the calls inside of a `with`, and all as they were after it.
 
     They hold for all threads of the process, and for what Dask arrays are asked inside, wherever
-    and whenever it is computed. `den_weight` is restored too.
+    and whenever it is computed. `den_weight` is restored too. One thread at a time is inside; it may
+    enter again.
 
     Parameters
     ----------
@@ -247,6 +284,8 @@ def settings(*, hifi=None, hexachrome=None, spectralx=None, achromatic=None):
     ------
     ValueError
         As the functions that set them.
+    RuntimeError
+        Where another thread is inside.
 
     Examples
     --------
@@ -256,17 +295,17 @@ def settings(*, hifi=None, hexachrome=None, spectralx=None, achromatic=None):
     >>> print(vantrel.refl_to_density(magenta, None, "HIFI", "HIFI2").round(3))
     0.071
     """
-    kept = _ufuncs.get_settings()
     asked: Dict[Callable[..., None], Any] = {
         set_hifi_constants: hifi,
         set_hexachrome_constants: hexachrome,
         set_spectralx_constants: spectralx,
         set_achromatic_constants: achromatic,
     }
+    entry = _enter()
     try:
         for set_constants, values in asked.items():
             if values is not None:
                 set_constants(*values)
         yield
     finally:
-        _ufuncs.set_settings(kept)
+        _leave(entry)
