@@ -153,7 +153,7 @@ def check_line(words, names):
     )
     if words[verb] == "=" or result_wanted:
         if c_name.startswith("Set"):
-            if c_name.startswith("SetH") and any(v is None for v in given):  # they move shapes along
+            if c_name.startswith("SetH"):  # those of the package move shapes along and refuse wrong ones
                 function = getattr(vantrel.ufuncs, function.__name__)
             try:
                 function(*given)

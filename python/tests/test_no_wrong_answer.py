@@ -247,6 +247,27 @@ def test_a_centre_takes_its_shape_along():
         assert now.argmax() == 15 != row.argmax() and now.sum() == row.sum()
 
 
+@pytest.mark.parametrize(
+    "reason, constants",
+    [
+        ("wavelengths: .* not at nan", {"hifi": ([np.nan, 550, 600],)}),
+        ("wavelengths: .* not at 680", {"hifi": ([480, 550, 680],)}),
+        ("wavelengths: .* not at -inf", {"hexachrome": ([480, -np.inf],)}),
+        ("shape2: .* below 0", {"hexachrome": ([480, 620], [1] * 7, [-0.1] + [1] * 6)}),
+        ("shape3: .* finite", {"hifi": ([480, 550, 620], None, None, [np.inf] * 7)}),
+        ("shape1: .* scaled", {"hifi": ([480, 550, 620], [1e-320] * 7)}),
+        ("inner: .* not inf", {"spectralx": (2, 84, 1, np.inf, 0.1)}),
+        ("centre: .* must be 1", {"spectralx": (2, 84, 2, 0.5, 0.1)}),
+        ("C1: .* not nan", {"achromatic": (84, 14, np.nan, 11)}),
+    ],
+)
+def test_wrong_constants_change_nothing(reason, constants):
+    before = vantrel.ufuncs.get_settings()
+    with pytest.raises(ValueError, match=reason), vantrel.settings(**constants):
+        pass
+    assert vantrel.ufuncs.get_settings() == before
+
+
 def test_unrounded_differences():
     first, second = np.array([50, 3.004, 1.006]), np.array([50, 3.006, 1.004])
     delta_h = vantrel.lab_to_dh(first, second, rounded=False)

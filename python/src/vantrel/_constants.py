@@ -27,12 +27,29 @@ def _read(getter, *sizes):
     return tuple(arrays)
 
 
+def _check_centres(centres):
+    for centre in centres:
+        if not 430 <= centre < 680:
+            raise ValueError(f"wavelengths: a centre lies from 430 to below 680 nm, not at {centre:g}")
+
+
+def _check_shape(shape, name):
+    if not np.all(np.isfinite(shape) & (shape >= 0)):
+        raise ValueError(f"{name}: weights are finite and not below 0, unlike {shape}")
+    if np.any(shape) and not 1e-100 < np.max(shape) < 1e100:
+        raise ValueError(f"{name}: {shape} cannot be scaled to weights that sum to 100 000")
+
+
 def _place(setter, getter, wavelengths, shapes):
     """Places bands; the C function would leave the weights where they were without a shape."""
     if wavelengths is None:
         raise ValueError("wavelengths: None is not accepted")
     wavelengths = _doubles(wavelengths, len(shapes), "wavelengths")
+    _check_centres(wavelengths)
     given = [_doubles(shape, 7, name) for name, shape in shapes.items()]
+    for name, shape in zip(shapes, given):
+        if shape is not None:
+            _check_shape(shape, name)
     before, *had = getter()
     setter(wavelengths, *given)
     now = getter()[0]
@@ -46,16 +63,16 @@ def set_hifi_constants(wavelengths, shape1=None, shape2=None, shape3=None):
     Parameters
     ----------
     wavelengths : array_like (3,)
-        Centres in nm, cut to their band; one outside 430 to below 680, or NaN, leaves its band as
-        it was.
+        Centres in nm, from 430 to below 680, cut to their band.
     shape1, shape2, shape3 : array_like (7,), optional
-        Relative weights around each centre in steps of 10 nm; None takes the shape that the band
-        has along to the new centre.
+        Relative weights around each centre in steps of 10 nm, not below 0; None takes the shape that
+        the band has along to the new centre, 0 everywhere takes the filter away.
 
     Raises
     ------
     ValueError
-        Where the shape of an argument is another.
+        Where an argument has another shape, a centre lies elsewhere, or a weight is below 0 or not
+        finite. (The C function leaves such a band as it was.)
 
     Examples
     --------
@@ -97,7 +114,7 @@ def set_hexachrome_constants(wavelengths, shape1=None, shape2=None):
     Raises
     ------
     ValueError
-        Where the shape of an argument is another.
+        As set_hifi_constants().
 
     Examples
     --------
@@ -132,13 +149,13 @@ def _numbers(getter, count):
     return tuple(float(array[0]) for array in _read(getter, *[1] * count))
 
 
-def _set(setter, getter, values, reason):
+def _set(setter, getter, reason, **numbers):
     """Sets single numbers; the library takes all or none, which shows when they are read."""
-    if any(value is None for value in values):
-        raise ValueError("None is not accepted")
-    values = tuple(float(value) for value in values)
-    if not any(np.isnan(values)):
-        setter(*[np.array([value]) for value in values])
+    for name, number in numbers.items():
+        if number is None or not np.isfinite(float(number)):
+            raise ValueError(f"{name}: a finite number is needed, not {number}")
+    values = tuple(map(float, numbers.values()))
+    setter(*[np.array([value]) for value in values])
     if getter() != values:
         raise ValueError(reason)
 
@@ -157,7 +174,7 @@ def set_spectralx_constants(tolerance, reserved, centre, inner, outer):
     Raises
     ------
     ValueError
-        Where the weight of the centre is not 1, or a constant is NaN.
+        Where the weight of the centre is not 1, or a constant is not finite.
 
     Examples
     --------
@@ -169,8 +186,12 @@ def set_spectralx_constants(tolerance, reserved, centre, inner, outer):
     _set(
         _ufuncs.set_spectralx_constants,
         get_spectralx_constants,
-        (tolerance, reserved, centre, inner, outer),
-        "the weight of the centre must be 1, and no constant NaN",
+        "centre: the weight of the centre must be 1",
+        tolerance=tolerance,
+        reserved=reserved,
+        centre=centre,
+        inner=inner,
+        outer=outer,
     )
 
 
@@ -212,8 +233,11 @@ def set_achromatic_constants(L1, L2, C1, C2):
     _set(
         _ufuncs.set_achromatic_constants,
         get_achromatic_constants,
-        (L1, L2, C1, C2),
         "no finite line goes through these points",
+        L1=L1,
+        L2=L2,
+        C1=C1,
+        C2=C2,
     )
 
 
