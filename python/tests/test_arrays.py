@@ -52,7 +52,7 @@ def test_memory_layout_changes_no_bit(lay_out):
     assert vantrel.calculate_special_density(PAPER, 15, wide) == 0
 
 
-@pytest.mark.filterwarnings("ignore:all reflectances are at most")
+@pytest.mark.filterwarnings("ignore:.*reflectances are at most")
 @pytest.mark.parametrize("illum_obs", vantrel.IllumObs)
 def test_many_spectra_have_the_bits_of_one(illum_obs):
     spectra = RANDOM.uniform(-5, 120, (11, 33))[:, 1:32]

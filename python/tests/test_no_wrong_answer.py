@@ -113,19 +113,28 @@ def test_spectra_that_do_not_lie_as_they_should_are_refused(given, reason):
 
 
 def test_fractions_are_warned_of():
-    for call in (
-        lambda: vantrel.refl_to_xyz(SPECTRA / 100),
-        lambda: vantrel.refl_to_xyz((SPECTRA / 100).tolist()),
-        lambda: vantrel.resample(SPECTRA / 100, NM),
+    black, fractions = np.linspace(0.6, 1.4, 31), SPECTRA / 100
+    solid = fractions[0]
+    for names, call in (
+        ("spectra", lambda: vantrel.refl_to_xyz(fractions)),
+        ("spectra", lambda: vantrel.refl_to_xyz(fractions.tolist())),
+        ("values", lambda: vantrel.resample(fractions, NM)),
+        ("spectra", lambda: vantrel.refl_to_density(black, None, "E", 1)),
+        ("spectra", lambda: vantrel.refl_to_density(fractions, PAPER, "E", 1)),
+        ("paper", lambda: vantrel.refl_to_density(da.from_array(SPECTRA, chunks=3), PAPER / 100, "E", 1)),
+        ("paper", lambda: vantrel.refl_to_density(SPECTRA[0], PAPER / 100, "E", 1)),
+        ("solid", lambda: vantrel.refl_to_dot_area(solid, PAPER / 2, PAPER, "E", "GREEN", 1.0)),
+        ("spectra1, spectra2", lambda: vantrel.combine_ink_colors(black, black)),
     ):
-        with pytest.warns(UserWarning, match="multiply fractions by 100") as caught:
-            call()
-        assert caught[0].filename == __file__
+        for _ in range(2):
+            with pytest.warns(UserWarning, match=f"^{names}: .*multiply fractions by 100") as caught:
+                call()
+            assert caught[0].filename == __file__
     with warnings.catch_warnings():
         warnings.simplefilter("error")
         vantrel.refl_to_xyz(np.zeros(31))
-        vantrel.refl_to_density(SPECTRA / 100, PAPER, "E", 1)
-        vantrel.refl_to_density(da.from_array(SPECTRA, chunks=3), PAPER / 100, "E", 1)
+        vantrel.refl_to_density(black, PAPER, "E", 1)
+        vantrel.refl_to_density([black, black], PAPER, "E", 1)
 
 
 def test_any_name_of_a_dimension_will_do():

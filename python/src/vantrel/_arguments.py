@@ -78,13 +78,33 @@ def _reaches(values):
     return any(np.any(v > FRACTION) for v in (*some, values)) or not np.any(values > 0)
 
 
+def _has_colour(values):
+    """Whether a spectrum is neither flat nor next to nothing, as fractions of a colour are."""
+    high = values.max(-1)
+    return np.any((high > 0.3) & (values.min(-1) < high / 4))
+
+
+def look_like_fractions(values, name):
+    """Whether the spectra of an argument do, whatever the others are: paper is never so dark, and
+    what is as dark in percent is black."""
+    if values.size == BANDS:  # of one spectrum, without the overhead of NumPy
+        reads = values.ravel().tolist()
+        high = max(reads)
+        return 0 < high <= FRACTION and (name == "paper" or 0.3 < high > 4 * min(reads))
+    return not _reaches(values) and bool(name == "paper" or _has_colour(values))
+
+
 def warn_of_fractions(spectra, level):
-    """Where all spectra of a call look like fractions of 1."""
-    known = [np.asarray(s) for s in spectra if s is not MISSING and not is_lazy(s)]
-    if len(known) == len(spectra) and known and not any(map(_reaches, known)):
+    """Where the spectra of an argument look like fractions of 1, or all of a call are so small."""
+    given = {name: s for name, s in spectra.items() if s is not MISSING}
+    known = {name: np.asarray(s) for name, s in given.items() if not is_lazy(s)}
+    wrong = [name for name, values in known.items() if look_like_fractions(values, name)]
+    if len(known) == len(given) and not any(map(_reaches, known.values())):
+        wrong = list(known)
+    if wrong:
         warnings.warn(
-            f"all reflectances are at most {FRACTION}: they are in percent here; multiply "
-            "fractions by 100",
+            f"{', '.join(wrong)}: all reflectances are at most {FRACTION}: they are in percent here; "
+            "multiply fractions by 100",
             stacklevel=level,
         )
 

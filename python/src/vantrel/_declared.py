@@ -14,6 +14,7 @@ from ._arguments import (
     convert,
     is_lazy,
     is_spectral,
+    look_like_fractions,
     warn_of_fractions,
 )
 from ._enums import IllumObs, Response, Status
@@ -101,7 +102,8 @@ class Declared:
                     check_reading(values[i], values[j], self.names[j])
                 check_filter(values[i], values[j], is_reading, self.names[j])
         if any(self.spectral):
-            warn_of_fractions([v for v, s in zip(values, self.spectral) if s], 4)
+            triples = zip(self.names, values, self.spectral)
+            warn_of_fractions({name: v for name, v, spectral in triples if spectral}, 4)
         return values
 
     def prepare_again(self, args):
@@ -112,14 +114,17 @@ class Declared:
         if len(args) > len(self.names):
             return None
         key, percent = [], self.without_spectra
-        for value, last, spectral in zip(args, self.last, self.spectral):
+        for value, last, spectral, name in zip(args, self.last, self.spectral, self.names):
             kind = type(value)
             if kind is np.ndarray:
                 shape = value.shape
                 if value.dtype is not _DOUBLE or shape != last and shape[-1:] != last:
                     return None
-                if spectral and not percent and 0 not in shape:
-                    percent = value.item(0) > FRACTION or value.item(-1) > FRACTION
+                if spectral and 0 not in shape:
+                    if value.item(0) > FRACTION or value.item(-1) > FRACTION:
+                        percent = True
+                    elif look_like_fractions(value, name):
+                        return None
                 key.append(_HANDED_ON)
             elif kind is str or kind is int or value is None:
                 key.append(value)

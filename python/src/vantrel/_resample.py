@@ -40,5 +40,5 @@ def resample(values, wavelengths):
     """
     array = as_array(values, "values")
     array = to_bands(array if hasattr(array, "shape") else np.asarray(array), wavelengths, "values")
-    warn_of_fractions([array], 3)
+    warn_of_fractions({"values": array}, 3)
     return array
