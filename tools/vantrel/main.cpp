@@ -15,6 +15,7 @@
 #include <exception>
 #include <new>
 #include <sstream>
+#include <string_view>
 
 using namespace vantrel::program;
 
@@ -22,9 +23,23 @@ namespace {
 
 enum ExitStatus { done = 0, out_of_tolerance = 1, refused = 2, not_written = 3 };
 
+// An empty value, such as a script's variable that was never set, would switch off what it is for.
+void refuse_empty(int count, char **words)
+{
+    for (int i = 1; i < count; ++i) {
+        const std::string_view word = words[i];
+        if (word.starts_with("--") && word.ends_with('='))
+            throw RequestError{
+                fmt::format("{}: its value is empty", printable(word.substr(0, word.size() - 1)))};
+        if (word.empty() && i > 1)
+            throw RequestError{fmt::format("the word after {} is empty", in_quotes(words[i - 1]))};
+    }
+}
+
 // Reads the command line and carries it out.
 Outcome run(CLI::App &app, int count, char **words)
 {
+    refuse_empty(count, words);
     app.require_subcommand(1);
     app.set_version_flag("--version", VANTREL_VERSION);
     const Command commands[] = {add_report(app),  add_compare(app), add_run(app),
