@@ -93,8 +93,11 @@ int main(int count, char **words)
     int i, files = count - 3;
     for (i = 0; i < files && i < most; ++i)
         sheets[i] = open_file(words[3 + i]);
-    if (!strcmp(command, "nulls"))
-        return say_nulls(sheets[0]);
+    if (!strcmp(command, "nulls")) {
+        i = say_nulls(sheets[0]);
+        vantrel_close(sheets[0]);
+        return i;
+    }
     if (!strcmp(command, "spectra"))
         sheets[0] = from_memory(sheets[0], words[3]);
     answer =
