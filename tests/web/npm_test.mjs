@@ -138,13 +138,15 @@ test('in Chromium the same calls give the same', async () => {
 });
 
 test('rows are what single calls are', () => {
-  const lab = Float64Array.from({ length: 300 }, (_, i) => (i * 37) % 91);
-  const first = lab.subarray(0, 150);
-  const second = lab.subarray(150);
-  const rows = vantrel.labToDE2000(first, second, 1, 1);
-  assert.equal(rows.length, 50);
-  rows.forEach((value, i) => assert.equal(value,
-    vantrel.labToDE2000(first.subarray(i * 3, i * 3 + 3), second.subarray(i * 3, i * 3 + 3), 1, 1)));
+  const lab = Float64Array.from({ length: 306 }, (_, i) => (i * 37) % 91);
+  const first = lab.subarray(0, 153);
+  const second = lab.subarray(153);
+  const one = (values, i) => values.subarray(i * 3, i * 3 + 3);
+  for (const aims of [second, one(second, 7)]) {
+    const rows = vantrel.labToDE2000(first, aims, 2, 0.7);
+    assert.deepEqual(rows, Float64Array.from({ length: 51 }, (_, i) =>
+      vantrel.labToDE2000(one(first, i), aims.length > 3 ? one(aims, i) : aims, 2, 0.7)));
+  }
   assert.deepEqual(vantrel.densityToDotArea(1.5, [0.3, 0.7], 1)[1], vantrel.densityToDotArea(1.5, 0.7, 1));
   assert.throws(() => vantrel.labToDE2000(first, second.subarray(3), 1, 1), /equally many rows, or of one/);
   assert.throws(() => vantrel.reflToCIELAB(lab, 'D50_2DEG'), /reflToCIELAB\(\) takes rows of 31 numbers/);

@@ -103,7 +103,9 @@ export function functionsOf(wasm, table, constants) {
     const outputs = args.map((argument, i) => [argument, at[i].begin])
       .filter(([{ kind }]) => kind === 'output');
     const returned = new Float64Array(outputs.length ? 0 : rows);
-    for (let i = 0; i < rows; ++i) {
+    const atOnce = rows > 1 && !at.some(({ values }) => values) ? wasm[`${symbol}Rows`] : undefined; // of few functions
+    atOnce?.(...args.flatMap(({ kind }, i) => (kind === 'array' ? [at[i].begin, at[i].step] : at[i].begin)), rows);
+    for (let i = 0; !atOnce && i < rows; ++i) {
       const result = call(wasm[symbol], at, i);
       if (!outputs.length) returned[i] = result;
       else if (succeeds && !result)
