@@ -137,6 +137,19 @@ def test_fractions_are_warned_of():
         vantrel.refl_to_density([black, black], PAPER, "E", 1)
 
 
+def test_whole_numbers_that_an_int_does_not_hold_have_no_result():
+    percent = np.array([50, 2**32 + 50, -(2**40), 0])
+    for call in (
+        lambda percent: vantrel.estimate_refls_for_tint_color(SPECTRA[0], percent, PAPER, ok=True),
+        lambda percent: vantrel.estimate_refls(SPECTRA[:1], percent[..., None], PAPER, ok=True),
+        lambda percent: vantrel.refl_to_dot_gain(*SPECTRA[:2], PAPER, "E", "GREEN", 1.0, percent, ok=True),
+    ):
+        refl, ok = call(percent)
+        assert ok.tolist() == [True, False, False, True]
+        assert np.isnan(refl.reshape(4, -1)).all(-1).tolist() == [False, True, True, False]
+        assert np.isnan(call(percent[1])[0]).all() and not call(percent[1])[1]
+
+
 def test_any_name_of_a_dimension_will_do():
     image = SPECTRA.reshape(2, 3, 31)
     expected = vantrel.refl_to_density(image, PAPER, [["E"], ["T"]], "GREEN")

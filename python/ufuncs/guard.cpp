@@ -14,7 +14,8 @@ constexpr npy_intp kTogether = 64;
 constexpr npy_intp kFinite = 1024;
 
 struct Rows {
-    std::bitset<kTogether> unknown, infinite; ///< those with a not-a-number, with an infinity
+    /// Those with a not-a-number, or a whole number that an int does not hold; with an infinity.
+    std::bitset<kTogether> unknown, infinite;
     bool any = false;
 };
 
@@ -33,6 +34,16 @@ void look_at(const Guard &guard, Operand operand, npy_intp rows, Rows &found)
             found.unknown[n] = found.unknown[n] || std::isnan(x);
             found.infinite[n] = found.infinite[n] || std::isinf(x);
             found.any = found.any || !std::isfinite(x);
+        });
+}
+
+void look_at_whole_numbers(Operand operand, npy_intp rows, Rows &found)
+{
+    for (npy_intp n = 0; n < rows; ++n, operand.row += operand.step)
+        operand.each([&](npy_intp, const char *value) {
+            const npy_int64 i = *reinterpret_cast<const npy_int64 *>(value);
+            found.unknown[n] = found.unknown[n] || i != saturated(i);
+            found.any = found.any || i != saturated(i);
         });
 }
 
@@ -96,6 +107,8 @@ public:
             for (int i = 0; i < guard.inputs; ++i)
                 if (guard.types[i] == NPY_DOUBLE)
                     look_at(guard, operand(i), sizes[0], found);
+                else
+                    look_at_whole_numbers(operand(i), sizes[0], found);
             if (done == Done::nothing)
                 guard.loop(at, sizes, steps, &guard.layout);
             if (found.any)

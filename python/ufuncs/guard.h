@@ -17,6 +17,6 @@ struct Guard {
     std::string types = {};  ///< of every operand
 };
 
-/// A row with a not-a-number among its inputs is missing in every output, and so is one with an
-/// infinity that would give a finite result. `data` is the Guard.
+/// A row with a not-a-number among its inputs, or a whole number beyond an int, is missing in every
+/// output, and so is one with an infinity that would give a finite result. `data` is the Guard.
 void guarded(char **rows, const npy_intp *dimensions, const npy_intp *steps, void *data);

@@ -84,7 +84,8 @@ template <class Element> constexpr Element refused()
         return static_cast<Element>(-1);
 }
 
-/// A number handed over by value. Integers are 64 bits wide in NumPy and saturate.
+/// A number handed over by value. Integers are 64 bits wide in NumPy; rows with others than
+/// an int holds get no result.
 template <class P> struct Argument : Operand {
     static_assert(std::is_arithmetic_v<P> || std::is_enum_v<P>);
     static constexpr bool operand = true, output = false;
