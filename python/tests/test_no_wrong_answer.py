@@ -99,6 +99,7 @@ SQUARE = np.resize(SPECTRA, (31, 31))
         (xr.DataArray(SQUARE, {"wl": ("f", NM)}, ("f", "patch")), "along 'f'.*transpose"),
         (xr.DataArray(SPECTRA[:, :16], {"nm": NM[:16] * 2 - 400}, ("p", "nm")), "between 400 and 4"),
         (pd.DataFrame(SPECTRA, columns=NM - 5), "at 395 and 405"),
+        (pd.DataFrame(SPECTRA, columns=NM / 1e3), "in nm: multiply those in µm by 1000"),
         (pd.DataFrame(np.resize(SPECTRA, (2, 32)), columns=np.arange(395, 706, 10)), "at 395 and 405"),
         (pd.DataFrame(np.resize(SPECTRA, (2, 46)), columns=[*range(400, 550, 5), *NM[15:]]), "5 to 10"),
         (da.from_array(np.ma.masked_greater(SPECTRA, 90), chunks=3), "masked"),

@@ -403,7 +403,7 @@ def test_what_is_written_over_stays_whole(sheet, tmp_path, monkeypatch):
             vantrel.report(measured).write(written)
     assert written.read_text() == "old"
     unreadable = replace(sheet, spectra=np.where(np.arange(31)[:, None] == 2, np.nan, sheet.spectra))
-    with pytest.raises(ValueError, match=f"{sheet.names[2]!r} holds what is no number"):
+    with pytest.raises(ValueError, match=f"{sheet.names[2]!r} holds not-a-number at"):
         unreadable.write(written)
     measured.write(written)
     assert written.stat().st_mode & 0o777 == 0o640 and np.array_equal(vantrel.read(written).spectra, sheet.spectra)
@@ -486,9 +486,11 @@ def test_a_sheet_shows_what_it_is(sheet):
         (lambda s: vantrel.compare(s, s, formula=["de2000"] * 2), "named twice"),
         (lambda s: vantrel.compare(s, s, tolerances=EXAMPLE), "examples/two_ink_halftone.txt:1: "),
         (lambda s: vantrel.predict(s, inks={"CMYK_M": 40.5}), "whole percentage"),
+        (lambda s: vantrel.predict(s, inks={"CMYK_M": np.nan}), "inks: of 'CMYK_M' .* not nan"),
         (lambda s: vantrel.predict(replace(s, device={})), "name inks with inks="),
         (lambda s: vantrel.report(replace(s, spectra=s.spectra[:, :30])), "spectra: the shape"),
-        (lambda s: vantrel.report(replace(s, spectra=s.spectra * np.nan)), "spectra: numbers"),
+        (lambda s: vantrel.report(replace(s, spectra=np.where(s.spectra == s["Yellow 20"][3], np.nan, s.spectra))),
+         "spectra: 'Yellow 20' holds not-a-number at 430 nm"),
         (lambda s: vantrel.report(replace(s, ids=[])), "31 names, 0 ids"),
         (lambda s: vantrel.compare(s, s, tolerance=np.nan), "an argument is not finite"),
         (lambda s: vantrel.report(replace(s, spectra=None, kind="colours")), "neither spectra nor lab"),

@@ -7,9 +7,53 @@ from typing import Any, Callable, Dict, List
 import numpy as np
 
 from . import _ufuncs
-from ._ufuncs import get_num_illuminant_observers, get_num_responses, get_num_statuses  # noqa: F401
 
 den_weight = _ufuncs.den_weight
+
+
+def get_num_illuminant_observers():
+    """How many combinations of illuminant and observer there are.
+
+    Returns
+    -------
+    count : int
+
+    Examples
+    --------
+    >>> vantrel.get_num_illuminant_observers() == len(vantrel.IllumObs)
+    True
+    """
+    return _ufuncs.get_num_illuminant_observers()
+
+
+def get_num_statuses():
+    """How many density statuses there are.
+
+    Returns
+    -------
+    count : int
+
+    Examples
+    --------
+    >>> vantrel.get_num_statuses() == len(vantrel.Status)
+    True
+    """
+    return _ufuncs.get_num_statuses()
+
+
+def get_num_responses():
+    """How many density responses there are.
+
+    Returns
+    -------
+    count : int
+
+    Examples
+    --------
+    >>> vantrel.get_num_responses() == len(vantrel.Response)
+    True
+    """
+    return _ufuncs.get_num_responses()
 
 
 def _doubles(value, size, name):

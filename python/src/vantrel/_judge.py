@@ -18,6 +18,7 @@ from ._predictions import Predictions
 from ._results import Comparison, Report
 from ._run import Run
 from ._sheet import Sheet, in_python, read
+from ._wavelengths import NM
 
 Illuminant = Union[
     IllumObs,
@@ -42,12 +43,27 @@ _BRIGHTEST = 200  # percent; papers with much brightener come to 150
 _LARGEST = 1e6  # of reflectances in percent and of colours, as the readers take them
 
 
-def _doubles(values: Any, shape: Tuple[int, ...], name: str, missing: bool = False) -> Any:
+def _doubles(
+    values: Any,
+    shape: Tuple[int, ...],
+    name: str,
+    patches: Sequence[str],
+    columns: Sequence[str] = (),
+    missing: bool = False,
+) -> Any:
+    """Numbers of patches; what is none of these is told with its patch and column."""
     array = np.array(values, dtype=np.float64, order="C")
     if array.shape != shape:
         raise ValueError(f"{name}: the shape {shape} is needed, not {array.shape}")
-    if not np.all((np.abs(array) <= _LARGEST) | (missing & np.isnan(array))):
-        raise ValueError(f"{name}: numbers of at most {_LARGEST:g} are needed")
+    wrong = np.argwhere(~((np.abs(array) <= _LARGEST) | (missing & np.isnan(array))))
+    if len(wrong):
+        row, *column = wrong[0]
+        value = array[tuple(wrong[0])]
+        what = "not-a-number" if np.isnan(value) else f"{value:g}"
+        at = f" at {columns[column[0]]}" if column else ""
+        raise ValueError(
+            f"{name}: {patches[row]!r} holds {what}{at}; numbers of at most {_LARGEST:g} are needed"
+        )
     return array
 
 
@@ -77,16 +93,20 @@ def _fields(sheet: Sheet) -> Dict[str, Any]:
     taken: Dict[str, Any] = {name: getattr(sheet, name) for name in vars(sheet)}
     taken["warnings"] = [*sheet._warnings, *_scale_doubts(sheet)]
     taken["changed"] = sheet._digests() != sheet._of
-    taken["lines"] = _doubles(lines, (patches,), "lines")
+    taken["lines"] = _doubles(lines, (patches,), "lines", sheet.names)
     taken["device"] = {
-        field: _doubles(column, (patches,), field, missing=True)
+        field: _doubles(column, (patches,), field, sheet.names, missing=True)
         for field, column in sheet.device.items()
     }
     if sheet.spectra is not None:
-        taken["spectra"] = _doubles(sheet.spectra, (patches, 31), "spectra")
+        taken["spectra"] = _doubles(
+            sheet.spectra, (patches, 31), "spectra", sheet.names, [f"{nm:g} nm" for nm in NM]
+        )
     taken["lab"] = sheet._own_lab()
     if taken["lab"] is not None:
-        taken["lab"] = _doubles(taken["lab"], (patches, 3), "lab", sheet.kind != "colours")
+        taken["lab"] = _doubles(
+            taken["lab"], (patches, 3), "lab", sheet.names, ("L*", "a*", "b*"), sheet.kind != "colours"
+        )
     taken["origin"] = asdict(sheet.origin)
     taken["source"] = asdict(sheet.source)
     return taken
@@ -371,6 +391,9 @@ def predict(
     options = {**_usual(illuminant, status, paper), "order": _inks(order)}
     if inks is not None:
         pairs: List[Tuple[str, float]] = [*(inks.items() if isinstance(inks, Mapping) else inks)]
+        for name, percent in pairs:
+            if isinstance(percent, (float, np.floating)) and not np.isfinite(percent):
+                raise ValueError(f"inks: of {name!r} a whole percentage is needed, not {percent}")
         options["ink"] = [[name, percent] for name, percent in pairs]
     result: Predictions = _result(Predictions, "predict", [sheet], options)
     return result

@@ -192,8 +192,10 @@ class Sheet:
         if ending not in (".csv", ".txt"):
             raise ValueError(f"file: its name ends in .csv or .txt, not {ending!r}")
         if self.spectra is not None and not np.all(np.isfinite(self.spectra)):
-            row = int(np.argmin(np.isfinite(self.spectra).all(-1)))
-            raise ValueError(f"spectra: {self.names[row]!r} holds what is no number")
+            row, band = np.argwhere(~np.isfinite(self.spectra))[0]
+            value = self.spectra[row, band]
+            what = "not-a-number" if np.isnan(value) else f"{value:g}"
+            raise ValueError(f"spectra: {self.names[row]!r} holds {what} at {NM[band]:g} nm")
         lab = self._own_lab()
         text = csv_text(self, lab) if ending == ".csv" else cgats_text(self, lab)
         lost = self._lost(text, lab)
@@ -361,9 +363,10 @@ def read(
     >>> sheet.spectra.shape, sheet.device["CMYK_M"][:3].tolist()
     ((31, 31), [0.0, 10.0, 20.0])
     """
-    with open(file, "rb") as opened:
+    name = os.fspath(file)  # open() would take the number of an open file too
+    with open(name, "rb") as opened:
         content = opened.read()
-    sheet = _sheet(content, os.fspath(file), scale, condition, 3)
+    sheet = _sheet(content, name, scale, condition, 3)
     return replace(sheet, _read_from=os.path.abspath(file))
 
 

@@ -32,6 +32,14 @@ def _weights(wavelengths):
     return taken, weights[taken]
 
 
+def _unit_hint(nm):
+    """What is to be done with wavelengths in micrometres or metres."""
+    for longest, unit, factor in (2e-6, "m", "1e9"), (2, "µm", "1000"):
+        if 0 < np.max(nm, initial=0) < longest:
+            return f"; wavelengths are in nm: multiply those in {unit} by {factor}"
+    return ""
+
+
 def to_bands(values, wavelengths, name):
     """The bands of an array whose last dimension lies at these wavelengths."""
     nm = np.ascontiguousarray(wavelengths, dtype=np.float64)
@@ -47,7 +55,7 @@ def to_bands(values, wavelengths, name):
         reason = str(error).partition(" in spectra of ")[0]
         raise ValueError(
             f"{name}: {reason}, of {nm.size} wavelengths; every 10 nm from 400 to 700 is needed, or "
-            "finer steps"
+            f"finer steps{_unit_hint(nm)}"
         ) from None
     return values[..., taken] @ weights
 
