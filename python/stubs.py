@@ -36,6 +36,7 @@ class _Other(Protocol):  # an array of Dask or xarray
     def __dask_graph__(self) -> Any: ...
 
 _T = TypeVar("_T")
+_Flags = Annotated[NDArray[np.bool_], "or a flag, for single rows"]
 _OneOrMore = Union[_T, int, Sequence[Union[_T, int, Sequence[Union[_T, int]]]], _SupportsArray]
 _Spectra = ArrayLike
 _Colours = ArrayLike
@@ -110,7 +111,7 @@ def declarations(name, function, decorators=()):
     results = [result_of(*pair) for pair in zip(*declared.result_types(False))]
     if "ok" in signature:
         modes = [(["ok: Literal[False] = False"], results)]
-        modes.append((["ok: Literal[True]"], results + ["Annotated[Any, 'bool or array']"]))
+        modes.append((["ok: Literal[True]"], results + ["_Flags"]))
     else:
         modes = [([], results)]
     first = parameters[0].split(":")[0]

@@ -63,6 +63,7 @@ def test_results_have_the_names_and_the_order_of_the_c_function():
 
 
 RIGHT = """
+import dataclasses
 import numpy as np
 import vantrel
 spectra = np.full((4, 31), 50.0)
@@ -74,6 +75,10 @@ with vantrel.settings(hifi=([480, 560, 620],)):
     vantrel.refl_to_density(spectra, [80.0] * 31, np.array([6]), "HIFI1", ok=False)
 sheet = vantrel.read("sheet.cxf", condition="M1")
 names: list[str] = sheet.names
+lighter = dataclasses.replace(sheet, spectra=1.1 * sheet.spectra[ok], lab=None)
+accepted: list[bool] = ok.tolist()
+brightness: float = round(vantrel.report(sheet).paper.brightness, 1)
+print(vantrel.predict(sheet, inks={"CMYK_M": 35}).predictions[0].calibrated.rgb)
 vantrel.CIEDE2000.calculate(lab, lab)
 report = vantrel.report(sheet, status="T", illuminant=vantrel.IllumObs.D65_2DEG)
 gains: list[float] = [value.dot_gain for curve in report.tone_values for value in curve.values]

@@ -1,9 +1,9 @@
 """What the program predicts of overprints and tints, as objects."""
 
 from dataclasses import dataclass
-from typing import Any, Optional, Tuple
+from typing import Any, Optional, Tuple, Union
 
-from ._result import Result
+from ._result import MaybeNone, Result
 from ._results import Lab, Refl, frame, lab_columns, plain, refl_columns
 
 
@@ -52,7 +52,7 @@ class Prediction:
     inks: Tuple[InkTint, ...]
     halftone: Optional[Estimate]
     film: Optional[Estimate]
-    calibrated: Optional[Estimate]
+    calibrated: Union[Estimate, MaybeNone]
     lacking: Tuple[str, ...]
     measured: Optional[Measured]
 

@@ -9,6 +9,7 @@ from typing import Any, Callable, Dict, Sequence, Union, get_args, get_origin, g
 
 from ._file import write_text
 
+MaybeNone = Any  # beside the type of what is nearly always there: no check for None is asked for
 FORMULAS = ("de2000", "cmc", "de94", "de76")
 
 

@@ -1,9 +1,9 @@
 """What the commands of the program say of sheets, as objects: the numbers of its JSON."""
 
 from dataclasses import dataclass, fields
-from typing import Any, Dict, Optional, Tuple
+from typing import Any, Dict, Optional, Tuple, Union
 
-from ._result import Result
+from ._result import MaybeNone, Result
 from ._wavelengths import NM
 
 Lab = Tuple[float, float, float]
@@ -79,7 +79,7 @@ class PaperReport:
     name: Optional[str]
     chosen: str
     lab: Optional[Lab]
-    brightness: Optional[float]
+    brightness: Union[float, MaybeNone]
     whiteness: Optional[float]
     no_whiteness: Optional[str] = None
     metamerism: Optional[Metamerism] = None

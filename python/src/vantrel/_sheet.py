@@ -15,6 +15,7 @@ from ._colour import refl_to_cielab
 from ._enums import IllumObs
 from ._extension import extension
 from ._file import write_text
+from ._result import MaybeNone
 from ._text import cgats_text, csv_text
 from ._wavelengths import NM
 
@@ -116,11 +117,11 @@ class Sheet:
         Where the patches stand in the file.
     """
 
-    spectra: Optional[NDArray[np.float64]]
+    spectra: Union[NDArray[np.floating[Any]], MaybeNone]
     names: List[str]
     ids: List[str]
-    device: Dict[str, NDArray[np.float64]]
-    lab: Optional[NDArray[np.float64]]
+    device: Dict[str, NDArray[np.floating[Any]]]
+    lab: Union[NDArray[np.floating[Any]], MaybeNone]
     lab_illuminant: Optional[IllumObs]
     lab_stated: str
     kind: str
