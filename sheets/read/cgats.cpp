@@ -253,7 +253,7 @@ void CgatsReader::row(std::string_view text)
 void CgatsReader::end_rows()
 {
     place = Place::header;
-    sheet.header.take("END_DATA", "");
+    sheet.header.end_table(wanted);
     if (wanted) {
         check(field_count, fields.size());
         check(row_count, rows);

@@ -8,6 +8,7 @@
 #include <algorithm>
 #include <array>
 #include <utility>
+#include <vector>
 
 namespace vantrel::sheets {
 namespace {
@@ -74,6 +75,22 @@ Condition condition_in(std::string_view text)
     return std::nullopt;
 }
 
+namespace {
+
+// What a text names as a condition, known or not: M0 to M9.
+std::vector<std::string_view> conditions_in(std::string_view text)
+{
+    std::vector<std::string_view> out;
+    while (!text.empty())
+        if (const std::string_view word = next_word(text); word.size() == 2 &&
+                                                           (word[0] == 'M' || word[0] == 'm') &&
+                                                           word[1] >= '0' && word[1] <= '9')
+            out.push_back(word);
+    return out;
+}
+
+} // namespace
+
 Condition condition_of_filter(std::string_view text)
 {
     if (const Condition named = condition_in(text))
@@ -133,8 +150,6 @@ Condition Header::condition_told(std::string_view text, std::string_view key)
 // A later table may name another condition; two texts of one header contradict each other.
 void Header::keep_condition(const std::string &key, std::string_view value)
 {
-    if (key == "ENDDATA")
-        named_condition = false;
     const bool polarisation = key.starts_with("POLARI");
     if (!polarisation && !names_condition(key))
         return;
@@ -142,6 +157,13 @@ void Header::keep_condition(const std::string &key, std::string_view value)
     const Condition named = polarisation || contains(key, "FILTER") ? condition_told(text, key)
                             : contains(key, "CONDITION")            ? condition_of_filter(text)
                                                                     : condition_in(value);
+    if (contains(key, "CONDITION"))
+        for (const std::string_view word : conditions_in(text)) {
+            if (!condition_in(word))
+                unknown_filter = text;
+            else if (condition_in(word) != named)
+                several_conditions = text;
+        }
     if (!named)
         return;
     if (condition && condition != named && named_condition) {
@@ -209,13 +231,24 @@ void Header::take(std::string_view keyword, std::string_view value)
     }
 }
 
+void Header::end_table(bool read)
+{
+    named_condition = false;
+    has_read = has_read || read;
+}
+
 void Header::keep_illuminant(std::string_view value)
 {
     const std::string stated = printable(trimmed(value));
-    if (illuminant.empty())
+    if (illuminant.empty() && has_read) {
+        if (illuminant_in(stated, 2) != D50_2DEG)
+            later_illuminant = stated;
+    } else if (illuminant.empty()) {
         illuminant = stated;
-    else if (illuminant_in(stated, 2) && illuminant_in(stated, 2) != illuminant_in(illuminant, 2))
+    } else if (illuminant_in(stated, 2) &&
+               illuminant_in(stated, 2) != illuminant_in(illuminant, 2)) {
         other_illuminant = stated;
+    }
 }
 
 void Header::keep_observer(std::string_view value)
@@ -252,7 +285,9 @@ Colours Header::colours() const
     const auto degrees =
         observer.empty() ? observer_in(illuminant).value_or(2) : observer_in(observer);
     if (degrees)
-        out.illuminant = illuminant_in(illuminant, *degrees);
+        out.illuminant = illuminant_in(illuminant.empty() ? "D50" : illuminant, *degrees);
+    if (out.stated.empty())
+        out.illuminant.reset();
     return out;
 }
 

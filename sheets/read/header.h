@@ -24,8 +24,10 @@ struct Header {
     std::string quantity; // what was measured: "REFLECTIVE", "TRANSMITTANCE", "EMISSION"
     std::string illuminant, observer;             // of the file's own colours
     std::string other_illuminant, other_observer; // that the file states too
-    Condition condition;                          // the one that was named last
-    std::string other_condition;                  // and one under another keyword
+    std::string later_illuminant;   // of a later table, where that of the first is not stated
+    Condition condition;            // the one that was named last
+    std::string other_condition;    // and one under another keyword
+    std::string several_conditions; // in one text
     std::string unknown_filter;
     std::string backing, geometry; // the last that were named
     std::size_t setups_told = 0;   // how often one of them was
@@ -40,11 +42,14 @@ struct Header {
     // The first to say something is believed, but for the condition, backing and geometry.
     void take(std::string_view keyword, std::string_view value);
 
+    // What follows is of another table; patches of this one were read or not.
+    void end_table(bool read);
+
     bool transmission() const;
     bool reflection() const;
     bool light() const;
 
-    // Without an observer it is that of 2 degrees (ISO 13655).
+    // Without an observer it is that of 2 degrees, without an illuminant D50 (ISO 13655).
     Colours colours() const;
 
 private:
@@ -53,6 +58,7 @@ private:
     void keep_observer(std::string_view value);
 
     bool named_condition = false; // in this header, which may be of one table
+    bool has_read = false;        // patches of a table before
 };
 
 } // namespace vantrel::sheets

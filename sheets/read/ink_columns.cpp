@@ -134,7 +134,8 @@ DoubtfulColumn::DoubtfulColumn(std::size_t column, std::string_view key)
       named(key.ends_with('%') || key.ends_with("%)") || key.ends_with("%]") ||
             key.ends_with("PCT") || key.find("PERCENT") != std::string_view::npos ||
             key.starts_with("SPOT") || key.starts_with("HEX") ||
-            (key.size() > 2 && key.starts_with("PC") && key[2] >= '0' && key[2] <= '9'))
+            (key.size() > 2 && key.starts_with("PC") && key[2] >= '0' && key[2] <= '9')),
+      nameless(key.empty())
 {
     constexpr std::array beginnings = {
         "LAB",        "CIE",   "LCH",     "XYZ",    "XYY",     "LUV",      "RGB",
@@ -168,6 +169,7 @@ void DoubtfulColumn::take(std::string_view cell)
     }
     whole = whole && *value == std::floor(*value);
     counts = counts && (numbers == 0 || *value == last + 1 || *value == last);
+    steps = steps && (numbers == 0 || *value == last + 1);
     last = *value;
     least = numbers ? std::min(least, *value) : *value;
     most = numbers ? std::max(most, *value) : *value;
@@ -175,10 +177,12 @@ void DoubtfulColumn::take(std::string_view cell)
 }
 
 // Bare paper has 0 of an ink, a sheet of tints alone has a wide range of whole percentages. What
-// ends between 1 and 4 is a density.
+// ends between 1 and 4 is a density. Without a name, what counts the rows is no ink.
 bool DoubtfulColumn::may_be_ink() const
 {
     constexpr double kDensest = 4, kRange = 50;
+    if (nameless && steps)
+        return false;
     const bool percentages = most > kDensest && most <= 255 && (least == 0 || most == 100);
     const bool tints = !counts && whole && most <= 100 && most - least >= kRange;
     const bool fractions = most > 0 && most <= 1 && least == 0;

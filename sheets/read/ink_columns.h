@@ -27,9 +27,11 @@ public:
 private:
     bool named;    // like an ink
     bool measured; // or placed: not by its values
+    bool nameless;
     std::size_t numbers = 0, others = 0;
     double least = 0, most = 0, last = 0;
     bool counts = true; // one after the other
+    bool steps = true;  // by 1 each
     bool whole = true;
 };
 

@@ -355,12 +355,19 @@ Measurement Sheet::measurement()
     if (!header.other_illuminant.empty())
         warn(0, fmt::format("the illuminant is said to be {}, and {} elsewhere: the first is taken",
                             in_quotes(header.illuminant), in_quotes(header.other_illuminant)));
+    if (!header.later_illuminant.empty())
+        warn(0, fmt::format("a later table names the illuminant {}, the first none: D50 is taken "
+                            "for both; --illuminant chooses",
+                            in_quotes(header.later_illuminant)));
     if (!header.other_observer.empty())
         warn(0, fmt::format("the observer is said to be {}, and {} elsewhere: the first is taken",
                             in_quotes(header.observer), in_quotes(header.other_observer)));
     if (!header.other_condition.empty())
         warn(0, fmt::format("the condition is said to be {}, and {} elsewhere: the first is taken",
                             name_of(header.condition), in_quotes(header.other_condition)));
+    if (!header.several_conditions.empty() && header.condition)
+        warn(0, fmt::format("several conditions in {}: {} is taken",
+                            in_quotes(header.several_conditions), name_of(header.condition)));
     if (!header.unknown_filter.empty())
         warn(0, fmt::format("the filter or condition {} tells none that is known here (M0 to M3)",
                             in_quotes(header.unknown_filter)));
