@@ -1,5 +1,6 @@
 #include "read/csv.h"
 
+#include "read/ink_columns.h"
 #include "read/lines.h"
 #include "read/table.h"
 #include "read/text.h"
@@ -163,50 +164,107 @@ public:
 private:
     static constexpr std::size_t kFewest = 14; // 410 to 680 nm in steps of 20 nm
     static constexpr std::size_t kMostDescents = 2;
-    std::string_view names, rows; // the line above the first wavelength, and from there
-    std::size_t line = 0;         // of the names
+    void take_inks(const Row &row, std::size_t line);
+
+    std::string_view above, rows; // the lines before the first wavelength, and from there
     char separator = ',';
+    std::vector<Patch> patches;
+    bool free_names = true; // of all inks
 };
 
 bool Columns::find(std::string_view text)
 {
     for (const char candidate : {';', '\t', ','}) {
         separator = candidate;
-        std::string_view rest = text, above;
-        std::size_t count = 0, at = 0;
+        std::string_view rest = text;
+        std::size_t count = 0;
         double last = 0;
         std::size_t descents = 0;
         while (!rest.empty() && count < kFewest) {
             const std::string_view begin = rest, now = next_line(rest);
             const auto nm = wavelength_at(now, separator);
-            ++at;
             descents += nm && *nm <= last;
             if (!nm || descents > kMostDescents) {
                 count = descents = 0;
-                above = now;
-                line = at;
             } else if (count++ == 0) {
                 rows = begin;
-                names = above;
+                above = text.substr(0, text.size() - begin.size());
             }
             last = nm.value_or(0);
         }
-        if (count == kFewest && !names.empty())
+        if (count == kFewest && !above.empty())
             return true;
     }
     return false;
 }
 
+// Behind the first value.
+bool holds_numbers(const Row &row)
+{
+    return row.values.size() > 1 &&
+           std::all_of(row.values.begin() + 1, row.values.end(),
+                       [](auto value) { return value.empty() || number_in(value); });
+}
+
+// The name of the ink whose percentages a row holds; empty where it holds none.
+std::string ink_in(const Row &row)
+{
+    const std::string head(row.values[0]);
+    if (!holds_numbers(row) || head.empty())
+        return "";
+    return is_standard_device_field(head) ? upper(head) : inks_of({letters(head)})[0];
+}
+
+void Columns::take_inks(const Row &row, std::size_t line)
+{
+    const std::string ink = ink_name(ink_in(row));
+    free_names = free_names && !is_standard_device_field(row.values[0]);
+    for (const Patch &patch : patches)
+        for (const auto &[name, percent] : patch.device)
+            if (name == ink)
+                throw InputError{line, fmt::format("{} occurs twice", in_quotes(row.values[0]))};
+    for (std::size_t i = 0; i < patches.size() && i + 1 < row.values.size(); ++i)
+        if (const auto value = number_in(row.values[i + 1]))
+            patches[i].device.emplace_back(ink, *value);
+}
+
+// The last row above the wavelengths that tells no ink has the names.
 void Columns::read(Sheet &sheet)
 {
     Row row;
-    std::size_t at = line - 1;
-    std::string_view rest = names;
-    if (!next_record(rest, separator, at, row))
+    std::size_t at = 0, line = 0;
+    std::string_view rest = above, names, inks;
+    std::size_t named = 0; // values in the row of names
+    while (!rest.empty()) {
+        std::string_view now = next_line(rest);
+        const std::string_view begin = now;
+        std::size_t lines = 0;
+        ++at;
+        if (next_record(now, separator, lines, row) && (is_blank(row) || !ink_in(row).empty()))
+            continue;
+        if (named == row.values.size() && holds_numbers(row)) {
+            sheet.warn(at, fmt::format("the row of numbers {} above the wavelengths is left out",
+                                       in_quotes(row.values[0])));
+            continue;
+        }
+        names = begin;
+        named = row.values.size();
+        inks = rest;
+        line = at;
+    }
+    if (names.empty())
+        throw InputError{1, "no names of patches above the wavelengths"};
+    const std::size_t first = at;
+    if (!next_record(names, separator, at, row))
         throw InputError{line, "a quoted text is not closed"};
-    std::vector<Patch> patches(row.values.size() - 1);
+    patches.resize(row.values.size() - 1);
     for (std::size_t i = 0; i < patches.size(); ++i)
         patches[i].name = printable(row.values[i + 1]);
+    at = line;
+    while (!inks.empty() && next_record(inks, separator, at, row))
+        if (!is_blank(row) && !ink_in(row).empty())
+            take_inks(row, at);
+    at = first;
     std::vector<double> wavelengths;
     std::vector<std::vector<double>> values(patches.size());
     rest = rows;
@@ -237,6 +295,8 @@ void Columns::read(Sheet &sheet)
         patches[i].refl = bands.of(values[i]);
         sheet.add(std::move(patches[i]), sheet.header.condition, line);
     }
+    if (free_names)
+        sheet.bring_inks_to_percent();
 }
 
 } // namespace

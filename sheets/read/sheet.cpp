@@ -285,6 +285,19 @@ void Sheet::bring_to_percent()
         warn_of_guess(largest);
 }
 
+void Sheet::bring_inks_to_percent()
+{
+    double largest = 0;
+    for (const Patch &patch : patches)
+        for (const auto &[field, value] : patch.device)
+            largest = std::max(largest, value);
+    if (largest > 1)
+        return;
+    for (Patch &patch : patches)
+        for (auto &[field, value] : patch.device)
+            value = std::round(value * 1e8) / 1e6; // 0.07 is 7 %
+}
+
 // Nothing reflects this much: few papers and no inks have an L* above 105.
 void Sheet::warn_of_guess(double largest)
 {

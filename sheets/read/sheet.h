@@ -52,6 +52,9 @@ public:
     const Tell &tell() const { return reading.tell; }
     void warn(std::size_t line, const std::string &text);
 
+    // Where the values of all inks are at most 1.
+    void bring_inks_to_percent();
+
     Header header;
     Kind kind = Kind::reflectance;
     bool collection = false;

@@ -461,15 +461,9 @@ void Table::finish()
 {
     warn_of_shifts();
     warn_of_inks();
+    if (free_names)
+        sheet.bring_inks_to_percent();
     std::vector<Patch> &patches = sheet.patches;
-    double largest = 0;
-    for (const Patch &patch : patches)
-        for (const auto &[field, value] : patch.device)
-            largest = std::max(largest, value);
-    if (free_names && largest <= 1)
-        for (Patch &patch : patches)
-            for (auto &[field, value] : patch.device)
-                value = std::round(value * 1e8) / 1e6; // 0.07 is 7 %
     if (ink == kNone)
         return;
     // where it has no name, a tint is named by its ink and percentage; the bare paper is a tint of
