@@ -17,6 +17,13 @@ import vantrel.plot
 LIBRARY = Path(__file__).resolve().parents[1] / "library"
 PUBLIC = {name: getattr(vantrel, name) for name in vantrel.__all__}
 DRAWING = {name: getattr(vantrel.plot, name) for name in vantrel.plot.__all__}
+CLASSES = (vantrel.Sheet, vantrel.Report, vantrel.Comparison, vantrel.Predictions, vantrel.Ink, vantrel.Run)
+METHODS = {
+    f"{c.__name__}.{name}": getattr(c, name)
+    for c in CLASSES
+    for name in dir(c)
+    if name[0] != "_" and (inspect.isfunction(getattr(c, name)) or isinstance(getattr(c, name), property))
+}
 FUNCTIONS = {name: value for name, value in PUBLIC.items() if inspect.isfunction(value)}
 
 
@@ -32,7 +39,8 @@ def spectra():
 def test_every_example_prints_what_it_says(spectra, monkeypatch, capsys):
     monkeypatch.chdir(LIBRARY)
     matplotlib.use("Agg")
-    documented = [*filter(callable, PUBLIC.values()), *DRAWING.values(), *vars(vantrel.CIEDE2000).values()]
+    documented = [*filter(callable, PUBLIC.values()), *DRAWING.values(), *METHODS.values()]
+    documented += vars(vantrel.CIEDE2000).values()
     runner = doctest.DocTestRunner(optionflags=doctest.NORMALIZE_WHITESPACE, verbose=False)
     with_examples = 0
     for value in documented:
@@ -42,10 +50,11 @@ def test_every_example_prints_what_it_says(spectra, monkeypatch, capsys):
         runner.run(test)
     assert runner.summarize(verbose=False).failed == 0, capsys.readouterr().out
     matplotlib.pyplot.close("all")
-    assert with_examples >= len(FUNCTIONS) + len(DRAWING) + 4
-    for name, function in (FUNCTIONS | DRAWING).items():
-        titles = ["Examples"] if name.startswith("set") else ["Returns", "Examples"]
-        titles += ["Parameters", "Raises"] if inspect.signature(function).parameters else []
+    assert with_examples >= len(FUNCTIONS) + len(DRAWING) + len(METHODS) + 4
+    for name, function in (FUNCTIONS | DRAWING | METHODS).items():
+        returns = not name.startswith("set") and not name.endswith(".write")
+        titles = ["Returns", "Examples"] if returns else ["Examples"]
+        titles += ["Parameters", "Raises"] if {*inspect.signature(function).parameters} - {"self"} else []
         assert all(f"{t}\n{'-' * len(t)}" in inspect.getdoc(function) for t in titles), name
 
 

@@ -72,7 +72,18 @@ class Ink(Result):
     against: Optional[Against] = None
 
     def to_pandas(self) -> Any:
-        """A DataFrame with a row for each status and its densities."""
+        """The answer as a table.
+
+        Returns
+        -------
+        table : pandas.DataFrame
+            A row for each status and its densities.
+
+        Examples
+        --------
+        >>> vantrel.ink(vantrel.read("examples/two_ink_halftone.txt"), "Magenta 100").to_pandas().shape
+        (10, 12)
+        """
         return frame(
             {"status": one.status, "response": one.response, "density": one.density, **one.densities}
             for one in self.statuses

@@ -98,7 +98,19 @@ class Predictions(Result):
     predictions: Tuple[Prediction, ...]
 
     def to_pandas(self) -> Any:
-        """A DataFrame with a row for each prediction and model."""
+        """The answer as a table.
+
+        Returns
+        -------
+        table : pandas.DataFrame
+            A row for each prediction and model.
+
+        Examples
+        --------
+        >>> sheet = vantrel.read("examples/two_ink_halftone.txt")
+        >>> vantrel.predict(sheet, inks={"CMYK_M": 40}).to_pandas().shape
+        (3, 40)
+        """
         return frame(
             {
                 "inks": " + ".join(f"{ink.name} {ink.percent} %" for ink in prediction.inks),

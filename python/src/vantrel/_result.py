@@ -60,18 +60,63 @@ class Result:
         return document
 
     def to_dict(self) -> Dict[str, Any]:
-        """The document as dictionaries and lists."""
+        """The document of `vantrel --format json`.
+
+        Returns
+        -------
+        document : dict
+            Dictionaries, lists and plain values.
+
+        Examples
+        --------
+        >>> report = vantrel.report(vantrel.read("examples/two_ink_halftone.txt"))
+        >>> report.to_dict()["command"]
+        'report'
+        """
         document: Dict[str, Any] = json.loads(self.json)
         return document
 
     def to_html(self) -> str:
-        """The page of `vantrel --format html`: one file with tables and charts."""
+        """The page of `vantrel --format html`: one file with tables and charts.
+
+        Returns
+        -------
+        page : str
+
+        Raises
+        ------
+        ValueError
+            Where the package was built without npm, and has no page.
+
+        Examples
+        --------
+        >>> report = vantrel.report(vantrel.read("examples/two_ink_halftone.txt"))
+        >>> report.to_html()[:15]
+        '<!DOCTYPE html>'
+        """
         return self._answer("html")
 
     def write(self, file: Union[str, "os.PathLike[str]"]) -> None:
         """Writes .json, .html, .csv, or CGATS text as .txt, which the ending of the name chooses.
 
-        The file is replaced as a whole; that of a measurement is refused.
+        The file is replaced as a whole.
+
+        Parameters
+        ----------
+        file : str or path
+
+        Raises
+        ------
+        ValueError
+            Where the name ends otherwise, or the file is one of the measurement's.
+        OSError
+            Where the file cannot be written; what was there stays.
+
+        Examples
+        --------
+        >>> vantrel.report(vantrel.read("examples/two_ink_halftone.txt")).write("report.doc")
+        Traceback (most recent call last):
+        ValueError: file: its name ends in .json, .html, .csv, .txt, not '.doc'
         """
         ending = os.path.splitext(os.fspath(file))[1].lower()
         formats = {".json": "json", ".html": "html", ".csv": "csv", ".txt": "cgats"}

@@ -172,7 +172,18 @@ class Report(Result):
         return body
 
     def to_pandas(self) -> Any:
-        """A DataFrame with a row for each patch."""
+        """The answer as a table.
+
+        Returns
+        -------
+        table : pandas.DataFrame
+            A row for each patch.
+
+        Examples
+        --------
+        >>> vantrel.report(vantrel.read("examples/two_ink_halftone.txt")).to_pandas().shape
+        (31, 52)
+        """
         return frame(
             {
                 **plain(p),
@@ -389,7 +400,21 @@ class Comparison(Result):
     advice_from: Optional[str] = None
 
     def to_pandas(self) -> Any:
-        """A DataFrame with a row for each pair."""
+        """The answer as a table.
+
+        Returns
+        -------
+        table : pandas.DataFrame
+            A row for each pair.
+
+        Examples
+        --------
+        >>> import dataclasses
+        >>> aims = vantrel.read("examples/two_ink_halftone.txt")
+        >>> sheet = dataclasses.replace(aims, spectra=0.98 * aims.spectra, file="sheet")
+        >>> vantrel.compare(aims, sheet).to_pandas().shape
+        (31, 44)
+        """
         return frame(
             {
                 **plain(p, "reference", "sample", "delta_e", "corrected"),

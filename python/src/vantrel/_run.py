@@ -87,7 +87,23 @@ class Run(Result):
     advice_from: Optional[str] = None
 
     def to_pandas(self) -> Any:
-        """A DataFrame with a row for each sheet and a column for each reading."""
+        """The answer as a table.
+
+        Returns
+        -------
+        table : pandas.DataFrame
+            A row for each sheet and a column for each reading.
+
+        Examples
+        --------
+        >>> from dataclasses import replace
+        >>> aims = vantrel.read("examples/two_ink_halftone.txt")
+        >>> dates = [replace(aims.origin, created=f"2026-03-{day}") for day in range(11, 16)]
+        >>> darker = [aims.spectra * np.linspace(1 - i / 99, 1, 31) for i in range(1, 6)]
+        >>> sheets = [replace(aims, spectra=s, origin=date) for s, date in zip(darker, dates)]
+        >>> vantrel.run(sheets, aims).to_pandas().shape
+        (5, 29)
+        """
         columns = {one.title: one.values for one in self.series}
         files = [sheet.file for sheet in self.sheets]
         return frame(

@@ -144,7 +144,26 @@ class Sheet:
         return len(self.names)
 
     def index(self, name: str) -> int:
-        """The place of the first patch of this name, or else of this id; KeyError without one."""
+        """The place of the first patch of this name, or else of this id.
+
+        Parameters
+        ----------
+        name : str
+
+        Returns
+        -------
+        place : int
+
+        Raises
+        ------
+        KeyError
+            Where no patch has this name or id.
+
+        Examples
+        --------
+        >>> vantrel.read("examples/two_ink_halftone.txt").index("Magenta 20")
+        2
+        """
         for labels in self.names, self.ids:
             if name in labels:
                 return labels.index(name)
@@ -158,7 +177,18 @@ class Sheet:
         return spectrum
 
     def to_pandas(self) -> Any:
-        """A DataFrame: id, name, device values, the spectrum by wavelength, L*a*b* of the file."""
+        """The patches as a table.
+
+        Returns
+        -------
+        table : pandas.DataFrame
+            Columns id, name, device values, the spectrum by wavelength, L*a*b* of the file.
+
+        Examples
+        --------
+        >>> vantrel.read("examples/two_ink_halftone.txt").to_pandas().shape
+        (31, 35)
+        """
         import pandas as pd
 
         columns = {"id": self.ids, "name": self.names, **self.device}
@@ -172,7 +202,23 @@ class Sheet:
         return pd.DataFrame(columns)
 
     def to_xarray(self) -> Any:
-        """The spectra as a DataArray over patch and nm, names and device values as coordinates."""
+        """The spectra as a labelled array.
+
+        Returns
+        -------
+        refl : xarray.DataArray
+            Over patch and nm, with names, ids and device values as coordinates.
+
+        Raises
+        ------
+        ValueError
+            Where the file holds colours alone.
+
+        Examples
+        --------
+        >>> vantrel.read("examples/two_ink_halftone.txt").to_xarray().dims
+        ('patch', 'nm')
+        """
         import xarray as xr
 
         if self.spectra is None:
@@ -187,7 +233,25 @@ class Sheet:
         read() gives the same sheet back, to the last digit, as spectra from 400 to 700 nm. What the
         format does not hold is warned of: CSV has no room for the origin, nor to say that the sheet is
         a collection. L*a*b* of the file are left out where the spectra were changed and they were not.
-        The file is replaced as a whole; the one that the sheet was read from is refused.
+        The file is replaced as a whole.
+
+        Parameters
+        ----------
+        file : str or path
+
+        Raises
+        ------
+        ValueError
+            Where the name ends otherwise, a spectrum holds what is no number, or the file is the one
+            that the sheet was read from.
+        OSError
+            Where the file cannot be written; what was there stays.
+
+        Examples
+        --------
+        >>> vantrel.read("examples/two_ink_halftone.txt").write("sheet.doc")
+        Traceback (most recent call last):
+        ValueError: file: its name ends in .csv or .txt, not '.doc'
         """
         ending = os.path.splitext(os.fspath(file))[1].lower()
         if ending not in (".csv", ".txt"):
