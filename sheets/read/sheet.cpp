@@ -1,4 +1,5 @@
 #include "read/sheet.h"
+#include "read/illuminant.h"
 
 #include "read/doubts.h"
 #include "read/statistics.h"
@@ -368,6 +369,10 @@ Measurement Sheet::measurement()
     if (!header.other_illuminant.empty())
         warn(0, fmt::format("the illuminant is said to be {}, and {} elsewhere: the first is taken",
                             in_quotes(header.illuminant), in_quotes(header.other_illuminant)));
+    if (kind == Kind::colours && header.illuminant.empty() && colours.illuminant)
+        warn(0, fmt::format("it does not say for which illuminant its colours are, only the "
+                            "observer; {} is taken",
+                            sheets::name_of(*colours.illuminant)));
     if (!header.later_illuminant.empty())
         warn(0, fmt::format("a later table names the illuminant {}, the first none: D50 is taken "
                             "for both; --illuminant chooses",
