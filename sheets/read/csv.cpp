@@ -8,6 +8,8 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <set>
+#include <string>
 #include <utility>
 
 namespace vantrel::sheets {
@@ -169,6 +171,7 @@ private:
     std::string_view above, rows; // the lines before the first wavelength, and from there
     char separator = ',';
     std::vector<Patch> patches;
+    std::set<std::string> inks;
     bool free_names = true; // of all inks
 };
 
@@ -219,10 +222,8 @@ void Columns::take_inks(const Row &row, std::size_t line)
 {
     const std::string ink = ink_name(ink_in(row));
     free_names = free_names && !is_standard_device_field(row.values[0]);
-    for (const Patch &patch : patches)
-        for (const auto &[name, percent] : patch.device)
-            if (name == ink)
-                throw InputError{line, fmt::format("{} occurs twice", in_quotes(row.values[0]))};
+    if (!inks.insert(ink).second)
+        throw InputError{line, fmt::format("{} occurs twice", in_quotes(row.values[0]))};
     for (std::size_t i = 0; i < patches.size() && i + 1 < row.values.size(); ++i)
         if (const auto value = number_in(row.values[i + 1]))
             patches[i].device.emplace_back(ink, *value);
@@ -233,7 +234,7 @@ void Columns::read(Sheet &sheet)
 {
     Row row;
     std::size_t at = 0, line = 0;
-    std::string_view rest = above, names, inks;
+    std::string_view rest = above, names, below;
     std::size_t named = 0; // values in the row of names
     while (!rest.empty()) {
         std::string_view now = next_line(rest);
@@ -249,7 +250,7 @@ void Columns::read(Sheet &sheet)
         }
         names = begin;
         named = row.values.size();
-        inks = rest;
+        below = rest;
         line = at;
     }
     if (names.empty())
@@ -261,7 +262,7 @@ void Columns::read(Sheet &sheet)
     for (std::size_t i = 0; i < patches.size(); ++i)
         patches[i].name = printable(row.values[i + 1]);
     at = line;
-    while (!inks.empty() && next_record(inks, separator, at, row))
+    while (!below.empty() && next_record(below, separator, at, row))
         if (!is_blank(row) && !ink_in(row).empty())
             take_inks(row, at);
     at = first;
