@@ -198,7 +198,7 @@ void add_colours(Measurement &sheet, PyObject *fields)
 /// Adds what the reader would doubt of the numbers, where it has not said so of them.
 void doubt(Measurement &sheet)
 {
-    for (const Doubt &doubt : doubts_about(sheet.patches, sheet.kind)) {
+    for (const Doubt &doubt : doubts_about(sheet.patches, sheet.kind, sheet.source.held)) {
         const std::string line = doubt.line ? std::to_string(doubt.line) + ":" : "";
         const std::string text = line + " " + doubt.text;
         if (std::find(sheet.warnings.begin(), sheet.warnings.end(), text) == sheet.warnings.end())

@@ -55,9 +55,9 @@ void doubt_bands(const std::vector<Patch> &patches, std::vector<Doubt> &out)
                                           least[band])});
 }
 
-// Bands beside each other that read alike everywhere, but for those at the ends, where a value may
-// be held.
-void doubt_alike(const std::vector<Patch> &patches, std::vector<Doubt> &out)
+// Bands beside each other that read alike everywhere, but for those at the ends where a value is
+// held.
+void doubt_alike(const std::vector<Patch> &patches, bool held, std::vector<Doubt> &out)
 {
     constexpr std::size_t bands = VANTREL_BANDS;
     std::vector<bool> as_before(bands);
@@ -70,9 +70,9 @@ void doubt_alike(const std::vector<Patch> &patches, std::vector<Doubt> &out)
                 return std::abs(patch.refl[band] - patches[0].refl[band]) > kDeadRange;
             });
     std::size_t begin = 1, end = bands;
-    while (begin < end && as_before[begin])
+    while (held && begin < end && as_before[begin])
         ++begin;
-    while (end > begin && as_before[end - 1])
+    while (held && end > begin && as_before[end - 1])
         --end;
     while (begin < end && !as_before[begin])
         ++begin;
@@ -212,7 +212,8 @@ void doubt_lightness(const std::vector<Patch> &patches, std::vector<Doubt> &out)
         lightest = !lightest || patch.lab->L > lightest->lab->L ? &patch : lightest;
         coat = std::max(coat, std::hypot(patch.lab->a, patch.lab->b));
     }
-    if (lightest && (lightest->lab->L > kMostLightness || (lightest->lab->L <= 1 && coat > kCoat)))
+    if (lightest && (lightest->lab->L > kMostLightness ||
+                     (lightest->lab->L <= 1 && (coat > kCoat || patches.size() >= 3))))
         out.push_back({lightest->line, fmt::format("the largest L*, of {}, is {:g}: is it of "
                                                    "another scale?",
                                                    in_quotes(lightest->name), lightest->lab->L)});
@@ -400,7 +401,7 @@ void doubt_percentages(const std::vector<Patch> &patches, std::vector<Doubt> &ou
 
 } // namespace
 
-std::vector<Doubt> doubts_about(const std::vector<Patch> &patches, Kind kind)
+std::vector<Doubt> doubts_about(const std::vector<Patch> &patches, Kind kind, bool held)
 {
     std::vector<Doubt> out;
     doubt_percentages(patches, out);
@@ -412,7 +413,7 @@ std::vector<Doubt> doubts_about(const std::vector<Patch> &patches, Kind kind)
         }
         doubt_zeros(patches, named, out);
         doubt_bands(patches, out);
-        doubt_alike(patches, out);
+        doubt_alike(patches, held, out);
         doubt_signs(patches, out);
         doubt_spikes(patches, out);
     }

@@ -17,9 +17,9 @@ struct Doubt {
 // Of reflectances in percent: rows that are fractions or were not measured, a patch as white as the
 // perfect white, bands that read the same everywhere or stand out of those beside them,
 // reflectances below zero, spectra that stand twice, and solids that read as another ink than the
-// device values say. Of all: ink values that are
-// no percentages, gaps in the count of ids or places, ids and names of several patches,
-// and patches that are lighter than others with less ink.
-std::vector<Doubt> doubts_about(const std::vector<Patch> &patches, Kind kind);
+// device values say. Of all: ink values that are no percentages, gaps in the count of ids or
+// places, ids and names of several patches, and patches that are lighter than others with less ink.
+// Held are values beyond the range that was measured.
+std::vector<Doubt> doubts_about(const std::vector<Patch> &patches, Kind kind, bool held);
 
 } // namespace vantrel::sheets

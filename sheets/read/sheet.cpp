@@ -282,8 +282,7 @@ void Sheet::bring_to_percent()
             if (!(std::abs(value) <= kLargest))
                 throw InputError{patch.line, "a value is too large in percent"};
         }
-    if (scale_by == "values")
-        warn_of_guess(largest);
+    warn_of_scale(largest);
 }
 
 void Sheet::bring_inks_to_percent()
@@ -300,12 +299,11 @@ void Sheet::bring_inks_to_percent()
 }
 
 // Nothing reflects this much: few papers and no inks have an L* above 105.
-void Sheet::warn_of_guess(double largest)
+void Sheet::warn_of_scale(double largest)
 {
-    if (fractions && origin.scaled)
-        return;
+    const bool guessed = scale_by == "values";
     const char *as = origin.scaled ? "a fraction" : "a percentage";
-    if (largest < kFaintest) {
+    if (guessed && largest < kFaintest && !(fractions && origin.scaled)) {
         warn(0, fmt::format("no keyword tells the scale: the largest reflectance, {:.3g}, is taken "
                             "for {}; --scale sets the scale",
                             largest, as));
@@ -316,9 +314,11 @@ void Sheet::warn_of_guess(double largest)
     for (const Patch &patch : patches) {
         std::array<double, 3> lab{};
         if (ReflToCIELAB(patch.refl.data(), D50_2DEG, lab.data()) && lab[0] > kLightestPaper) {
-            warn(patch.line, fmt::format("no keyword tells the scale: taken for {}, the patch has "
-                                         "an L* of {:.1f}; --scale sets the scale",
-                                         as, lab[0]));
+            const std::string how =
+                guessed ? fmt::format("no keyword tells the scale: taken for {},", as)
+                        : "by " + scale_by;
+            warn(patch.line, fmt::format("{} the patch has an L* of {:.1f}; --scale sets the scale",
+                                         how, lab[0]));
             return;
         }
     }
@@ -391,7 +391,7 @@ Measurement Sheet::measurement()
                             in_quotes(header.unknown_filter)));
     if (xyz)
         bring_to_lab(colours);
-    for (const Doubt &doubt : doubts_about(patches, kind))
+    for (const Doubt &doubt : doubts_about(patches, kind, origin.held))
         warn(doubt.line, doubt.text);
     if (kind == Kind::transmission)
         warn(0, "transmission, not reflectance: there is no paper");

@@ -73,7 +73,7 @@ private:
     bool name_patches();
     void bring_to_percent();
     double largest_fraction() const;
-    void warn_of_guess(double largest);
+    void warn_of_scale(double largest);
     void bring_to_lab(const Colours &colours);
 
     Reading reading;

@@ -31,6 +31,7 @@ public:
     explicit SpareBand(std::size_t column) : column(column) {}
     void take(const Row &row, std::size_t line);
     bool few_empty() const { return first_line > 0 && 2 * empty <= rows; }
+    bool all_empty() const { return rows > 0 && empty == rows; }
 
     const std::size_t column;
     std::size_t first_line = 0; // that is empty

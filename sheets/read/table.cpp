@@ -304,6 +304,20 @@ void Table::warn_of_shifts()
             sheet.warn(it.first_line,
                        fmt::format("the row is empty under {}{}: are its cells shifted?",
                                    in_quotes(fields[it.column]), and_more(it.empty)));
+    // A device that measures less than the heading has leaves more than the last column of an end.
+    for (std::size_t i = 0; values.size() > 1 && i < 2; ++i) {
+        const auto at = [&](std::size_t place) {
+            return std::find_if(spare_bands.begin(), spare_bands.end(), [&](const SpareBand &it) {
+                return it.column == values[i ? values.size() - 1 - place : place];
+            });
+        };
+        const auto last = at(0), inner = at(1);
+        if (last != spare_bands.end() && last->all_empty() &&
+            !(inner != spare_bands.end() && inner->all_empty()))
+            sheet.warn(last->first_line, fmt::format("{} is empty in every row: are all values a "
+                                                     "wavelength off?",
+                                                     in_quotes(fields[last->column])));
+    }
 }
 
 void Table::warn_of_inks()
