@@ -103,6 +103,15 @@ void take_keyword(std::string_view line, Header &header)
     header.take(keyword, value);
 }
 
+// Whether a value holds as many separators as half a row has.
+bool holds_rows(const Row &row, char separator, std::size_t fields)
+{
+    return std::any_of(row.values.begin(), row.values.end(), [&](std::string_view value) {
+        return 2 * static_cast<std::size_t>(std::count(value.begin(), value.end(), separator)) >=
+               fields;
+    });
+}
+
 // The rows below the first line that is a heading; false where none is.
 bool read_rows(std::string_view text, Sheet &sheet, bool spectra)
 {
@@ -129,6 +138,8 @@ bool read_rows(std::string_view text, Sheet &sheet, bool spectra)
             throw InputError{at, "a quoted text is not closed"};
         if (is_blank(row))
             continue;
+        if (line > at && holds_rows(row, heading->separator, table.fields.size()))
+            throw InputError{at, "a quoted text holds whole rows: is a quotation mark missing?"};
         while (row.values.size() > table.fields.size() && row.values.back().empty())
             row.values.pop_back();
         const std::string_view statistic = Table::statistic_in(row);
@@ -281,6 +292,10 @@ void Columns::read(Sheet &sheet)
             break;
         }
         wavelengths.push_back(*nm);
+        for (std::size_t i = patches.size() + 1; i < row.values.size(); ++i)
+            if (!trimmed(row.values[i]).empty())
+                throw InputError{begin, fmt::format("{} values under the names of {} patches",
+                                                    row.values.size() - 1, patches.size())};
         row.values.resize(std::max(row.values.size(), patches.size() + 1));
         for (std::size_t i = 0; i < patches.size(); ++i) {
             const auto value = number_in(row.values[i + 1]);

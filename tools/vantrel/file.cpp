@@ -46,8 +46,13 @@ std::string read_file(const std::string &path)
 {
     const std::unique_ptr<std::FILE, Close> file(path == "-" ? stdin
                                                              : std::fopen(path.c_str(), "rb"));
-    if (!file)
-        throw error_now();
+    if (!file) {
+        const sheets::InputError error = error_now();
+        struct stat unread {}; // named as an input, it is none of an output either
+        if (stat(path.c_str(), &unread) == 0)
+            files_read.push_back(unread);
+        throw error;
+    }
     const struct stat before = state_of(file.get());
     const bool regular = S_ISREG(before.st_mode);
     files_read.push_back(before);

@@ -10,7 +10,7 @@ namespace vantrel::program {
 // meanwhile.
 std::string read_file(const std::string &path);
 
-// Whether it is a file that read_file has read, by this name or another.
+// Whether it is a file that read_file has read, or tried to, by this name or another.
 bool was_read(const struct stat &file);
 
 } // namespace vantrel::program
