@@ -47,11 +47,12 @@ std::string read_file(const std::string &path)
     const std::unique_ptr<std::FILE, Close> file(path == "-" ? stdin
                                                              : std::fopen(path.c_str(), "rb"));
     if (!file) {
-        const sheets::InputError error = error_now();
+        const int reason = errno;
         struct stat unread {}; // named as an input, it is none of an output either
         if (stat(path.c_str(), &unread) == 0)
             files_read.push_back(unread);
-        throw error;
+        errno = reason;
+        throw error_now();
     }
     const struct stat before = state_of(file.get());
     const bool regular = S_ISREG(before.st_mode);
