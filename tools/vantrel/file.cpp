@@ -56,7 +56,8 @@ std::string read_file(const std::string &path)
     }
     const struct stat before = state_of(file.get());
     const bool regular = S_ISREG(before.st_mode);
-    files_read.push_back(before);
+    if (!was_read(before))
+        files_read.push_back(before);
     std::string text;
     if (regular) // at once, so that a large file does not stand in memory twice
         text.reserve(std::min(static_cast<std::size_t>(before.st_size), kLargestFile));

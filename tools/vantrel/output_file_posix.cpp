@@ -76,7 +76,7 @@ int make_temporary(std::string &name, mode_t mode)
 void refuse_what_was_read(const struct stat &target, const std::string &name)
 {
     if (was_read(target))
-        throw sheets::RequestError{name + " has been read; the output would write over it"};
+        throw sheets::RequestError{name + " is an input; the output would write over it"};
 }
 
 // Access lists and what users attach to a file, from the old one to the new.

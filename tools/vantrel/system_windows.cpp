@@ -54,13 +54,28 @@ std::string utf8(const wchar_t *text)
 }
 
 // Nothing where it is no file on a disk.
-std::optional<State> state_of(int file)
+std::optional<State> state_of(HANDLE handle)
 {
-    auto *const handle = reinterpret_cast<HANDLE>( // NOLINT(performance-no-int-to-ptr)
-        _get_osfhandle(file));
     State state{};
     if (GetFileType(handle) != FILE_TYPE_DISK || !GetFileInformationByHandle(handle, &state))
         return std::nullopt;
+    return state;
+}
+
+std::optional<State> state_of(int file)
+{
+    return state_of(reinterpret_cast<HANDLE>( // NOLINT(performance-no-int-to-ptr)
+        _get_osfhandle(file)));
+}
+
+// That of a file that may not be read, too.
+std::optional<State> state_of(const std::string &path)
+{
+    HANDLE handle =
+        CreateFileW(wide(path).c_str(), 0, FILE_SHARE_READ | FILE_SHARE_WRITE | FILE_SHARE_DELETE,
+                    nullptr, OPEN_EXISTING, FILE_FLAG_BACKUP_SEMANTICS, nullptr);
+    auto state = state_of(handle);
+    CloseHandle(handle);
     return state;
 }
 
@@ -182,11 +197,12 @@ std::string read_file(const std::string &path)
 {
     const std::unique_ptr<std::FILE, Close> file(path == "-" ? stdin
                                                              : _wfopen(wide(path).c_str(), L"rb"));
-    if (!file)
-        throw sheets::InputError{0, std::strerror(errno)};
-    const auto before = state_of(_fileno(file.get()));
-    if (before)
+    const int reason = errno;
+    const auto before = file ? state_of(_fileno(file.get())) : state_of(path);
+    if (before) // one that cannot be read is none of an output either
         files_read.push_back(*before);
+    if (!file)
+        throw sheets::InputError{0, std::strerror(reason)};
     std::string text;
     char block[1 << 16];
     while (const std::size_t got = std::fread(block, 1, sizeof block, file.get())) {
@@ -248,7 +264,7 @@ void OutputFile::open()
     if (!named) {
         if (standard_output && was_read(*standard_output))
             throw sheets::RequestError{
-                "the file behind standard output has been read; the output would write over it"};
+                "the file behind standard output is an input; the output would write over it"};
         file = kStandardOutput;
     } else if (const int old = _wopen(wide(path).c_str(), _O_WRONLY | _O_BINARY); old >= 0) {
         const auto target = state_of(old);
@@ -256,7 +272,7 @@ void OutputFile::open()
             _close(old);
             if (was_read(*target))
                 throw sheets::RequestError{sheets::printable(path) +
-                                           " has been read; the output would write over it"};
+                                           " is an input; the output would write over it"};
             links_cut = target->nNumberOfLinks - 1;
             open_beside(path);
         } else { // NUL, a pipe
