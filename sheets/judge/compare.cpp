@@ -272,6 +272,7 @@ Coverage coverage_of(const Pairs &pairs, const Measurement &reference, const Mea
             .of_aims = reference.patches.size(),
             .patches = sample.patches.size() - pairs.only_sample.size(),
             .of_patches = sample.patches.size(),
+            .no_repeats = 0,
             .allow_missing = allow_missing};
 }
 
@@ -336,6 +337,10 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
         out.pairs.push_back(pair_report(references, samples, pair, terms));
         work.done(out.pairs.size());
     }
+    out.coverage.no_repeats = static_cast<std::size_t>(
+        std::count_if(out.pairs.begin(), out.pairs.end(), [](const PairReport &pair) {
+            return is_of_others(pair.reference.spread) || is_of_others(pair.sample.spread);
+        }));
     warn_of_papers(out);
     const std::vector<ControlPatch> controls =
         control_patches(out.pairs, pairs.matched, references, samples, illuminant.illuminant,
@@ -360,9 +365,8 @@ Comparison compare(const Measurement &reference, const Measurement &sample,
             substrate_corrected(out.pairs, controls, references, samples, terms, out.coverage);
     out.worst = largest_first(values_of(out.pairs, &PairReport::delta_e, 0));
     out.worst.resize(std::min(out.worst.size(), kMostWorst));
-    warn_of_wide_means(out.reference_means, reference.file, out.warnings);
-    if (!request.pairing.zones) // which differ
-        warn_of_wide_means(out.sample_means, sample.file, out.warnings);
+    warn_of_wide_means(out.reference_means, false, reference.file, out.warnings);
+    warn_of_wide_means(out.sample_means, request.pairing.zones, sample.file, out.warnings);
     warn_of_same(out);
     warn_of_misfit(out);
     if (!warn_of_better_fit(out) && references.has_spectra() && samples.has_spectra() && out.papers)

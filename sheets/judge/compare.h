@@ -69,13 +69,15 @@ struct Unpaired {
 struct Coverage {
     std::size_t aims = 0, of_aims = 0;       // of the reference
     std::size_t patches = 0, of_patches = 0; // of the sample
-    bool allow_missing = false;              // as asked for
+    std::size_t no_repeats = 0; // pairs that rest on a mean of other patches than repeats of one
+    bool allow_missing = false; // as asked for
 
     // The sample is a strip of the chart: it has at most half of its patches.
     bool is_strip() const { return patches == of_patches && 2 * aims <= of_aims; }
     bool complete() const
     {
-        return allow_missing || is_strip() || (patches == of_patches && aims == of_aims);
+        return no_repeats == 0 &&
+               (allow_missing || is_strip() || (patches == of_patches && aims == of_aims));
     }
 };
 
@@ -106,7 +108,7 @@ struct Comparison {
     std::vector<SolidAdvice> advice;
     std::vector<std::string> warnings;
     // Of neither a tolerance nor a limit nothing, or incomplete where patches or aims lack a
-    // partner.
+    // partner, or are no repeats of what they are taken for.
     std::optional<Verdict> verdict;
 };
 

@@ -1,6 +1,7 @@
 #include "judge/compare_doubts.h"
 
 #include "judge/colour.h"
+#include "judge/repeats.h"
 #include "read/illuminant.h"
 #include "read/text.h"
 
@@ -156,14 +157,17 @@ void warn_of_uneven(const Pairs &pairs, const Measurement &reference, const Meas
                                        sample.file, most, aims, others, aims > 3 ? ", …" : ""));
 }
 
-void warn_of_wide_means(const std::optional<Means> &means, const std::string &file,
+void warn_of_wide_means(const std::optional<Means> &means, bool of_zones, const std::string &file,
                         std::vector<std::string> &warnings)
 {
-    if (means && means->spread > kWideMean)
-        warnings.push_back(fmt::format("{}: the {} patches of {} are up to ΔE00 {:.2f} from their "
-                                       "mean, which is judged",
-                                       file, means->repeats, in_quotes(means->widest),
-                                       means->spread));
+    if (!means || !(means->spread > kWideMean))
+        return;
+    const bool of_others = is_of_others(means->spread);
+    if (of_others || !of_zones)
+        warnings.push_back(fmt::format(
+            "{}{}: the {} patches of {} are up to ΔE00 {:.2f} from their mean, {}",
+            of_others ? "not judged: " : "", file, means->repeats, in_quotes(means->widest),
+            means->spread, of_others ? "as no repeats of one are" : "which is judged"));
 }
 
 void warn_of_same(Comparison &out)

@@ -17,7 +17,8 @@ void warn_of_conditions(const Measurement &reference, const Measurement &sample,
 void warn_of_uneven(const Pairs &pairs, const Measurement &reference, const Measurement &sample,
                     std::vector<std::string> &warnings);
 
-void warn_of_wide_means(const std::optional<Means> &means, const std::string &file,
+// Zones differ, though not as other patches do.
+void warn_of_wide_means(const std::optional<Means> &means, bool of_zones, const std::string &file,
                         std::vector<std::string> &warnings);
 
 // Two measurements of one patch never agree to the last digit, nor does a second one to the last

@@ -2,6 +2,7 @@
 
 #include "judge/colour.h"
 #include "judge/device_values.h"
+#include "judge/repeats.h"
 #include "read/first_alike.h"
 #include "read/text.h"
 
@@ -155,6 +156,7 @@ private:
 struct Outcome {
     Pairs pairs;
     PairingTry result;
+    std::optional<double> spread{}; // the largest of the means, where one is of no repeats
     // The first of the pairs that disagree.
     const Patch *reference = nullptr, *sample = nullptr;
 };
@@ -272,14 +274,31 @@ std::vector<Pairing> keys_of(const Sheets &sheets)
     return out;
 }
 
+// Mean ΔE00 of the patches to their aims, each alone: means would hide what is unlike.
 double mean_difference(const Pairs &pairs, const Sheets &sheets)
 {
-    double sum = 0;
+    double sum = 0, count = 0;
+    for (const Pair &pair : pairs.matched) {
+        const Patch aim = mean_of(sheets.reference, pair.reference, D50_2DEG).patch;
+        for (const std::size_t place : pair.sample) {
+            sum += delta_e00(lab_of(sheets.reference, aim, D50_2DEG),
+                             lab_of(sheets.sample, sheets.sample.patches[place], D50_2DEG));
+            ++count;
+        }
+    }
+    return sum / count;
+}
+
+// The largest spread of means, where one is of patches that are no repeats.
+std::optional<double> spread_of_others(const Pairs &pairs, const Sheets &sheets)
+{
+    double most = 0;
     for (const Pair &pair : pairs.matched)
-        sum += delta_e00(
-            lab_of(sheets.reference, sheets.reference.patches[pair.reference[0]], D50_2DEG),
-            lab_of(sheets.sample, sheets.sample.patches[pair.sample[0]], D50_2DEG));
-    return sum / static_cast<double>(pairs.matched.size());
+        for (const auto &[sheet, places] : {std::pair{&sheets.reference, &pair.reference},
+                                            std::pair{&sheets.sample, &pair.sample}})
+            if (places->size() > 1)
+                most = std::max(most, *mean_of(*sheet, *places, D50_2DEG).spread);
+    return is_of_others(most) ? std::optional(most) : std::nullopt;
 }
 
 // Whether any patch of the sample has another partner.
@@ -296,7 +315,7 @@ bool contradict(const Pairs &first, const Pairs &second, const Sheets &sheets)
     });
 }
 
-// Of two keys between which no device values decide.
+// Of two keys between which no device values decide, or one of which has other patches as repeats.
 void choose_by_colour(Outcome &best, Outcome &other, const Sheets &sheets, std::string_view hint,
                       std::vector<std::string> &warnings)
 {
@@ -304,12 +323,17 @@ void choose_by_colour(Outcome &best, Outcome &other, const Sheets &sheets, std::
                  of_other = mean_difference(other.pairs, sheets);
     if (of_other < mean)
         std::swap(best, other);
+    const Outcome &apart = other.spread ? other : best;
+    const std::string reason =
+        apart.spread ? fmt::format("patches that are one {} are up to ΔE00 {:.1f} from their mean",
+                                   phrase_of(apart.pairs.by), *apart.spread)
+                     : "no device values tell which is right";
     warnings.push_back(fmt::format("{} and {} pair otherwise {} (mean ΔE00 {:.2f}) than {} "
-                                   "({:.2f}), and no device values tell "
-                                   "which is right{}",
+                                   "({:.2f}), and {}{}",
                                    sheets.reference.file, sheets.sample.file,
                                    phrase_of(best.pairs.by), std::min(mean, of_other),
-                                   phrase_of(other.pairs.by), std::max(mean, of_other), hint));
+                                   phrase_of(other.pairs.by), std::max(mean, of_other), reason,
+                                   hint));
 }
 
 std::string told(const PairingTry &result, const Sheets &sheets)
@@ -324,34 +348,40 @@ Outcome automatic_pairs(const Sheets &sheets, const PairingRequest &request,
 {
     std::optional<Outcome> best;
     std::vector<PairingTry> passed_over;
+    const std::string_view hint = request.zones ? "" : "; --pair chooses";
     for (const Pairing by : keys_of(sheets)) {
         Outcome outcome = pairs_by(by, sheets, request);
         if (!suffices(outcome.result, sheets)) {
             passed_over.push_back(outcome.result);
             continue;
         }
+        outcome.spread = spread_of_others(outcome.pairs, sheets);
         if (!best) {
             best = std::move(outcome);
             continue;
         }
-        if (!sheets.values.comparable() && contradict(best->pairs, outcome.pairs, sheets))
-            choose_by_colour(*best, outcome, sheets, request.zones ? "" : "; --pair chooses",
-                             warnings);
+        if ((!sheets.values.comparable() || best->spread || outcome.spread) &&
+            contradict(best->pairs, outcome.pairs, sheets))
+            choose_by_colour(*best, outcome, sheets, hint, warnings);
         else if (outcome.result.reference + outcome.result.sample >
                  best->result.reference + best->result.sample)
             std::swap(*best, outcome);
         passed_over.push_back(outcome.result);
     }
-    if (!best && sheets.reference.patches.size() == sheets.sample.patches.size()) {
+    if ((!best || best->spread) &&
+        sheets.reference.patches.size() == sheets.sample.patches.size()) {
         Outcome outcome = pairs_by(Pairing::order, sheets, request);
-        if (outcome.result.disagreeing == 0) {
+        if (best && outcome.result.disagreeing == 0)
+            choose_by_colour(*best, outcome, sheets, hint, warnings);
+        if (best || outcome.result.disagreeing > 0) {
+            passed_over.push_back(outcome.result);
+        } else {
             if (!passed_over.empty())
                 warnings.push_back(fmt::format("{} and {} pair {}, as nothing else pairs them",
                                                sheets.reference.file, sheets.sample.file,
                                                phrase_of(Pairing::order)));
             best = std::move(outcome);
-        } else
-            passed_over.push_back(outcome.result);
+        }
     }
     if (!best) {
         std::string tries;
@@ -366,6 +396,29 @@ Outcome automatic_pairs(const Sheets &sheets, const PairingRequest &request,
     }
     best->pairs.passed_over = std::move(passed_over);
     return std::move(*best);
+}
+
+// Patches that are judged each, by as many aims that are no repeats: by one after the other.
+void pair_in_turn(std::vector<Pair> &matched, const Sheets &sheets,
+                  std::vector<std::string> &warnings)
+{
+    for (std::size_t begin = 0, end = 0; begin < matched.size(); begin = end) {
+        const std::vector<std::size_t> aims = matched[begin].reference;
+        while (end < matched.size() && matched[end].reference == aims)
+            ++end;
+        if (aims.size() == 1 || aims.size() != end - begin)
+            continue;
+        const auto spread = mean_of(sheets.reference, aims, D50_2DEG).spread;
+        if (!is_of_others(spread))
+            continue;
+        for (std::size_t i = 0; i < aims.size(); ++i)
+            matched[begin + i].reference = {aims[i]};
+        warnings.push_back(fmt::format(
+            "{}: the {} aims {} are up to ΔE00 {:.1f} from their mean, no repeats: each stands for "
+            "the patch of {} in its turn, a guess",
+            sheets.reference.file, aims.size(),
+            in_quotes(sheets.reference.patches[aims.front()].name), *spread, sheets.sample.file));
+    }
 }
 
 } // namespace
@@ -393,6 +446,8 @@ Pairs pairs_of(const Measurement &reference, const Measurement &sample,
     if (outcome.pairs.matched.empty())
         throw RequestError{fmt::format("no patch of {} has a partner in {} {}", reference.file,
                                        sample.file, phrase_of(outcome.pairs.by))};
+    if (request.each)
+        pair_in_turn(outcome.pairs.matched, sheets, warnings);
     return std::move(outcome.pairs);
 }
 

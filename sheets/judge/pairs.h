@@ -73,7 +73,9 @@ struct Pairs {
 // is refused, and passed over by automatic pairing, which takes the key that pairs most: names,
 // ids, device values, the first of equals; or else the place, where the sheets are equally long.
 // Where no device values tell which of two keys is right, the one whose pairs are nearer in colour
-// is taken, with a warning. Throws RequestError.
+// is taken, with a warning; so it is, the place too, where patches of one key are far apart, which
+// is_of_others() tells. Aims of one key that are far apart serve as many patches, of which each is
+// judged, one by one in their order. Throws RequestError.
 Pairs pairs_of(const Measurement &reference, const Measurement &sample,
                const PairingRequest &request, std::vector<std::string> &warnings);
 

@@ -12,7 +12,14 @@ CIELABCOORD operator+(const CIELABCOORD &first, const CIELABCOORD &second)
     return {first.L + second.L, first.a + second.a, first.b + second.b};
 }
 
+constexpr double kMostSpread = 5;
+
 } // namespace
+
+bool is_of_others(const std::optional<double> &spread)
+{
+    return spread && !(*spread <= kMostSpread);
+}
 
 Repeats mean_of(const Measurement &sheet, const std::vector<std::size_t> &places,
                 ILLUM_OBS illuminant)

@@ -246,6 +246,9 @@ void RunJudge::find_gaps(Run &run) const
                 }
         }
         const std::string &file = entries[i].sheet.file;
+        if (const std::size_t means = entries[i].sheet.coverage.no_repeats)
+            run.gaps.push_back(fmt::format("{}: {} mean{} of no repeats, not judged", file, means,
+                                           means == 1 ? "" : "s"));
         if (!lacking.empty())
             run.gaps.push_back(fmt::format("{}: no {}", file, listed(lacking)));
         std::map<std::string, std::vector<int>> same; // zones by what they lack

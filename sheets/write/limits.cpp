@@ -80,15 +80,24 @@ std::string told(const Coverage &coverage)
     std::string out = fmt::format("judged {} of {} patches by {} of {} aims", coverage.patches,
                                   coverage.of_patches, coverage.aims, coverage.of_aims);
     if (coverage.is_strip())
-        return out + ", as a strip of them";
-    return out + (coverage.allow_missing ? ", which is allowed" : "");
+        out += ", as a strip of them";
+    else if (coverage.allow_missing)
+        out += ", which is allowed";
+    if (coverage.no_repeats > 0)
+        out += fmt::format(", with {} mean{} of no repeats", coverage.no_repeats,
+                           coverage.no_repeats == 1 ? "" : "s");
+    return out;
 }
 
 Json coverage_json(const Coverage &coverage)
 {
-    return {{"patches", coverage.patches},  {"of_patches", coverage.of_patches},
-            {"aims", coverage.aims},        {"of_aims", coverage.of_aims},
-            {"strip", coverage.is_strip()}, {"allow_missing", coverage.allow_missing}};
+    return {{"patches", coverage.patches},
+            {"of_patches", coverage.of_patches},
+            {"aims", coverage.aims},
+            {"of_aims", coverage.of_aims},
+            {"strip", coverage.is_strip()},
+            {"allow_missing", coverage.allow_missing},
+            {"no_repeats", coverage.no_repeats}};
 }
 
 Json limits_json(const std::vector<LimitResult> &limits)

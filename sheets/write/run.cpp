@@ -12,6 +12,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <tuple>
 #include <utility>
 
 namespace vantrel::sheets {
@@ -215,8 +216,10 @@ std::string word_of(const Run &run)
 std::string coverage_of(const Run &run)
 {
     const auto fewer = [](const RunSheet &one, const RunSheet &other) {
-        return std::pair(one.coverage.aims, one.coverage.patches) <
-               std::pair(other.coverage.aims, other.coverage.patches);
+        const auto judged = [](const Coverage &coverage) {
+            return std::tuple(coverage.no_repeats == 0, coverage.aims, coverage.patches);
+        };
+        return judged(one.coverage) < judged(other.coverage);
     };
     const auto [least, most] = std::minmax_element(run.sheets.begin(), run.sheets.end(), fewer);
     const bool zoned = std::any_of(run.sheets.begin(), run.sheets.end(),

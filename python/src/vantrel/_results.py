@@ -301,7 +301,8 @@ class Papers:
 
 @dataclass(frozen=True)
 class Judged:
-    """How much was judged: `patches` of the sample by `aims` of the reference."""
+    """How much was judged: `patches` of the sample by `aims` of the reference; `no_repeats` pairs rest
+    on means of patches that are too far apart to be repeats."""
 
     patches: int
     of_patches: int
@@ -309,6 +310,7 @@ class Judged:
     of_aims: int
     strip: bool
     allow_missing: bool
+    no_repeats: int
 
 
 @dataclass(frozen=True)
