@@ -174,6 +174,12 @@ void Header::keep_condition(const std::string &key, std::string_view value)
     named_condition = true;
 }
 
+void Header::keep_of_row(Condition given, Condition own, bool by_keyword)
+{
+    if (!told_apart && given && own && given != own)
+        told_apart = {given, own, by_keyword};
+}
+
 void Header::take(std::string_view keyword, std::string_view value)
 {
     const std::string key = letters(keyword);

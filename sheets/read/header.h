@@ -28,6 +28,11 @@ struct Header {
     Condition condition;            // the one that was named last
     std::string other_condition;    // and one under another keyword
     std::string several_conditions; // in one text
+    struct Apart {
+        Condition given, own; // the latter is taken
+        bool by_keyword;      // the former
+    };
+    std::optional<Apart> told_apart; // conditions of one patch, the first such
     std::string unknown_filter;
     std::string backing, geometry; // the last that were named
     std::size_t setups_told = 0;   // how often one of them was
@@ -35,6 +40,9 @@ struct Header {
     // The condition that a text tells under a key such as FILTER, POLARIZATION or MODE; what tells
     // neither a condition nor that there is no filter is kept.
     Condition condition_told(std::string_view text, std::string_view key = {});
+
+    // The condition that a column tells of a patch, beside that of the keywords or other columns.
+    void keep_of_row(Condition given, Condition own, bool by_keyword);
 
     // "Backing black; Geometry 45/0", what is known of it.
     std::string setup() const;

@@ -1,5 +1,6 @@
 #include "read/ink_columns.h"
 
+#include "read/column_names.h"
 #include "read/text.h"
 
 #include <fmt/format.h>
@@ -129,29 +130,18 @@ std::vector<std::string> inks_of(const std::vector<std::string> &keys)
 }
 
 // A percentage, or SPOT_1, PC6_5, HEX_O; or none of what is measured, counted or a place.
-DoubtfulColumn::DoubtfulColumn(std::size_t column, std::string_view key)
-    : column(column),
-      named(key.ends_with('%') || key.ends_with("%)") || key.ends_with("%]") ||
+DoubtfulColumn::DoubtfulColumn(std::string_view key)
+    : named(key.ends_with('%') || key.ends_with("%)") || key.ends_with("%]") ||
             key.ends_with("PCT") || key.find("PERCENT") != std::string_view::npos ||
             key.starts_with("SPOT") || key.starts_with("HEX") ||
             (key.size() > 2 && key.starts_with("PC") && key[2] >= '0' && key[2] <= '9')),
       nameless(key.empty())
 {
-    constexpr std::array beginnings = {
-        "LAB",        "CIE",   "LCH",     "XYZ",    "XYY",     "LUV",      "RGB",
-        "SRGB",       "DE",    "DELTA",   "DENS",   "DOTAREA", "DOTGAIN",  "TVI",
-        "SCTV",       "TRAP",  "HUE",     "CHROMA", "GRAY",    "GREY",     "PRINTCONTRAST",
-        "NEUTRAL",    "STD",   "STDEV",   "MEAN",   "CHI",     "SPECTRAL", "ROW",
-        "COL",        "LINE",  "PAGE",    "SHEET",  "STRIP",   "ZONE",     "POS",
-        "INDEX",      "TIME",  "STEP",    "COUNT",  "SEQ",     "REPEAT",   "SAMPLE",
-        "PATCH",      "ZEILE", "SPALTE",  "SEITE",  "FEUCHT",  "GLANZ",    "WHITENESS",
-        "BRIGHTNESS", "GLOSS", "OPACITY", "TEMP",   "HUMID",   "LIGHTNESS"};
-    constexpr std::array whole = {
-        "L",  "L*",       "A*", "B*", "C*",     "H",      "H*",    "HAB",  "X",
-        "Z",  "A",        "ID", "NO", "NUMBER", "NR",     "LOC",   "D",    "DC",
-        "DM", "DY",       "DK", "DV", "DRED",   "DGREEN", "DBLUE", "DVIS", "DMAJORFILTER",
-        "V",  "RESPONSE", "R",  "G"};
-    measured = std::any_of(beginnings.begin(), beginnings.end(),
+    constexpr std::array beginnings = {"LAB",  "CIE", "RGB",      "DE",     "GRAY",
+                                       "MEAN", "COL", "SPECTRAL", "SAMPLE", "PATCH"};
+    constexpr std::array whole = {"L", "L*", "A*", "B*", "A", "R", "G"};
+    measured = (is_beside_readings(key) && key != "C" && key != "Y") ||
+               std::any_of(beginnings.begin(), beginnings.end(),
                            [&](std::string_view word) { return key.starts_with(word); }) ||
                std::find(whole.begin(), whole.end(), key) != whole.end();
 }

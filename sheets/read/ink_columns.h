@@ -18,11 +18,10 @@ std::vector<std::string> inks_of(const std::vector<std::string> &keys);
 // A column that nothing reads and that may hold percentages of an ink.
 class DoubtfulColumn {
 public:
-    DoubtfulColumn(std::size_t column, std::string_view key);
+    explicit DoubtfulColumn(std::string_view key);
     void take(std::string_view cell);
     bool may_be_ink() const;
-
-    const std::size_t column;
+    bool counts_rows() const { return numbers > 1 && others == 0 && steps; }
 
 private:
     bool named;    // like an ink

@@ -11,11 +11,13 @@ namespace {
 
 bool tells_condition(const std::string &key)
 {
-    constexpr std::array words = {"MODE",           "MMODE",     "MEASMODE", "MEASUREMENTMODE",
-                                  "TESTMODE",       "MESSMODUS", "ISO13655", "MESSBEDINGUNG",
-                                  "MESSBEDINGUNGEN"};
+    constexpr std::array words = {
+        "MODE",      "MMODE",    "MEASMODE",      "MEASUREMENTMODE", "TESTMODE",
+        "MESSMODUS", "ISO13655", "MESSBEDINGUNG", "MESSBEDINGUNGEN", "COND",
+        "MCOND",     "MEASCOND", "BEDINGUNG"};
     return std::find(words.begin(), words.end(), key) != words.end() || key.starts_with("POL") ||
-           contains(key, "CONDITION") || contains(key, "FILTER") || contains(key, "ILLUMINATION");
+           contains(key, "CONDITION") || contains(key, "FILTER") || contains(key, "FILTRE") ||
+           contains(key, "ILLUMINATION");
 }
 
 } // namespace
@@ -49,8 +51,11 @@ bool MethodColumns::has(std::size_t column) const
 Condition MethodColumns::condition(const Row &row, Header &header) const
 {
     Condition out;
-    for (const Column &column : conditions)
-        out = std::max(out, header.condition_told(trimmed(row.values[column.place]), column.key));
+    for (const Column &column : conditions) {
+        const Condition told = header.condition_told(trimmed(row.values[column.place]), column.key);
+        header.keep_of_row(std::min(out, told), std::max(out, told), false);
+        out = std::max(out, told);
+    }
     return out;
 }
 

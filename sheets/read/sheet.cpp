@@ -98,6 +98,15 @@ void Sheet::add(Patch patch, Condition condition, std::size_t line, std::size_t 
         setups.push_back(setup);
 }
 
+void Sheet::tell_conditions(const std::vector<Condition> &told)
+{
+    for (std::size_t i = 0; i < told.size(); ++i)
+        if (told[i]) {
+            header.keep_of_row(conditions[i], told[i], conditions[i] == header.condition);
+            conditions[i] = told[i];
+        }
+}
+
 std::size_t Sheet::setup_number(const std::string &setup)
 {
     const auto [at, added] = setup_numbers.try_emplace(upper(setup), told_setups.size());
@@ -383,6 +392,12 @@ Measurement Sheet::measurement()
     if (!header.other_condition.empty())
         warn(0, fmt::format("the condition is said to be {}, and {} elsewhere: the first is taken",
                             name_of(header.condition), in_quotes(header.other_condition)));
+    if (const auto &told = header.told_apart;
+        told && !(told->by_keyword && origin.condition == name_of(told->given)))
+        warn(0, fmt::format("the condition of a patch is said to be {} by {} and {} by {}column: "
+                            "the latter is taken",
+                            name_of(told->given), told->by_keyword ? "a keyword" : "a column",
+                            name_of(told->own), told->by_keyword ? "a " : "another "));
     if (!header.several_conditions.empty() && header.condition)
         warn(0, fmt::format("several conditions in {}: {} is taken",
                             in_quotes(header.several_conditions), name_of(header.condition)));

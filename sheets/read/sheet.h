@@ -32,6 +32,10 @@ public:
     // file gives none. Patches of several setups are kept apart, as those under several conditions.
     void add(Patch patch, Condition condition, std::size_t line, std::size_t setup = 0);
 
+    // What a column tells of the first patches; it goes before what was given. A patch has no
+    // condition of it where the column is blank.
+    void tell_conditions(const std::vector<Condition> &told);
+
     // The number of the geometry, backing and the like that this text tells; before any patch.
     std::size_t setup_number(const std::string &setup);
 

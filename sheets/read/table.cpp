@@ -1,5 +1,6 @@
 #include "read/table.h"
 
+#include "read/colour_columns.h"
 #include "read/statistics.h"
 #include "read/text.h"
 
@@ -14,8 +15,6 @@
 namespace vantrel::sheets {
 namespace {
 
-constexpr std::size_t kNone = static_cast<std::size_t>(-1);
-
 // The column of the first of these fields that there is.
 std::size_t column_of(const std::vector<std::string> &keys,
                       std::initializer_list<std::string_view> fields)
@@ -26,51 +25,6 @@ std::size_t column_of(const std::vector<std::string> &keys,
             return static_cast<std::size_t>(found - keys.begin());
     }
     return kNone;
-}
-
-// L*, a* and b*, or X, Y and Z.
-struct Colour {
-    std::array<std::size_t, 3> columns = {kNone, kNone, kNone};
-    bool xyz = false;
-    std::string illuminant; // behind the name of the first column: Lab_L_D50_2
-
-    bool found() const { return std::count(columns.begin(), columns.end(), kNone) == 0; }
-};
-
-// The columns of colours, by the keys of all fields.
-Colour colour_in(const std::vector<std::string> &keys)
-{
-    constexpr std::array<std::array<std::string_view, 3>, 7> names = {{
-        {"LABL", "LABA", "LABB"},
-        {"CIELABL", "CIELABA", "CIELABB"},
-        {"L*", "A*", "B*"},
-        {"CIEL*", "CIEA*", "CIEB*"},
-        {"L", "A", "B"},
-        {"XYZX", "XYZY", "XYZZ"},
-        {"X", "Y", "Z"},
-    }};
-    for (const auto &family : names) {
-        Colour out;
-        out.xyz = family[0].find('X') != std::string_view::npos;
-        for (std::size_t i = 0; i < keys.size(); ++i)
-            for (std::size_t part = 0; part < 3; ++part) {
-                if (out.columns[part] != kNone || !keys[i].starts_with(family[part]))
-                    continue;
-                const std::string_view rest = std::string_view(keys[i]).substr(family[part].size());
-                const bool light =
-                    family[0].size() > 1 && !rest.empty() &&
-                    std::string_view("ACDF").find(rest[0]) != std::string_view::npos &&
-                    (rest.ends_with('2') || rest.ends_with("10"));
-                if (!rest.empty() && !light)
-                    continue;
-                out.columns[part] = i;
-                if (part == 0)
-                    out.illuminant = rest;
-            }
-        if (out.found())
-            return out;
-    }
-    return {};
 }
 
 std::vector<std::string> keys_of(const std::vector<std::string> &fields)
@@ -155,7 +109,7 @@ bool has_spectra(const std::vector<std::string> &fields)
 
 bool has_colours(const std::vector<std::string> &fields)
 {
-    return colour_in(keys_of(fields)).found();
+    return colours_in(keys_of(fields)).found();
 }
 
 Table::Table(Sheet &sheet, std::vector<std::string> names, std::size_t line)
@@ -174,12 +128,15 @@ Table::Table(Sheet &sheet, std::vector<std::string> names, std::size_t line)
     ink = column_of(keys, {"INK", "INKNAME", "COLORANT", "COLOURANT"});
     tint = column_of(keys, {"TINT", "TINTPCT", "TINT%", "TINTVALUE", "TONEVALUE", "NOMINAL"});
     find_devices(keys, line);
+    heading = line;
     find_ends();
     free_names = free_names || tint != kNone;
     if (tint == kNone) {
         name = name == kNone ? ink : name;
         ink = kNone;
     }
+    words = kNone;
+    find_unread(keys);
     std::vector<std::size_t> single = method.all();
     single.insert(single.end(), {id, name, tint, lab[0], lab[1], lab[2]});
     for (const std::size_t column : single)
@@ -193,7 +150,7 @@ Table::Table(Sheet &sheet, std::vector<std::string> names, std::size_t line)
 
 void Table::find_colours(const std::vector<std::string> &keys)
 {
-    const Colour colour = colour_in(keys);
+    const ColourColumns colour = colours_in(keys);
     lab = colour.columns;
     sheet.xyz = colour.found() && colour.xyz;
     if (sheet.xyz)
@@ -257,15 +214,25 @@ void Table::find_devices(const std::vector<std::string> &keys, std::size_t line)
             throw_twice(fields[i], before->second, i, line);
         devices.push_back({i, std::move(device)});
     }
-    for (std::size_t i = 0; i < fields.size() && !own; ++i)
-        if (!reads(i))
-            doubtful.emplace_back(i, keys[i]);
-    heading = line;
+}
+
+// This program's own reports hold what it computes itself.
+void Table::find_unread(const std::vector<std::string> &keys)
+{
+    const bool own_cgats = column_of(keys, {"DE00PAPER"}) != kNone;
+    const auto known = [&](const std::string &key) {
+        return own_cgats && (key == "PAPER" || key == "WARNINGS");
+    };
+    std::vector<std::size_t> columns;
+    for (std::size_t i = 0; i < fields.size() && !is_own_report(fields); ++i)
+        if ((!reads(i) && !known(keys[i])) || contains(keys[i], "ILLUMINATION"))
+            columns.push_back(i);
+    unread.find(fields, keys, columns, {.spectra = !values.empty(), .colours = lab[0] != kNone});
 }
 
 bool Table::reads(std::size_t column) const
 {
-    const std::array<std::size_t, 6> single = {id, name, tint, lab[0], lab[1], lab[2]};
+    const std::array<std::size_t, 7> single = {id, name, ink, tint, lab[0], lab[1], lab[2]};
     const auto is_it = [column](std::size_t known) { return known == column; };
     return method.has(column) || std::any_of(single.begin(), single.end(), is_it) ||
            std::any_of(values.begin(), values.end(), is_it) ||
@@ -293,12 +260,14 @@ void Table::find_ends()
 void Table::warn_of_shifts()
 {
     for (const Neighbour &it : neighbours)
-        if (it.continues_spectrum())
+        if (it.continues_spectrum()) {
+            unread.leave(it.column);
             sheet.warn(
                 heading,
                 fmt::format("the values under {} are near those under {}: is a name missing in the "
                             "heading, so that each value stands under another wavelength?",
                             in_quotes(fields[it.column]), in_quotes(fields[it.end])));
+        }
     for (const SpareBand &it : spare_bands)
         if (it.few_empty())
             sheet.warn(it.first_line,
@@ -318,19 +287,6 @@ void Table::warn_of_shifts()
                                                      "wavelength off?",
                                                      in_quotes(fields[last->column])));
     }
-}
-
-void Table::warn_of_inks()
-{
-    std::vector<std::string> unknown;
-    for (const DoubtfulColumn &doubt : doubtful)
-        if (doubt.may_be_ink())
-            unknown.push_back(in_quotes(fields[doubt.column]));
-    if (!unknown.empty())
-        sheet.warn(heading,
-                   fmt::format("{} left out, no name of an ink; \"Spot 1 %\" is one, and columns "
-                               "Ink and Tint take any",
-                               listed(unknown)));
 }
 
 double Table::value_at(const Row &row, std::size_t column, std::size_t line)
@@ -451,19 +407,19 @@ void Table::add(const Row &row, Condition given, std::size_t line)
     if (sheet.patches.empty() && id == kNone && name == kNone && ink == kNone)
         for (std::size_t i = 0; i < fields.size() && name == kNone; ++i)
             if (!method.has(i) && !trimmed(row.values[i]).empty() && !number_in(row.values[i]))
-                name = i; // the first column of words
+                name = words = i; // the first column of words
     patch.id = text_at(row, id);
     patch.name = text_at(row, name);
     percent_signs = false;
     patch.device = device_values(row, line);
     free_names = free_names && !percent_signs;
-    for (DoubtfulColumn &doubt : doubtful)
-        doubt.take(row.values[doubt.column]);
+    unread.take(row);
     for (Neighbour &it : neighbours)
         it.take(row);
     for (SpareBand &it : spare_bands)
         it.take(row, line);
     const Condition own = method.condition(row, sheet.header);
+    sheet.header.keep_of_row(given, own, true);
     if (method.tell_setup() || setups_told != sheet.header.setups_told) {
         setup = sheet.setup_number(method.setup(row, sheet.header));
         setups_told = sheet.header.setups_told;
@@ -474,7 +430,12 @@ void Table::add(const Row &row, Condition given, std::size_t line)
 void Table::finish()
 {
     warn_of_shifts();
-    warn_of_inks();
+    if (words != kNone && unread.repeats_conditions(words))
+        for (Patch &patch : sheet.patches)
+            patch.name.clear();
+    else
+        unread.leave(words);
+    unread.finish(sheet, heading);
     if (free_names)
         sheet.bring_inks_to_percent();
     std::vector<Patch> &patches = sheet.patches;

@@ -1,11 +1,11 @@
 // Rows of named columns, as CGATS text and CSV hold them, and the patches that they are.
 #pragma once
 
-#include "read/ink_columns.h"
 #include "read/lines.h"
 #include "read/method.h"
 #include "read/sheet.h"
 #include "read/shifts.h"
+#include "read/unread.h"
 
 #include <array>
 #include <cstddef>
@@ -49,11 +49,11 @@ private:
     void find_spectra(std::size_t line);
     void find_colours(const std::vector<std::string> &keys);
     void find_devices(const std::vector<std::string> &keys, std::size_t line);
+    void find_unread(const std::vector<std::string> &keys);
     bool reads(std::size_t column) const;
     bool has_numbers(const Row &row) const;
     void find_ends();
     void warn_of_shifts();
-    void warn_of_inks();
     const Bands &bands(const Row &row, std::size_t line);
     std::optional<CIELABCOORD> colour(const Row &row, std::size_t line) const;
     std::vector<std::pair<std::string, double>> device_values(const Row &row, std::size_t line);
@@ -71,11 +71,12 @@ private:
     std::vector<double> wavelengths;
     std::vector<double> refl; // of a row, on the file's scale
     std::size_t id, name, ink, tint;
+    std::size_t words; // the column that names patches for want of another
     MethodColumns method;
     std::size_t setup = 0, setups_told = 0; // by the header
     std::array<std::size_t, 3> lab;         // L*, a*, b*, or X, Y, Z where the sheet says so
     std::vector<Device> devices;
-    std::vector<DoubtfulColumn> doubtful;
+    UnreadColumns unread;
     std::vector<Neighbour> neighbours; // of the columns of wavelengths
     std::vector<SpareBand> spare_bands;
     std::size_t heading = 0;    // its line

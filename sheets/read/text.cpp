@@ -214,9 +214,9 @@ std::string and_more(std::size_t count)
     return count > 1 ? ", and " + std::to_string(count - 1) + " more" : "";
 }
 
-std::string listed(const std::vector<std::string> &names, std::string_view separator)
+std::string listed(const std::vector<std::string> &names, std::string_view separator,
+                   std::size_t most)
 {
-    constexpr std::size_t most = 3;
     std::string out;
     for (std::size_t i = 0; i < std::min(most, names.size()); ++i)
         out.append(i ? separator : "").append(names[i]);

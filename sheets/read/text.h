@@ -35,7 +35,8 @@ std::string cut(const std::string &text, std::size_t most);
 std::string and_more(std::size_t count);
 
 // "A, B, C and 4 more".
-std::string listed(const std::vector<std::string> &names, std::string_view separator = ", ");
+std::string listed(const std::vector<std::string> &names, std::string_view separator = ", ",
+                   std::size_t most = 3);
 
 // printable(), in quotes and cut to a length that fits a message.
 std::string in_quotes(std::string_view text);
