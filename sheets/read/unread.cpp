@@ -188,8 +188,7 @@ void UnreadColumns::finish(Sheet &sheet, std::size_t line) const
         sheet.warn(line, fmt::format("further spectra are not read: {}", listed(sets)));
     others.insert(others.begin(), described.begin(), described.end());
     if (!others.empty())
-        sheet.warn(line, fmt::format("not read: the column{} {}", others.size() == 1 ? "" : "s",
-                                     listed(others, ", ", kMostColumns)));
+        sheet.warn(line, "not read: " + listed(others, ", ", kMostColumns));
 }
 
 } // namespace vantrel::sheets
