@@ -6,10 +6,14 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
+
 namespace vantrel::sheets {
 namespace {
 
 constexpr double kOwnColoursAgree = 0.5; // mean ΔE*ab
+constexpr double kOtherColour = 2;       // ΔE00
+constexpr double kTimesMiddle = 10;
 
 // Mean ΔE*ab between a file's own L*a*b* and those of its spectra; nothing where it has none.
 std::optional<double> mean_difference(const Measurement &sheet, ILLUM_OBS illuminant)
@@ -28,6 +32,40 @@ std::optional<double> mean_difference(const Measurement &sheet, ILLUM_OBS illumi
     return count ? std::optional(sum / static_cast<double>(count)) : std::nullopt;
 }
 
+// Single patches whose own L*a*b* are of another spectrum than theirs: a slip in either, which a
+// mean would hide.
+void warn_of_single(const Measurement &sheet, ILLUM_OBS illuminant,
+                    std::vector<std::string> &warnings)
+{
+    struct Own {
+        double difference;
+        const Patch *patch;
+    };
+    std::vector<Own> all;
+    for (const Patch &patch : sheet.patches)
+        if (patch.lab)
+            all.push_back({delta_e00(*patch.lab, lab_of(patch.refl, illuminant)), &patch});
+    std::vector<double> sorted;
+    for (const Own &own : all)
+        sorted.push_back(own.difference);
+    const auto middle = sorted.begin() + static_cast<std::ptrdiff_t>(sorted.size() / 2);
+    std::nth_element(sorted.begin(), middle, sorted.end());
+    const double most = std::max(kOtherColour, kTimesMiddle * *middle);
+    const Own *first = nullptr;
+    std::size_t count = 0;
+    for (const Own &own : all)
+        if (!(own.difference <= most)) {
+            first = first ? first : &own;
+            ++count;
+        }
+    if (first)
+        warnings.push_back(fmt::format("{}:{}: the file's own L*a*b* of {}{} are ΔE00 {:.2f} from "
+                                       "those of its spectrum, in the middle of all {:.2f}",
+                                       sheet.file, first->patch->line,
+                                       in_quotes(first->patch->name), and_more(count),
+                                       first->difference, *middle));
+}
+
 void check_own_colours(const Measurement &sheet, ILLUM_OBS illuminant,
                        std::vector<std::string> &warnings)
 {
@@ -35,8 +73,12 @@ void check_own_colours(const Measurement &sheet, ILLUM_OBS illuminant,
         return;
     const ILLUM_OBS own = sheet.colours.illuminant.value_or(illuminant);
     const auto mean = mean_difference(sheet, own);
-    if (!mean || *mean <= kOwnColoursAgree)
+    if (!mean)
         return;
+    if (*mean <= kOwnColoursAgree) {
+        warn_of_single(sheet, own, warnings);
+        return;
+    }
     ILLUM_OBS best = own;
     double least = *mean;
     for (int i = 0; i < NUM_ILLUM_OBS; ++i) {
@@ -52,6 +94,7 @@ void check_own_colours(const Measurement &sheet, ILLUM_OBS illuminant,
     warnings.push_back(fmt::format("{}: its own L*a*b* are {:.2f} ΔE*ab in the mean from those of "
                                    "its spectra under {}; {}",
                                    sheet.file, *mean, name_of(own), fit));
+    warn_of_single(sheet, best, warnings);
 }
 
 // Spectra give colours under any illuminant: what a file of colours alone states comes first.
